@@ -1,0 +1,28 @@
+#pragma once
+
+#include <QString>
+
+namespace kindrel::core {
+
+/// A long run's report. Yields to the event loop: no transaction and no `Rows` may be open at a step.
+class Progress
+{
+public:
+    virtual ~Progress() = default;
+    /// Empty question: no cancelling.
+    virtual void begin(const QString& what, int steps, const QString& cancel_question) = 0;
+    /// False once cancelled and confirmed.
+    [[nodiscard]] virtual bool step(const QString& what = {}) = 0;
+    virtual void end() = 0;
+};
+
+/// Reports nothing and is never cancelled.
+class SilentProgress : public Progress
+{
+public:
+    void begin(const QString&, int, const QString&) override {}
+    bool step(const QString& = {}) override { return true; }
+    void end() override {}
+};
+
+}

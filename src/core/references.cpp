@@ -1,0 +1,10 @@
+#include "core/references.h"
+
+namespace kindrel::core {
+
+std::span<const Reference> references()
+{
+    return {};
+}
+
+}

@@ -1,0 +1,107 @@
+#include "people/disclosed.h"
+
+#include "people/names.h"
+
+#include <array>
+
+namespace kindrel::people {
+
+namespace {
+
+/// A hidden twin and the texts that it keeps out of output.
+struct HiddenPersonText
+{
+    bool Person::*hidden;
+    QString Person::*text;
+};
+
+struct HiddenAddressText
+{
+    bool Address::*hidden;
+    QString Address::*text;
+};
+
+constexpr std::array person_twins{
+    HiddenPersonText{&Person::Preferred_Name_hidden, &Person::preferred_name},
+    HiddenPersonText{&Person::Title_hidden, &Person::Title},
+    HiddenPersonText{&Person::middle_hidden, &Person::middle_name},
+    HiddenPersonText{&Person::surname_hidden, &Person::other_surname},
+    HiddenPersonText{&Person::mobile_hidden, &Person::mobile_phone},
+    HiddenPersonText{&Person::email_hidden, &Person::Personal_email},
+    HiddenPersonText{&Person::bussiness_phone_hidden, &Person::business_phone},
+    HiddenPersonText{&Person::Bussiness_fax_hidden, &Person::business_fax},
+    HiddenPersonText{&Person::bussiness_email_hidden, &Person::business_email},
+    HiddenPersonText{&Person::Bussiness_hidden, &Person::business_phone},
+    HiddenPersonText{&Person::Bussiness_hidden, &Person::business_fax},
+    HiddenPersonText{&Person::Bussiness_hidden, &Person::business_email},
+};
+
+constexpr std::array address_twins{
+    HiddenAddressText{&Address::res_hidden, &Address::res_street},
+    HiddenAddressText{&Address::res_hidden, &Address::res_street2},
+    HiddenAddressText{&Address::res_hidden, &Address::res_state},
+    HiddenAddressText{&Address::res_hidden, &Address::res_country},
+    HiddenAddressText{&Address::res_hidden, &Address::res_map},
+    HiddenAddressText{&Address::res_hidden, &Address::res_ref},
+    HiddenAddressText{&Address::post_hidden, &Address::post_street},
+    HiddenAddressText{&Address::post_hidden, &Address::post_street2},
+    HiddenAddressText{&Address::post_hidden, &Address::post_state},
+    HiddenAddressText{&Address::post_hidden, &Address::post_country},
+    HiddenAddressText{&Address::phone_hidden, &Address::phone},
+    HiddenAddressText{&Address::family_fax_hidden, &Address::family_fax},
+    HiddenAddressText{&Address::family_mobile_hidden, &Address::family_mobile},
+    HiddenAddressText{&Address::family_email_hidden, &Address::family_email},
+    HiddenAddressText{&Address::family_email_hidden, &Address::family_email_description},
+};
+
+template <class Record, class Twins>
+void blank_hidden(Record& record, const Twins& twins)
+{
+    for (const auto& twin : twins) {
+        if (record.*twin.hidden)
+            (record.*twin.text).clear();
+    }
+}
+
+void blank_person(Person& person, const Disclosure& disclosure)
+{
+    blank_hidden(person, person_twins);
+    if (person.Bussiness_hidden)
+        person.occupations.clear();
+    if (person.birthdate_hidden || !disclosure.birth_dates)
+        person.birthdate.reset();
+    if (!disclosure.pins)
+        person.personal_pin.clear();
+}
+
+} // namespace
+
+Disclosure Disclosure::of(const core::Office& office)
+{
+    using core::Area;
+    const bool pins = office.may(Area::full_financial) || office.may(Area::pin_financial_only);
+    return {office.settings.use_preferred_names, office.may(Area::birth_dates), pins, office.day_order()};
+}
+
+QString DisclosedFamily::name(const Person& person) const
+{
+    return display_name(person, m_use_preferred_names);
+}
+
+DisclosedFamily disclose(FamilyFile file, const Disclosure& disclosure)
+{
+    DisclosedFamily disclosed;
+    disclosed.m_use_preferred_names = disclosure.use_preferred_names;
+    disclosed.m_day_order = disclosure.day_order;
+    blank_hidden(file.address, address_twins);
+    if (file.address.res_hidden)
+        file.residential.reset();
+    if (file.address.post_hidden)
+        file.postal.reset();
+    for (auto& person : file.people)
+        blank_person(person, disclosure);
+    disclosed.m_file = std::move(file);
+    return disclosed;
+}
+
+} // namespace kindrel::people

@@ -1,0 +1,25 @@
+#pragma once
+
+#include "core/session.h"
+
+#include <QDate>
+
+#include <vector>
+
+namespace kindrel::people {
+
+struct Membership
+{
+    int person_id = 0;
+    int group_id = 0;
+
+    auto operator<=>(const Membership&) const = default;
+};
+
+/// Writes what joining and leaving groups leaves behind: an open entry for each joined group, and the open entries of
+/// the left ones closed today. The only writer of group history, whoever changes the memberships. Call inside the
+/// transaction that does.
+void write_group_history(core::Session& session, const std::vector<Membership>& joined,
+                         const std::vector<Membership>& left, const QDate& today);
+
+} // namespace kindrel::people
