@@ -170,14 +170,14 @@ int main(int argc, char** argv)
                 "bare PDF", "ratio", "peak MB");
     for (const int count : {1000, 10000, 20000, 60000}) {
         auto flow = through_flow(count, folder.filePath(u"flow.pdf"_s));
-        const auto peak = peak_megabytes();
+        const auto peak = peak_megabytes(), first_page = flow.first_page;
         auto plain = bare(count, folder.filePath(u"bare.pdf"_s));
         for (int again = 0; again < 2; ++again) {
             const auto next = through_flow(count, folder.filePath(u"flow.pdf"_s));
             flow = next.done < flow.done ? next : flow;
             plain = std::min(plain, bare(count, folder.filePath(u"bare.pdf"_s)));
         }
-        std::printf("%9d %7d %9.1f ms %7.0f ms %7.0f ms %7.0f ms %7.2f %9.1f\n", count, flow.pages, flow.first_page,
+        std::printf("%9d %7d %9.1f ms %7.0f ms %7.0f ms %7.0f ms %7.2f %9.1f\n", count, flow.pages, first_page,
                     flow.laid_out, flow.done, plain, flow.done / plain, peak);
     }
 }

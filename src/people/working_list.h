@@ -27,7 +27,7 @@ struct WorkingList
 /// Fills the temporary table `work_people` (place, person_id, surname_id), place counted from 1.
 void lend(core::Session& session, const WorkingList& list);
 
-/// Everybody of the families that a list of file statuses holds, family by family.
+/// The living people of the active families, family by family.
 [[nodiscard]] WorkingList active_families(core::Session& session);
 
 } // namespace kindrel::people

@@ -3,6 +3,7 @@
 #include "core/open_church.h"
 #include "core/schema.h"
 #include "core/sqlite_session.h"
+#include "core/system_workstation.h"
 #include "support/data_folder.h"
 #include "support/test_church.h"
 
@@ -13,6 +14,8 @@
 
 #include <functional>
 
+#include <unistd.h>
+
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
@@ -21,12 +24,15 @@ using namespace core;
 namespace {
 
 const QString connect_sentence =
-    u"Unable to connect to the family database file, this could have occurred if the database file has become corrupted, "
+    u"Unable to connect to the family database file, this could have occurred if the database file has become "
+     "corrupted, "
     "(use the Kindrel Mender utility that came with Kindrel to fix this) or the database file has been deleted, or "
-    "another program has locked you out of the database file, if this is so try rebooting your computer. Kindrel is now "
+    "another program has locked you out of the database file, if this is so try rebooting your computer. Kindrel is "
+    "now "
     "going to shut down."_s;
 const QString older_database =
-    u"Please Note - You are trying to load a database that was created in a previous version. Please use the conversion "
+    u"Please Note - You are trying to load a database that was created in a previous version. Please use the "
+     "conversion "
     "program to convert your data files."_s;
 
 /// A fault that ends the program.
@@ -45,16 +51,20 @@ const std::vector<Fault>& faults()
     static const std::vector<Fault> all{
         {"the data folder is gone",
          [](TestStart& start) { QDir(start.data.root() + u"Local_settings"_s).removeRecursively(); },
-         u"Kindrel is unable to establish connection to its data folder at '%1Kindrel_10_Data' Please confirm this folder "
+         u"Kindrel is unable to establish connection to its data folder at '%1Kindrel_10_Data' Please confirm this "
+          "folder "
          "has not been removed from your computer, if it has then Kindrel will require to be installed again."_s},
         {"another copy runs", [](TestStart& start) { start.workstation.first_copy = false; },
-         u"Only one instance of Kindrel is permitted to run on a workstation. Kindrel is a complete network solution where "
+         u"Only one instance of Kindrel is permitted to run on a workstation. Kindrel is a complete network solution "
+          "where "
          "many computers can run Kindrel at the same time."_s,
          QString(), u"System Information"_s},
         {"dates are written with dots", [](TestStart& start) { start.workstation.pattern = u"dd.MM.yyyy"_s; },
-         u"Currently you have Windows date configured to have a separator other than a forward slash, for example you have "
+         u"Currently you have Windows date configured to have a separator other than a forward slash, for example "
+          "you have "
          "DD.MM.YYYY or DD-MM-YYYY, you need to configure your date separator to have DD/MM/YYYYY (forward slash) for "
-         "Kindrel to correctly work. Kindrel is now going to shut down. After you have changed the Windows setting to a "
+         "Kindrel to correctly work. Kindrel is now going to shut down. After you have changed the Windows setting "
+         "to a "
          "slash separator you will need to reboot Windows."_s},
         {"the network settings are damaged",
          [](TestStart& start) { DataFolder::write(start.data.root() + u"Local_settings/network.dat"_s, "x"); },
@@ -65,13 +75,15 @@ const std::vector<Fault>& faults()
              QFile::remove(start.data.root() + u"church1/KR10_records.kdl"_s);
              QFile::remove(start.data.program() + u"master/KR10_records.kdl"_s);
          },
-         u"Unable to access your master database file because it is missing from your system, please reload Kindrel again "
+         u"Unable to access your master database file because it is missing from your system, please reload Kindrel "
+          "again "
          "from the installation CD to recover the master database file."_s},
         {"the church is busy",
          [](TestStart& start) { DataFolder::write(start.data.root() + u"church1/Lock.Dat"_s, "1234567890"); },
          u"Unable to Enter Kindrel"_s,
          u"Another user is either compacting files, upgrading them, backing them up, restoring files or booking out "
-         "families. Please try latter. If you are permanently locked out of Kindrel then use the Kindrel Mender program to "
+         "families. Please try latter. If you are permanently locked out of Kindrel then use the Kindrel Mender "
+         "program to "
          "unlock Kindrel"_s},
         {"the database is none of ours",
          [](TestStart& start) { DataFolder::write(start.data.root() + u"church1/KR10_records.kdl"_s, "no database"); },
@@ -137,9 +149,20 @@ TEST_F(StartupTest, ADatabaseOfANewerProgramIsRefused)
 TEST_F(StartupTest, AChurchWithoutItsSettingsRowIsRefusedAsUnreadable)
 {
     in_database(u"DELETE FROM [tbl_startup];"_s);
+    dialogue.expect_box(u"Kindrel was unable to renew the system backup of this church."_s);
     dialogue.expect_box(connect_sentence);
 
     EXPECT_FALSE(start());
+}
+
+TEST_F(StartupTest, ABackupThatCannotBeRenewedIsToldOnceTheChurchIsOpen)
+{
+    ASSERT_TRUE(start());
+    ASSERT_TRUE(QDir(data.root() + u"church1/Backup1"_s).removeRecursively());
+    DataFolder::write(data.root() + u"church1/Backup1"_s, "a file in the folder's place");
+    dialogue.expect_box(u"Kindrel was unable to renew the system backup of this church."_s);
+
+    EXPECT_TRUE(start());
 }
 
 TEST_F(StartupTest, AFileThatIsNoSoundChurchIsLeftByteForByteAsItWas)
@@ -155,7 +178,6 @@ TEST_F(StartupTest, AFileThatIsNoSoundChurchIsLeftByteForByteAsItWas)
                                 corrupt, sound.left(1000), sound.left(sound.size() / 4)};
     for (const auto& content : contents) {
         DataFolder::write(file, content);
-        DataFolder::write(data.root() + u"church1/Backup1/systembackup.kdl"_s, "kept");
         dialogue.expect_box(connect_sentence);
 
         EXPECT_FALSE(start());
@@ -163,6 +185,18 @@ TEST_F(StartupTest, AFileThatIsNoSoundChurchIsLeftByteForByteAsItWas)
         EXPECT_EQ(DataFolder::read(file), content) << content.size();
         EXPECT_EQ(QDir(data.root() + u"church1"_s).entryList({u"KR10*"_s}), QStringList(u"KR10_records.kdl"_s));
     }
+}
+
+TEST_F(StartupTest, ADatabaseThatCannotBeWrittenIsRefused)
+{
+    if (geteuid() == 0)
+        GTEST_SKIP() << "Nothing keeps the superuser from writing.";
+    DataFolder::make_church(data.root() + u"church1/"_s);
+    const QString file = data.root() + u"church1/KR10_records.kdl"_s;
+    ASSERT_TRUE(QFile::setPermissions(file, QFile::ReadOwner));
+    dialogue.expect_box(connect_sentence);
+
+    EXPECT_FALSE(start());
 }
 
 TEST_F(StartupTest, TheDataDriveOfTheProgramFolderHoldsUnlessItIsTooShort)
@@ -260,11 +294,26 @@ TEST_F(StartupTest, ClosingTheChooserEndsTheProgram)
     EXPECT_FALSE(start());
 }
 
+TEST_F(StartupTest, OneWorkstationRunsOneCopyWhichMayStartAgain)
+{
+    const QString local_settings = data.paths().folder(Folder::local_settings);
+    auto first = std::make_unique<SystemWorkstation>();
+    SystemWorkstation second;
+
+    EXPECT_TRUE(first->claim_single_instance(local_settings));
+    EXPECT_TRUE(first->claim_single_instance(local_settings)) << "Switching church starts again.";
+    EXPECT_FALSE(second.claim_single_instance(local_settings));
+    first.reset();
+    EXPECT_TRUE(second.claim_single_instance(local_settings));
+}
+
 TEST_F(StartupTest, AMonthFirstSystemIsToldUnlessTheChurchWritesDatesSo)
 {
     const QString month_first =
-        u"Please note: Kindrel has found your Windows system settings not set to Australian Date format (DD-MM-YYYY). Please "
-        "change your settings so that Kindrel can correctly analyse dates, this is done in the regional settings of the "
+        u"Please note: Kindrel has found your Windows system settings not set to Australian Date format "
+         "(DD-MM-YYYY). Please "
+        "change your settings so that Kindrel can correctly analyse dates, this is done in the regional settings of "
+        "the "
         "windows control panel"_s;
     struct Case
     {

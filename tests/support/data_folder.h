@@ -21,6 +21,8 @@ public:
     int depth = 24;
     bool first_copy = true;
     qint64 free = 1'000'000'000'000;
+    QString machine = QStringLiteral("office-1");
+    QList<qint64> ended; ///< Processes that run no more.
 
     [[nodiscard]] QString program_folder() const override { return program; }
     [[nodiscard]] QString default_data_drive() const override { return drive; }
@@ -29,7 +31,8 @@ public:
     [[nodiscard]] QSize display_size() const override { return size; }
     [[nodiscard]] int display_depth() const override { return depth; }
     [[nodiscard]] qint64 free_bytes(const QString&) const override { return free; }
-    [[nodiscard]] QString name() const override { return QStringLiteral("office-1"); }
+    [[nodiscard]] QString name() const override { return machine; }
+    [[nodiscard]] bool process_runs(qint64 process) const override { return !ended.contains(process); }
 };
 
 /// A data drive and a program folder with a master database, as an installation leaves them.
