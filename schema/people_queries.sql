@@ -125,7 +125,7 @@ JOIN [tbl_people] p ON p.[Surname_ID] = f.[Surname_ID] AND p.[Decease] = 0
 LEFT JOIN [tbl_address] a ON a.[surname_id] = f.[Surname_ID]
 LEFT JOIN [tbl_suburb] s ON s.[surname_id] = f.[Surname_ID] AND s.[Type] = 1
 LEFT JOIN [tbl_suburb_setup] i ON i.[suburb_id] = s.[suburb_id]
-ORDER BY COALESCE(f.[sort_key], ''), f.[Primary_name], f.[Surname_ID];
+ORDER BY f.[sort_key], f.[Primary_name], f.[Surname_ID];
 
 CREATE VIEW [qry_Kindrel_address_book_include_decease] AS
 SELECT f.[Surname_ID], f.[surname], f.[Primary_name], f.[Condition], f.[created], f.[last_edit],
@@ -143,7 +143,7 @@ LEFT JOIN [tbl_people] p ON p.[Surname_ID] = f.[Surname_ID]
 LEFT JOIN [tbl_address] a ON a.[surname_id] = f.[Surname_ID]
 LEFT JOIN [tbl_suburb] s ON s.[surname_id] = f.[Surname_ID] AND s.[Type] = 1
 LEFT JOIN [tbl_suburb_setup] i ON i.[suburb_id] = s.[suburb_id]
-ORDER BY COALESCE(f.[sort_key], ''), f.[Primary_name], f.[Surname_ID];
+ORDER BY f.[sort_key], f.[Primary_name], f.[Surname_ID];
 
 -- Booking out.
 CREATE VIEW [qry_test_booked] AS
@@ -170,7 +170,7 @@ SELECT f.[Surname_ID], p.[person_id], p.[Name], f.[surname], d.[other_surname], 
 FROM [tbl_surname] f
 JOIN [tbl_people] p ON p.[Surname_ID] = f.[Surname_ID]
 LEFT JOIN [tbl_personal_details] d ON d.[person_id] = p.[person_id]
-ORDER BY COALESCE(f.[sort_key], ''), f.[Primary_name], f.[Surname_ID], p.[position];
+ORDER BY f.[sort_key], f.[Primary_name], f.[Surname_ID], p.[position];
 
 CREATE VIEW [qry_search_all] AS
 SELECT f.[Surname_ID], p.[person_id], p.[Name], f.[surname], d.[other_surname], d.[middle_name], p.[preferred_name],
@@ -184,7 +184,7 @@ FROM [tbl_surname] f
 JOIN [tbl_people] p ON p.[Surname_ID] = f.[Surname_ID]
 LEFT JOIN [tbl_personal_details] d ON d.[person_id] = p.[person_id]
 LEFT JOIN [tbl_address] a ON a.[surname_id] = f.[Surname_ID]
-ORDER BY COALESCE(f.[sort_key], ''), f.[Primary_name], f.[Surname_ID], p.[position];
+ORDER BY f.[sort_key], f.[Primary_name], f.[Surname_ID], p.[position];
 
 -- Filters: one row for each person, here and below. The suburb is the residential one. Month, day and year are numbers
 -- for ranges that ask for any year, for a month or for an age.

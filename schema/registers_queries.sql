@@ -61,7 +61,7 @@ JOIN [tbl_people] p ON p.[person_id] = n.[person_id]
 JOIN [tbl_surname] f ON f.[Surname_ID] = p.[Surname_ID]
 LEFT JOIN [tbl_personal_details] d ON d.[person_id] = n.[person_id]
 WHERE n.[personal_pin] IS NOT NULL
-ORDER BY COALESCE(f.[sort_key], ''), f.[Primary_name], f.[Surname_ID], p.[position];
+ORDER BY f.[sort_key], f.[Primary_name], f.[Surname_ID], p.[position];
 
 CREATE VIEW [Qry_finance_load_project] AS
 SELECT [finance_project_id], [finance_project], [position] FROM [tbl_finance_project]

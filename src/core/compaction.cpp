@@ -25,10 +25,9 @@ bool enough_space(const Office& office)
 {
     if (office.workstation.free_bytes(office.paths.folder(Folder::church)) >= free_bytes_needed)
         return true;
-    office.dialogue.show(
-        {.text = u"Your hard disk space is getting low. You need to have at least 40 Meg free before the compacting "
-                 "function will work, please exit %1 and make free some disk space."_s.arg(product),
-         .icon = Icon::information});
+    office.dialogue.show(information(
+        u"Your hard disk space is getting low. You need to have at least 40 Meg free before the compacting function "
+        "will work, please exit %1 and make free some disk space."_s.arg(product)));
     return false;
 }
 

@@ -31,11 +31,18 @@ struct Office
     Settings settings = {};
     std::unique_ptr<Session> session = {};
     Rights rights = {};
+    int user_id = 0;        ///< Of the password that let the person in; 0 without security and by a recovery password.
+    QString user_name = {}; ///< Those whom that password belongs to.
     Workstation& workstation;
     Dialogue& dialogue;
     Clock& clock;
 
     [[nodiscard]] bool may(Area area) const { return rights.may(area); }
+    /// Whether several workstations can be in this church at once.
+    [[nodiscard]] bool shared() const
+    {
+        return mode == Mode::network || (session && session->engine() == EngineKind::postgres);
+    }
     [[nodiscard]] DayOrder day_order() const { return settings.day_order(); }
 };
 

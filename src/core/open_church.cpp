@@ -45,10 +45,9 @@ void prime(Session& session)
 void refuse_entry(Dialogue& dialogue)
 {
     dialogue.play({});
-    dialogue.show(
-        {.text = u"Unable to Enter %1 as a security lock is on, please use the Kindrel Mender Program to reset the "
-                 "security lock so that access can be granted into the program"_s.arg(product),
-         .icon = Icon::information});
+    dialogue.show(information(
+        u"Unable to Enter %1 as a security lock is on, please use the Kindrel Mender Program to reset the security "
+        "lock so that access can be granted into the program"_s.arg(product)));
 }
 
 bool answers(Session& session)
@@ -111,14 +110,12 @@ std::unique_ptr<Session> open_church(const Paths& paths, Mode mode, Dialogue& di
 
 Message unable_to_connect(const QString& why)
 {
-    return {
-        .text =
-            u"Unable to connect to the family database file, this could have occurred if the database file has become "
-            "corrupted, (use the Kindrel Mender utility that came with Kindrel to fix this) or the database file has "
-            "been deleted, or another program has locked you out of the database file, if this is so try rebooting "
-            "your computer. Kindrel is now going to shut down."_s,
-        .more = why,
-        .icon = Icon::information};
+    return information(
+        u"Unable to connect to the family database file, this could have occurred if the database file has become "
+        "corrupted, (use the Kindrel Mender utility that came with Kindrel to fix this) or the database file has been "
+        "deleted, or another program has locked you out of the database file, if this is so try rebooting your "
+        "computer. Kindrel is now going to shut down."_s,
+        why);
 }
 
 bool network_guard(const Office& office)
@@ -126,9 +123,8 @@ bool network_guard(const Office& office)
     if (office.mode != Mode::network || (church_present(office.paths) && answers(*office.session)))
         return true;
     office.dialogue.show(
-        {.text = u"Unable to access your network files."_s,
-         .more = u"A break in the connection between this computer and your network server has occured."_s,
-         .icon = Icon::information});
+        information(u"Unable to access your network files."_s,
+                    u"A break in the connection between this computer and your network server has occured."_s));
     return false;
 }
 

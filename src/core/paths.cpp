@@ -131,10 +131,10 @@ QString Paths::database() const
 QString existing_name(const QString& folder, const QString& name)
 {
     QString found;
-    const auto parts = name.split(u'/');
-    for (const auto& part : parts)
-        found += (found.isEmpty() ? QString() : QString(QDir::separator())) +
-                 existing_part(as_folder(folder) + found + QDir::separator(), part);
+    for (const auto& part : name.split(u'/')) {
+        const QString start = found.isEmpty() ? found : as_folder(found);
+        found = start + existing_part(as_folder(folder) + start, part);
+    }
     return found;
 }
 

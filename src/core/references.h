@@ -22,4 +22,15 @@ struct Reference
 
 [[nodiscard]] std::span<const Reference> references();
 
+/// The table in which an entity has its own rows, and the field that is its key. A user has a row for each area of
+/// access; the three kinds of Wardline layouts share one entity.
+struct Home
+{
+    Entity entity;
+    const char* table;
+    const char* field;
+};
+
+[[nodiscard]] std::span<const Home> homes();
+
 }

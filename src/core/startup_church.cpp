@@ -60,21 +60,28 @@ Message busy_notice()
     return information(unable_to_enter, another_user);
 }
 
+/// Why the work failed; nullopt when it did not.
+template <class Work>
+std::optional<QString> failure_of(Work&& work)
+{
+    try {
+        work();
+        return std::nullopt;
+    } catch (const DatabaseError& error) {
+        return error.text();
+    } catch (const FileError& error) {
+        return error.text();
+    }
+}
+
 /// False when the work failed, after telling `sentence` and the cause.
 template <class Work>
 bool attempt(Office& office, const QString& sentence, Work&& work)
 {
-    QString cause;
-    try {
-        work();
-        return true;
-    } catch (const DatabaseError& error) {
-        cause = error.text();
-    } catch (const FileError& error) {
-        cause = error.text();
-    }
-    office.dialogue.show(information(sentence, cause));
-    return false;
+    const std::optional<QString> failure = failure_of(work);
+    if (failure)
+        office.dialogue.show(information(sentence, *failure));
+    return !failure;
 }
 
 QString path_if_there(const Paths& paths, Folder folder, const QString& name)
@@ -136,7 +143,8 @@ bool month_first(const QString& pattern)
 bool rotate_backups(State& state)
 {
     Office& office = state.office;
-    attempt(office, rotation_failed, [&] { rotate_system_backups(office.paths, office.church, office.clock.today()); });
+    const auto failure = failure_of([&] { rotate_system_backups(office.paths, office.church, office.clock.today()); });
+    state.backup_fault = failure.value_or(QString());
     return true;
 }
 
@@ -207,6 +215,8 @@ bool open_database(State& state)
 {
     Office& office = state.office;
     office.session = open_church(office.paths, office.mode, office.dialogue, office.clock, state.progress);
+    if (office.session && !state.backup_fault.isEmpty())
+        office.dialogue.show(information(rotation_failed, state.backup_fault));
     return office.session != nullptr;
 }
 

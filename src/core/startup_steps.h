@@ -13,6 +13,7 @@ struct State
     Progress& progress;
     Office& office;
     bool working_on_booked_out = false; ///< Chosen by the person because the network cannot be reached.
+    QString backup_fault = {};          ///< Told once the church is open: one that cannot be opened has its own box.
 
     [[nodiscard]] bool on_desktop() const { return request.purpose == Purpose::desktop; }
 };

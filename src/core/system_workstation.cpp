@@ -9,6 +9,13 @@
 #include <QStorageInfo>
 #include <QSysInfo>
 
+#ifdef Q_OS_WIN
+#include <windows.h>
+#else
+#include <cerrno>
+#include <csignal>
+#endif
+
 namespace kindrel::core {
 
 using namespace Qt::StringLiterals;
@@ -57,6 +64,21 @@ qint64 SystemWorkstation::free_bytes(const QString& folder) const
 QString SystemWorkstation::name() const
 {
     return QSysInfo::machineHostName();
+}
+
+bool SystemWorkstation::process_runs(qint64 process) const
+{
+#ifdef Q_OS_WIN
+    HANDLE found = OpenProcess(PROCESS_QUERY_LIMITED_INFORMATION, FALSE, static_cast<DWORD>(process));
+    if (!found)
+        return GetLastError() == ERROR_ACCESS_DENIED;
+    DWORD status = 0;
+    const bool runs = GetExitCodeProcess(found, &status) && status == STILL_ACTIVE;
+    CloseHandle(found);
+    return runs;
+#else
+    return process > 0 && (kill(static_cast<pid_t>(process), 0) == 0 || errno == EPERM);
+#endif
 }
 
 } // namespace kindrel::core

@@ -25,6 +25,7 @@ public:
     [[nodiscard]] int display_depth() const override { return m_display_depth; }
     [[nodiscard]] qint64 free_bytes(const QString& folder) const override;
     [[nodiscard]] QString name() const override;
+    [[nodiscard]] bool process_runs(qint64 process) const override;
 
 private:
     QSize m_display_size;

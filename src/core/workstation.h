@@ -26,6 +26,8 @@ public:
     [[nodiscard]] virtual qint64 free_bytes(const QString& folder) const = 0;
     /// The machine's name, as it stands in lock rows.
     [[nodiscard]] virtual QString name() const = 0;
+    /// Whether a process of this machine has not ended yet.
+    [[nodiscard]] virtual bool process_runs(qint64 process) const = 0;
 };
 
 } // namespace kindrel::core

@@ -1,6 +1,6 @@
 #include "people/family_store.h"
 
-#include "core/references.h"
+#include "core/removal.h"
 #include "people/family_rows.h"
 #include "people/group_history.h"
 
@@ -89,27 +89,13 @@ std::vector<int> removed_people(Session& session, const FamilyFile& file)
     return removed;
 }
 
-/// Takes a person's rows with them, everywhere but where rows outlive their owner.
-void remove_rows_of(Session& session, const std::vector<int>& people)
-{
-    for (const int person : people) {
-        for (const auto& reference : core::references()) {
-            if (reference.to == Entity::person && reference.bond != core::Bond::keep)
-                session.execute(u"DELETE FROM [%1] WHERE [%2]=?;"_s.arg(QString::fromLatin1(reference.table),
-                                                                        QString::fromLatin1(reference.field)),
-                                person);
-        }
-    }
-}
-
 void rewrite_family(Session& session, const FamilyFile& file, const QDate& today)
 {
     if (!update_family_row(session, file.family))
         throw core::DatabaseError(u"Family %1 is no longer in the database."_s.arg(file.family.Surname_ID));
     write_joined_and_left(session, file, today);
-    const auto removed = removed_people(session, file);
+    core::remove_entities(session, Entity::person, removed_people(session, file));
     clear_family_rows(session, file.family.Surname_ID);
-    remove_rows_of(session, removed);
     FamilyRows rows;
     rows.add(file);
     rows.insert(session);

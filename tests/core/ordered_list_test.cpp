@@ -18,10 +18,10 @@ TEST(OrderedListTest, MovesSwapNeighboursAndAreRefusedAtTheEnds)
         bool moved;
         Words after;
     };
-    const std::vector<Case> cases{
-        {true, 0, false, {"a", "b", "c"}},  {true, 1, true, {"b", "a", "c"}},   {true, 2, true, {"a", "c", "b"}},
-        {true, -1, false, {"a", "b", "c"}}, {false, 2, false, {"a", "b", "c"}}, {false, 0, true, {"b", "a", "c"}},
-        {false, 1, true, {"a", "c", "b"}},  {false, -1, false, {"a", "b", "c"}}};
+    const std::vector<Case> cases{{true, 0, false, {"a", "b", "c"}},  {true, 1, true, {"b", "a", "c"}},
+                                  {true, 2, true, {"a", "c", "b"}},   {true, -1, false, {"a", "b", "c"}},
+                                  {false, 2, false, {"a", "b", "c"}}, {false, 0, true, {"b", "a", "c"}},
+                                  {false, 1, true, {"a", "c", "b"}},  {false, -1, false, {"a", "b", "c"}}};
     for (const auto& [up, index, moved, after] : cases) {
         List list({"a", "b", "c"});
         EXPECT_EQ(up ? list.move_up(index) : list.move_down(index), moved) << up << index;

@@ -72,61 +72,15 @@ struct OwnKey
     QLatin1StringView table, field;
 };
 
-/// Where each entity is at home. A user has a row for each area of access.
-const std::array own_keys{
-    OwnKey{Entity::surname, "tbl_surname"_L1, "surname_id"_L1},
-    OwnKey{Entity::person, "tbl_people"_L1, "person_id"_L1},
-    OwnKey{Entity::group, "tbl_group_setup"_L1, "group_id"_L1},
-    OwnKey{Entity::status, "tbl_status_setup"_L1, "status_id"_L1},
-    OwnKey{Entity::ministry, "tbl_ministry_setup"_L1, "ministry_id"_L1},
-    OwnKey{Entity::individual_date, "tbl_individual_date_setup"_L1, "in_date_id"_L1},
-    OwnKey{Entity::flexi, "tbl_flexi_setup"_L1, "flexi_id"_L1},
-    OwnKey{Entity::family_group, "tbl_family_group_setup"_L1, "family_group_id"_L1},
-    OwnKey{Entity::family_date, "tbl_family_date_setup"_L1, "fam_date_id"_L1},
-    OwnKey{Entity::title, "tbl_title"_L1, "title_id"_L1},
-    OwnKey{Entity::occupation, "tbl_occupation_setup"_L1, "occupation_id"_L1},
-    OwnKey{Entity::suburb, "tbl_suburb_setup"_L1, "suburb_id"_L1},
-    OwnKey{Entity::security, "tbl_security"_L1, "security_id"_L1},
-    OwnKey{Entity::roll_date, "tbl_roll_date"_L1, "roll_date_id"_L1},
-    OwnKey{Entity::roll_project, "tbl_roll_project"_L1, "roll_project_id"_L1},
-    OwnKey{Entity::finance_project, "tbl_finance_project"_L1, "finance_project_id"_L1},
-    OwnKey{Entity::weekly_project, "tbl_weekly_project"_L1, "weekly_project_id"_L1},
-    OwnKey{Entity::weekly_group, "tbl_weekly_group"_L1, "group_id"_L1},
-    OwnKey{Entity::weekly_date, "tbl_weekly_date"_L1, "weekly_date_id"_L1},
-    OwnKey{Entity::finance_date, "tbl_finance_date"_L1, "finance_date_id"_L1},
-    OwnKey{Entity::fusion, "Tbl_fusion_group"_L1, "fusion_id"_L1},
-    OwnKey{Entity::history, "tbl_group_history"_L1, "history_id"_L1},
-    OwnKey{Entity::roster_project, "tbl_roster_project"_L1, "roster_project_id"_L1},
-    OwnKey{Entity::roster_duty, "tbl_roster_duty"_L1, "duty_id"_L1},
-    OwnKey{Entity::roster_date, "tbl_roster_date"_L1, "date_id"_L1},
-    OwnKey{Entity::roster_duty_people, "tbl_roster_people"_L1, "roster_people_id"_L1},
-    OwnKey{Entity::roster_team, "tbl_roster_team"_L1, "team_id"_L1},
-    OwnKey{Entity::master_duty, "tbl_roster_master_duty"_L1, "master_duty_id"_L1},
-    OwnKey{Entity::email_history, "tbl_email_history"_L1, "email_history_id"_L1},
-    OwnKey{Entity::print_history, "tbl_print_history"_L1, "print_history_id"_L1},
-    OwnKey{Entity::roster_memory, "tbl_roster_memory"_L1, "memory_id"_L1},
-    OwnKey{Entity::user, "tbl_security"_L1, "user_id"_L1},
-    OwnKey{Entity::wardline_compliance, "tbl_wardline_compliance"_L1, "compliance_id"_L1},
-    OwnKey{Entity::wardline_risk, "tbl_wardline_risk"_L1, "risk_id"_L1},
-    OwnKey{Entity::wardline_status, "tbl_wardline_status"_L1, "status_id"_L1},
-    OwnKey{Entity::wardline_reviews, "tbl_wardline_reviews"_L1, "reviews_id"_L1},
-    OwnKey{Entity::wardline_procedure, "tbl_wardline_procedure"_L1, "procedure_id"_L1},
-    OwnKey{Entity::wardline_event, "tbl_wardline_event"_L1, "event_id"_L1},
-    OwnKey{Entity::wardline_comment, "tbl_wardline_comment"_L1, "comment_id"_L1},
-    OwnKey{Entity::wardline_incident, "tbl_wardline_incident"_L1, "incident_id"_L1},
-    OwnKey{Entity::wardline_document, "tbl_wardline_store_document"_L1, "document_id"_L1},
-    OwnKey{Entity::wardline_application, "tbl_wardline_application_records"_L1, "application_id"_L1},
-    OwnKey{Entity::wardline_referee, "tbl_wardline_referee_records"_L1, "referee_id"_L1},
-    OwnKey{Entity::wardline_incident_record, "tbl_wardline_incident_records"_L1, "incident_id_in"_L1},
-    OwnKey{Entity::wardline_audit_risk, "tbl_wardline_audit_risk"_L1, "audit_id"_L1},
-    OwnKey{Entity::wardline_audit_status, "tbl_wardline_audit_status"_L1, "audit_id"_L1},
-    OwnKey{Entity::wardline_audit_review, "tbl_wardline_audit_review"_L1, "audit_id"_L1},
-    OwnKey{Entity::wardline_audit_incident, "tbl_wardline_audit_incident"_L1, "audit_id"_L1},
-    OwnKey{Entity::wardline_security, "tbl_wardline_security_archive"_L1, "security_id"_L1},
-    OwnKey{Entity::wardline_template, "tbl_wardline_template"_L1, "template_id"_L1},
-    OwnKey{Entity::wardline_template, "tbl_wardline_flat_template"_L1, "template_id"_L1},
-    OwnKey{Entity::wardline_template, "tbl_wardline_export_template"_L1, "template_id"_L1},
-};
+std::vector<OwnKey> keys_at_home()
+{
+    std::vector<OwnKey> keys;
+    for (const auto& home : homes())
+        keys.push_back({home.entity, QLatin1StringView(home.table), QLatin1StringView(home.field)});
+    return keys;
+}
+
+const std::vector<OwnKey> own_keys = keys_at_home();
 
 bool is_own_key(const QString& table, const QString& field)
 {

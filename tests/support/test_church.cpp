@@ -17,8 +17,31 @@ QString server()
     return qEnvironmentVariable("KINDREL_TEST_SERVER");
 }
 
+const QString template_database = u"kindrel_template"_s;
+
+/// A connection to another database of the server; of two keywords the later one holds.
+QString database(const QString& name)
+{
+    return u"%1 dbname=%2"_s.arg(server(), name);
+}
+
+/// Laying the schema takes a second, copying it a fraction: the first test that needs it makes the template for all.
+void provide_template(core::Session& server_session)
+{
+    const core::Transaction one_at_a_time(server_session);
+    (void)server_session.select(u"SELECT pg_advisory_xact_lock(1)"_s);
+    if (number_of(server_session, u"SELECT COUNT(*) FROM pg_database WHERE datname='%1'"_s.arg(template_database)) > 0)
+        return;
+    const QString half_made = template_database + u"_half"_s;
+    const auto maker = core::open_postgres(server());
+    maker->execute(u"DROP DATABASE IF EXISTS [%1]"_s.arg(half_made));
+    maker->execute(u"CREATE DATABASE [%1]"_s.arg(half_made));
+    core::create_schema(*core::open_postgres(database(half_made)));
+    maker->execute(u"ALTER DATABASE [%1] RENAME TO [%2]"_s.arg(half_made, template_database));
+}
+
 /// Unique among all test programs that share the server.
-QString next_schema_name()
+QString next_name()
 {
     static int number = 0;
     return u"church_%1_%2"_s.arg(QCoreApplication::applicationPid()).arg(++number);
@@ -36,20 +59,22 @@ TestChurch::TestChurch(core::EngineKind engine)
     if (engine == core::EngineKind::sqlite) {
         m_file = m_folder.filePath(u"KR10_records.kdl"_s);
         m_session = core::create_sqlite(m_file);
+        core::create_schema(*m_session);
     } else {
-        m_schema = next_schema_name();
-        core::open_postgres(server())->execute(u"CREATE SCHEMA [%1]"_s.arg(m_schema));
-        m_connection = u"%1 options=-csearch_path=%2"_s.arg(server(), m_schema);
+        m_database = next_name();
+        const auto server_session = core::open_postgres(server());
+        provide_template(*server_session);
+        server_session->execute(u"CREATE DATABASE [%1] TEMPLATE [%2]"_s.arg(m_database, template_database));
+        m_connection = database(m_database);
         m_session = core::open_postgres(m_connection);
     }
-    core::create_schema(*m_session);
 }
 
 TestChurch::~TestChurch()
 {
     m_session.reset();
-    if (!m_schema.isEmpty())
-        core::open_postgres(server())->execute(u"DROP SCHEMA [%1] CASCADE"_s.arg(m_schema));
+    if (!m_database.isEmpty())
+        core::open_postgres(server())->execute(u"DROP DATABASE [%1] WITH (FORCE)"_s.arg(m_database));
 }
 
 std::unique_ptr<core::Session> TestChurch::another() const

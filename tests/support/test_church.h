@@ -11,7 +11,7 @@
 
 namespace kindrel::test {
 
-/// An empty church of its own on one engine: a file in a temporary folder, or a schema on the private server.
+/// An empty church of its own on one engine: a file in a temporary folder, or a database on the private server.
 class TestChurch
 {
 public:
@@ -37,7 +37,7 @@ private:
     QTemporaryDir m_folder;
     QString m_file;
     QString m_connection;
-    QString m_schema;
+    QString m_database;
     std::unique_ptr<core::Session> m_session;
 };
 
