@@ -20,6 +20,7 @@
 #include <memory>
 
 using namespace kindrel;
+using namespace kindrel::bench;
 using namespace Qt::StringLiterals;
 
 namespace {

@@ -115,8 +115,10 @@ protected:
 
 /// Rows of which the training church must hold at least one.
 const QStringList rare_rows{
-    u"[tbl_people] WHERE [Active] = 0 AND [Decease] = 0 AND [Privacy] = 0 AND [Prospect] = 0 AND [archive] = 0 AND [contact] = 0"_s,
-    u"[tbl_people] WHERE [Active] = -1 AND [Decease] = -1 AND [Privacy] = -1 AND [Prospect] = -1 AND [archive] = -1 AND [contact] = -1"_s,
+    u"[tbl_people] WHERE [Active] = 0 AND [Decease] = 0 AND [Privacy] = 0 AND [Prospect] = 0 AND [archive] = 0 "
+    "AND [contact] = 0"_s,
+    u"[tbl_people] WHERE [Active] = -1 AND [Decease] = -1 AND [Privacy] = -1 AND [Prospect] = -1 AND [archive] = "
+    "-1 AND [contact] = -1"_s,
     u"[tbl_people] WHERE [position] = 1 AND [Decease] = -1"_s,
     u"[tbl_people] WHERE [position] = 17"_s,
     u"[tbl_people] WHERE LENGTH([Name]) = 60"_s,
@@ -149,8 +151,10 @@ const QStringList rare_rows{
     u"[tbl_suburb] WHERE [postcode_var] IS NOT NULL AND [suburb_id] IS NOT NULL"_s,
     u"[tbl_suburb] WHERE [postcode_var] IS NOT NULL AND [suburb_id] IS NULL"_s,
     u"[tbl_surname] WHERE [Surname_ID] NOT IN (SELECT [surname_id] FROM [tbl_suburb])"_s,
-    u"[tbl_ministry] a JOIN [tbl_ministry] b ON a.[person_id]=b.[person_id] AND a.[ministry_id]=b.[ministry_id] WHERE a.[ministry_type] < b.[ministry_type]"_s,
-    u"[tbl_group_history] WHERE [completed] = -1 AND [group_id] IN (SELECT [group_id] FROM [tbl_group_setup] WHERE [not_active] = -1)"_s,
+    u"[tbl_ministry] a JOIN [tbl_ministry] b ON a.[person_id]=b.[person_id] AND a.[ministry_id]=b.[ministry_id] "
+    "WHERE a.[ministry_type] < b.[ministry_type]"_s,
+    u"[tbl_group_history] WHERE [completed] = -1 AND [group_id] IN (SELECT [group_id] FROM [tbl_group_setup] "
+    "WHERE [not_active] = -1)"_s,
     u"[tbl_other_contact]"_s,
     u"[tbl_visitation]"_s,
     u"[tbl_family_group]"_s,
@@ -249,20 +253,29 @@ TEST_F(TrainingChurchTest, NothingPointsNowhereAndNothingContradicts)
         u"[tbl_people] WHERE [person_id] NOT IN (SELECT [person_id] FROM [tbl_personal_details])"_s,
         u"[tbl_surname] WHERE [Surname_ID] NOT IN (SELECT [surname_id] FROM [tbl_address])"_s,
         u"[tbl_surname] WHERE [Surname_ID] NOT IN (SELECT [Surname_ID] FROM [tbl_people] WHERE [position] = 1)"_s,
-        u"(SELECT [Surname_ID] FROM [tbl_people] GROUP BY [Surname_ID] HAVING MAX([position]) <> COUNT(*) OR COUNT(DISTINCT [position]) <> COUNT(*)) f"_s,
-        u"[tbl_surname] f JOIN [tbl_people] p ON p.[Surname_ID]=f.[Surname_ID] AND p.[position]=1 WHERE p.[Name] <> f.[Primary_name]"_s,
+        u"(SELECT [Surname_ID] FROM [tbl_people] GROUP BY [Surname_ID] HAVING MAX([position]) <> COUNT(*) OR "
+        "COUNT(DISTINCT [position]) <> COUNT(*)) f"_s,
+        u"[tbl_surname] f JOIN [tbl_people] p ON p.[Surname_ID]=f.[Surname_ID] AND p.[position]=1 WHERE p.[Name] "
+        "<> f.[Primary_name]"_s,
         u"[tbl_surname] WHERE [last_edit] < [created] OR [last_edit] > '2026-07-01'"_s,
         u"[tbl_personal_details] WHERE [Title] IS NOT NULL AND [Title] NOT IN (SELECT [Title] FROM [tbl_title])"_s,
         u"[tbl_personal_details] WHERE [birthdate] > '2026-07-01'"_s,
-        u"[tbl_address] WHERE [res_street] IS NOT NULL AND [surname_id] NOT IN (SELECT [surname_id] FROM [tbl_suburb] WHERE [Type] = 1)"_s,
-        u"[tbl_address] WHERE [post_street] IS NOT NULL AND [surname_id] NOT IN (SELECT [surname_id] FROM [tbl_suburb] WHERE [Type] = 2)"_s,
+        u"[tbl_address] WHERE [res_street] IS NOT NULL AND [surname_id] NOT IN (SELECT [surname_id] FROM "
+        "[tbl_suburb] WHERE [Type] = 1)"_s,
+        u"[tbl_address] WHERE [post_street] IS NOT NULL AND [surname_id] NOT IN (SELECT [surname_id] FROM "
+        "[tbl_suburb] WHERE [Type] = 2)"_s,
         u"[tbl_group] WHERE [group_id] IN (SELECT [group_id] FROM [tbl_group_setup] WHERE [not_active] = -1)"_s,
-        u"[tbl_group] g LEFT JOIN [tbl_group_history] h ON h.[person_id]=g.[person_id] AND h.[group_id]=g.[group_id] AND h.[completed]=0 WHERE h.[history_id] IS NULL"_s,
-        u"[tbl_group_history] h LEFT JOIN [tbl_group] g ON h.[person_id]=g.[person_id] AND h.[group_id]=g.[group_id] WHERE h.[completed]=0 AND g.[group_id] IS NULL"_s,
-        u"[tbl_group_history] WHERE [completed]=-1 AND ([date_out] IS NULL OR [date_out] < [date_in] OR [date_out] > '2026-07-01')"_s,
+        u"[tbl_group] g LEFT JOIN [tbl_group_history] h ON h.[person_id]=g.[person_id] AND "
+        "h.[group_id]=g.[group_id] AND h.[completed]=0 WHERE h.[history_id] IS NULL"_s,
+        u"[tbl_group_history] h LEFT JOIN [tbl_group] g ON h.[person_id]=g.[person_id] AND "
+        "h.[group_id]=g.[group_id] WHERE h.[completed]=0 AND g.[group_id] IS NULL"_s,
+        u"[tbl_group_history] WHERE [completed]=-1 AND ([date_out] IS NULL OR [date_out] < [date_in] OR "
+        "[date_out] > '2026-07-01')"_s,
         u"[tbl_group_history] WHERE [completed]=0 AND ([date_out] IS NOT NULL OR [date_in] > '2026-07-01')"_s,
-        u"[tbl_group_setup] WHERE [group_id] NOT IN (SELECT [group_id] FROM [tbl_group_details] WHERE [leader] IS NOT NULL)"_s,
-        u"[tbl_startup] WHERE [pin_auto_number_start] <= (SELECT MAX(CAST([personal_pin] AS INTEGER)) FROM [tbl_pin])"_s,
+        u"[tbl_group_setup] WHERE [group_id] NOT IN (SELECT [group_id] FROM [tbl_group_details] WHERE [leader] IS "
+        "NOT NULL)"_s,
+        u"[tbl_startup] WHERE [pin_auto_number_start] <= (SELECT MAX(CAST([personal_pin] AS INTEGER)) FROM "
+        "[tbl_pin])"_s,
     };
     for (const auto& fault : faults)
         EXPECT_EQ(count(fault), 0) << fault.toStdString();

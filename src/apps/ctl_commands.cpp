@@ -1,0 +1,73 @@
+#include "apps/ctl_command.h"
+
+#include <array>
+
+namespace kindrel::apps {
+
+namespace {
+
+constexpr Option json{"json", nullptr, "write the result as JSON"};
+
+constexpr std::array list_options{json};
+constexpr std::array make_church_options{
+    Option{"families", "N", "how many families to make, 1 to 100000"},
+    Option{"seed", "S", "a whole number; the same number makes the same church (default 1)"},
+};
+constexpr std::array families_options{
+    Option{"status", "LIST",
+           "all, active, privacy, active-privacy, prospect, archive, booked-in or booked-out (default all)"},
+    json,
+};
+constexpr std::array report_options{
+    Option{"pdf", "FILE", "the file to write; one that is there is replaced once the report is complete"},
+    Option{"paper", "SIZE", "a4 or letter (default a4)"},
+};
+
+constexpr std::array command_table{
+    Command{"install",
+            "",
+            "lay down the data folder",
+            "Makes the folder Kindrel_10_Data with its churches, settings and training data on the data drive.\n"
+            "What exists already stays as it is, so that it may be run again.",
+            Needs::nothing,
+            {},
+            0,
+            {},
+            run_install},
+    Command{"make-church", "--families N [--seed S]", "fill an empty church with invented families",
+            "Fills the chosen church with families, people and everything they carry, all of it invented.\n"
+            "Refused when the church holds families already.",
+            Needs::church, core::Area::add_family, 0, make_church_options, run_make_church},
+    Command{"totals", "[--json]", "count the families",
+            "Lists how many families the church holds, by file status and booking.", Needs::church,
+            core::Area::search_for_family, 0, list_options, run_totals},
+    Command{"families", "[--status LIST] [--json]", "list families",
+            "Lists the families of a file status with key, first person, address and phone.\n"
+            "What is unlisted is left out.",
+            Needs::church, core::Area::search_for_family, 0, families_options, run_families},
+    Command{"family", "KEY [--json]", "show one family",
+            "Shows what is stored about the family with this key (see \"families\") and about its people.\n"
+            "What is unlisted, or what your rights do not cover, is left out.",
+            Needs::church, core::Area::search_for_family, 1, list_options, run_family},
+    Command{"reports",
+            "[--json]",
+            "list the reports",
+            "Lists the catalogue: key, family, name and content.",
+            Needs::nothing,
+            {},
+            0,
+            list_options,
+            run_reports},
+    Command{"report", "KEY|NAME --pdf FILE [--paper SIZE]", "write a report of the active families to a PDF file",
+            "Runs the report with this key or name (see \"reports\") over the active families.",
+            Needs::church_and_fonts, core::Area::report_outputs, 1, report_options, run_report},
+};
+
+} // namespace
+
+std::span<const Command> commands()
+{
+    return command_table;
+}
+
+} // namespace kindrel::apps

@@ -1,0 +1,115 @@
+#include "apps/ctl_terminal.h"
+
+#include <termios.h>
+#include <unistd.h>
+
+namespace kindrel::apps {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// Nullopt for what is neither yes nor no.
+std::optional<bool> yes_or_no(const QString& answer)
+{
+    const auto word = answer.trimmed().toLower();
+    if (word == "y"_L1 || word == "yes"_L1)
+        return true;
+    return word == "n"_L1 || word == "no"_L1 ? std::optional(false) : std::nullopt;
+}
+
+/// Keeps what is typed from being shown.
+class Unseen
+{
+public:
+    explicit Unseen(bool wanted) : m_changed(wanted && tcgetattr(STDIN_FILENO, &m_before) == 0)
+    {
+        if (!m_changed)
+            return;
+        auto quiet = m_before;
+        quiet.c_lflag &= ~static_cast<tcflag_t>(ECHO);
+        tcsetattr(STDIN_FILENO, TCSAFLUSH, &quiet);
+    }
+    ~Unseen()
+    {
+        if (m_changed)
+            tcsetattr(STDIN_FILENO, TCSAFLUSH, &m_before);
+    }
+    Unseen(const Unseen&) = delete;
+    Unseen& operator=(const Unseen&) = delete;
+
+private:
+    termios m_before{};
+    bool m_changed;
+};
+
+} // namespace
+
+TerminalDialogue::TerminalDialogue() : m_in(stdin), m_err(stderr), m_attended(isatty(STDIN_FILENO) != 0) {}
+
+void TerminalDialogue::show(const core::Message& message)
+{
+    m_err << message.text << Qt::endl;
+    if (!message.more.isEmpty())
+        m_err << message.more << Qt::endl;
+}
+
+std::optional<QString> TerminalDialogue::ask(const QString& prompt)
+{
+    m_err << prompt << Qt::flush;
+    const auto answer = m_attended ? m_in.readLine() : QString();
+    if (!answer.isNull())
+        return answer;
+    m_err << Qt::endl;
+    return std::nullopt;
+}
+
+bool TerminalDialogue::confirm(const core::Message& message, core::Answer safe)
+{
+    show(message);
+    const bool safe_answer = safe == core::Answer::yes;
+    const auto answer = ask(safe_answer ? u"[Y/n] "_s : u"[y/N] "_s);
+    return answer ? yes_or_no(*answer).value_or(safe_answer) : safe_answer;
+}
+
+std::optional<bool> TerminalDialogue::confirm_or_cancel(const core::Message& message)
+{
+    show(message);
+    const auto answer = ask(u"[y/n, Enter to go back] "_s);
+    return answer ? yes_or_no(*answer) : std::nullopt;
+}
+
+std::optional<QString> TerminalDialogue::ask_text(const core::Message& message, bool secret)
+{
+    show(message);
+    const Unseen unseen(secret && m_attended);
+    return ask(u"> "_s);
+}
+
+std::optional<int> TerminalDialogue::choose(const core::Message& message, const QStringList& from)
+{
+    show(message);
+    for (int place = 0; place < from.size(); ++place)
+        m_err << place + 1 << ". " << from[place] << '\n';
+    const auto answer = ask(u"1 to %1, Enter for none: "_s.arg(from.size()));
+    bool whole = false;
+    const int number = answer.value_or(QString()).toInt(&whole);
+    return whole && number >= 1 && number <= from.size() ? std::optional(number - 1) : std::nullopt;
+}
+
+std::optional<QString> TerminalDialogue::choose_file(const core::FileQuestion& question)
+{
+    show({question.title});
+    const auto answer = ask(question.suggested.isEmpty() ? u"> "_s : u"[%1] > "_s.arg(question.suggested));
+    if (answer && answer->isEmpty() && !question.suggested.isEmpty())
+        return question.suggested;
+    return answer && !answer->isEmpty() ? answer : std::nullopt;
+}
+
+void TerminalDialogue::play(const QString&)
+{
+    if (m_attended)
+        m_err << '\a' << Qt::flush;
+}
+
+} // namespace kindrel::apps

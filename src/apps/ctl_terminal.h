@@ -1,0 +1,32 @@
+#pragma once
+
+#include "core/dialogue.h"
+
+#include <QTextStream>
+
+namespace kindrel::apps {
+
+/// Speaks on standard error and listens on standard input. Where nobody sits at it, every question gets the answer
+/// that loses nothing.
+class TerminalDialogue final : public core::Dialogue
+{
+public:
+    TerminalDialogue();
+    void show(const core::Message& message) override;
+    [[nodiscard]] bool confirm(const core::Message& message, core::Answer safe) override;
+    [[nodiscard]] std::optional<bool> confirm_or_cancel(const core::Message& message) override;
+    [[nodiscard]] std::optional<QString> ask_text(const core::Message& message, bool secret) override;
+    [[nodiscard]] std::optional<int> choose(const core::Message& message, const QStringList& from) override;
+    [[nodiscard]] std::optional<QString> choose_file(const core::FileQuestion& question) override;
+    void play(const QString& sound) override;
+
+private:
+    /// Nullopt at the end of the input and where nobody sits at it.
+    [[nodiscard]] std::optional<QString> ask(const QString& prompt);
+
+    QTextStream m_in;
+    QTextStream m_err;
+    bool m_attended;
+};
+
+} // namespace kindrel::apps

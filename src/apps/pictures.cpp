@@ -1,0 +1,114 @@
+#include "apps/pictures.h"
+
+#include "core/files.h"
+#include "desktop/output/preview_window.h"
+#include "desktop/people/family_card.h"
+#include "desktop/shell/main_window.h"
+#include "people/address_book.h"
+
+#include <QApplication>
+#include <QPushButton>
+#include <QTabWidget>
+#include <QTextStream>
+
+namespace kindrel::apps {
+
+using namespace Qt::StringLiterals;
+using desktop::Appearance;
+
+namespace {
+
+constexpr QSize smallest_screen{1024, 690};
+
+/// Writes under "name-light.png" and "name-dark.png".
+class Camera
+{
+public:
+    Camera(desktop::Look& look, QString folder) : m_look(look), m_folder(std::move(folder)) {}
+
+    void take(QWidget& window, const QString& name)
+    {
+        for (const auto appearance : {Appearance::light, Appearance::dark}) {
+            m_look.apply(appearance, 100);
+            QApplication::processEvents();
+            const QString shade = appearance == Appearance::light ? u"light"_s : u"dark"_s;
+            m_failed |= !window.grab().save(u"%1%2-%3.png"_s.arg(m_folder, name, shade));
+        }
+    }
+    [[nodiscard]] bool failed() const { return m_failed; }
+
+private:
+    desktop::Look& m_look;
+    QString m_folder;
+    bool m_failed = false;
+};
+
+void take_cards(desktop::Desk& desk, Camera& camera)
+{
+    const auto book = people::read_address_book(*desk.office.session, people::FamilyList::all, false);
+    if (book.empty())
+        return;
+    desktop::open_family_card(desk, {book.front().Surname_ID}, 0);
+    for (auto* card : desk.windows.all<desktop::FamilyCard>()) {
+        auto* tabs = card->findChild<QTabWidget*>();
+        for (int tab = 0; tab < tabs->count(); ++tab) {
+            tabs->setCurrentIndex(tab);
+            camera.take(*card, u"family-card-%1"_s.arg(tab + 1));
+        }
+    }
+}
+
+void take_reports(desktop::Running& running, Camera& camera)
+{
+    running.open_area(u"reports"_s);
+    camera.take(*running.window(), u"reports"_s);
+    if (auto* preview = running.window()->findChild<QPushButton*>(u"preview"_s))
+        preview->click();
+    QApplication::processEvents();
+    for (auto* window : running.desk()->windows.all<desktop::PreviewWindow>())
+        camera.take(*window, u"preview"_s);
+}
+
+}
+
+void UnattendedDialogue::show(const core::Message& message)
+{
+    QTextStream(stderr) << message.text << '\n' << (message.more.isEmpty() ? QString() : message.more + u'\n');
+}
+
+bool UnattendedDialogue::confirm(const core::Message& message, core::Answer safe)
+{
+    show(message);
+    return safe == core::Answer::yes;
+}
+
+std::optional<bool> UnattendedDialogue::confirm_or_cancel(const core::Message& message)
+{
+    show(message);
+    return std::nullopt;
+}
+
+std::optional<QString> UnattendedDialogue::ask_text(const core::Message& message, bool)
+{
+    show(message);
+    return std::nullopt;
+}
+
+std::optional<int> UnattendedDialogue::choose(const core::Message& message, const QStringList&)
+{
+    show(message);
+    return std::nullopt;
+}
+
+int take_pictures(desktop::Running& running, desktop::Look& look, const QString& folder)
+{
+    core::make_folder(folder);
+    Camera camera(look, core::as_folder(folder));
+    running.window()->resize(smallest_screen);
+    camera.take(*running.window(), u"main-menu"_s);
+    take_cards(*running.desk(), camera);
+    take_reports(running, camera);
+    return camera.failed() ? 1 : 0;
+}
+
+}

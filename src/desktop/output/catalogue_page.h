@@ -1,0 +1,39 @@
+#pragma once
+
+#include "desktop/shell/desk.h"
+#include "desktop/shell/page.h"
+
+class QLabel;
+class QTreeWidget;
+
+namespace kindrel::desktop {
+
+/// The reports that there are, in their families, each with what it prints. Enter shows the chosen one over the
+/// families of active people.
+class CataloguePage : public Page
+{
+    Q_OBJECT
+
+public:
+    explicit CataloguePage(Desk& desk);
+
+    [[nodiscard]] QString help() const override { return QStringLiteral("reports"); }
+    void entered() override;
+    void print() override { open_chosen(); }
+
+protected:
+    bool eventFilter(QObject* target, QEvent* event) override;
+
+private:
+    void fill_tree();
+    void show_chosen();
+    void open_chosen();
+    [[nodiscard]] QString chosen_key() const;
+
+    Desk& m_desk;
+    QTreeWidget* m_tree;
+    QLabel* m_leaf;
+    QLabel* m_description;
+};
+
+}

@@ -1,0 +1,62 @@
+#pragma once
+
+#include "desktop/people/family_list_model.h"
+#include "desktop/shell/desk.h"
+
+#include <QWidget>
+
+class QComboBox;
+class QLineEdit;
+class QStackedWidget;
+class QTableView;
+
+namespace kindrel::desktop {
+
+class EmptyPanel;
+
+/// Families to choose from: a selector, a filter that narrows as one types, and the list. Down leads from the filter
+/// into the list, Enter opens.
+class FamilyListWidget : public QWidget
+{
+    Q_OBJECT
+
+public:
+    explicit FamilyListWidget(Desk& desk, QWidget* parent = nullptr);
+
+    void choose(people::FamilyList list);
+    [[nodiscard]] people::FamilyList list() const;
+    /// Reads the list again, keeping words and chosen family.
+    void reload();
+    void focus_filter();
+    [[nodiscard]] FamilyListModel& model() { return *m_model; }
+    [[nodiscard]] QTableView& view() { return *m_view; }
+    /// "312 of 1,204 families".
+    [[nodiscard]] QString count_words() const;
+
+Q_SIGNALS:
+    /// A family was asked for; `row` is its place in the list.
+    void opened(int row);
+    void shown_changed();
+
+protected:
+    bool eventFilter(QObject* target, QEvent* event) override;
+
+private:
+    void set_up_view();
+    void set_up_filter();
+    void typed(const QString& text);
+    void open_chosen();
+    void show_outcome();
+    void select(int row);
+    [[nodiscard]] int chosen_family() const;
+
+    Desk& m_desk;
+    FamilyListModel* m_model;
+    QComboBox* m_selector;
+    QLineEdit* m_filter;
+    QTableView* m_view;
+    QStackedWidget* m_stack;
+    EmptyPanel* m_empty;
+};
+
+}

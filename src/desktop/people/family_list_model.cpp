@@ -1,0 +1,245 @@
+#include "desktop/people/family_list_model.h"
+
+#include "people/sort_key.h"
+
+#include <QApplication>
+
+#include <algorithm>
+#include <numeric>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+using people::AddressBookEntry;
+using people::FileStatus;
+
+namespace {
+
+struct ColumnDefinition
+{
+    const char* heading;
+    QString (*text)(const AddressBookEntry&);
+};
+
+constexpr std::array<ColumnDefinition, FamilyListModel::column_count> columns{{
+    {"Name", [](const AddressBookEntry& entry) { return entry.surname; }},
+    {"First name", [](const AddressBookEntry& entry) { return entry.name; }},
+    {"Suburb", [](const AddressBookEntry& entry) { return entry.suburb; }},
+    {"Phone", [](const AddressBookEntry& entry) { return entry.phone; }},
+    {"Status", status_words},
+}};
+
+struct StatusLook
+{
+    FileStatus status;
+    const char* word;
+    State state;
+};
+
+constexpr std::array status_looks{
+    StatusLook{FileStatus::active, "Active", State::plain},
+    StatusLook{FileStatus::privacy, "Privacy", State::privacy},
+    StatusLook{FileStatus::prospect, "Prospect", State::prospect},
+    StatusLook{FileStatus::archive, "Archive", State::archive},
+};
+
+const StatusLook& look_of(FileStatus status)
+{
+    const auto* found = std::find_if(status_looks.begin(), status_looks.end(),
+                                     [status](const StatusLook& look) { return look.status == status; });
+    return found == status_looks.end() ? status_looks.front() : *found;
+}
+
+constexpr std::array apostrophes{u'\'', u'\u2019'};
+
+/// With hyphens and stops as blanks, and each apostrophe as `apostrophe`.
+QString parted(QString folded, const QString& apostrophe)
+{
+    for (const QChar mark : {u'-', u',', u'.', u'(', u')'})
+        folded.replace(mark, u' ');
+    for (const QChar mark : apostrophes)
+        folded.replace(QString(mark), apostrophe);
+    return folded;
+}
+
+/// Folded words, each after a blank. An apostrophe parts two words and joins them too: "O'Brien" is found by "bri"
+/// and by "obr".
+QString search_words(const QString& text)
+{
+    const QString folded = people::sort_key(text);
+    const QString words = u' ' + parted(folded, u" "_s);
+    const QString joined = u' ' + parted(folded, {});
+    return words.size() == joined.size() ? words : words + joined;
+}
+
+/// The typed text as the words that must all be found.
+QStringList wanted_words(const QString& typed)
+{
+    QStringList words = parted(people::sort_key(typed), {}).split(u' ', Qt::SkipEmptyParts);
+    for (QString& word : words)
+        word.prepend(u' ');
+    return words;
+}
+
+/// Whether what passes `after` is sure to pass `before` too.
+bool narrows(const QStringList& before, const QStringList& after)
+{
+    return std::all_of(before.begin(), before.end(), [&after](const QString& old) {
+        return std::any_of(after.begin(), after.end(), [&old](const QString& word) { return word.startsWith(old); });
+    });
+}
+
+}
+
+QString status_words(const AddressBookEntry& entry)
+{
+    if (!entry.booked_out)
+        return status_word(entry.Condition);
+    const QString before = entry.Condition == FileStatus::active ? QString() : status_word(entry.Condition) + u' ';
+    return before + u"\u2192 Booked out"_s;
+}
+
+QString status_word(FileStatus status)
+{
+    return QString::fromLatin1(look_of(status).word);
+}
+
+State state_of(FileStatus status)
+{
+    return look_of(status).state;
+}
+
+State state_of(const AddressBookEntry& entry)
+{
+    return entry.booked_out ? State::booked_out : state_of(entry.Condition);
+}
+
+void FamilyListModel::set_entries(std::vector<AddressBookEntry> entries)
+{
+    beginResetModel();
+    m_entries = std::move(entries);
+    m_search.clear();
+    m_search.reserve(m_entries.size());
+    for (const auto& one : m_entries)
+        m_search.push_back(search_words(one.surname + u' ' + one.name + u' ' + one.suburb));
+    put_in_order();
+    filter(m_order);
+    endResetModel();
+}
+
+bool FamilyListModel::matches(int entry) const
+{
+    const QString& words = m_search[std::size_t(entry)];
+    return std::all_of(m_words.begin(), m_words.end(), [&words](const QString& word) { return words.contains(word); });
+}
+
+void FamilyListModel::filter(std::span<const int> candidates)
+{
+    std::vector<int> left;
+    left.reserve(candidates.size());
+    std::copy_if(candidates.begin(), candidates.end(), std::back_inserter(left), [this](int one) { return matches(one); });
+    m_shown = std::move(left);
+}
+
+bool FamilyListModel::narrow(const QString& typed)
+{
+    const QStringList words = wanted_words(typed);
+    if (words == m_words)
+        return false;
+    const bool further = narrows(m_words, words);
+    beginResetModel();
+    m_words = words;
+    filter(further ? m_shown : m_order);
+    endResetModel();
+    return true;
+}
+
+std::vector<QString> FamilyListModel::order_keys(int column) const
+{
+    std::vector<QString> keys;
+    keys.reserve(m_entries.size());
+    for (const auto& one : m_entries)
+        keys.push_back(people::sort_key(columns[std::size_t(column)].text(one)));
+    return keys;
+}
+
+void FamilyListModel::put_in_order()
+{
+    m_order.resize(m_entries.size());
+    std::iota(m_order.begin(), m_order.end(), 0);
+    if (m_sort_column == surname && m_sort_order == Qt::AscendingOrder)
+        return; // As they were read.
+    const std::vector<QString> keys = order_keys(m_sort_column);
+    const auto key = [&keys](int entry) -> const QString& { return keys[std::size_t(entry)]; };
+    if (m_sort_order == Qt::AscendingOrder)
+        std::ranges::stable_sort(m_order, std::ranges::less(), key);
+    else
+        std::ranges::stable_sort(m_order, std::ranges::greater(), key);
+}
+
+void FamilyListModel::sort(int column, Qt::SortOrder order)
+{
+    beginResetModel();
+    m_sort_column = column >= 0 && column < column_count ? column : surname;
+    m_sort_order = order;
+    put_in_order();
+    filter(m_order);
+    endResetModel();
+}
+
+const AddressBookEntry& FamilyListModel::entry(int row) const
+{
+    return m_entries[std::size_t(m_shown.at(std::size_t(row)))];
+}
+
+int FamilyListModel::row_of(int surname_id) const
+{
+    const auto found = std::find_if(m_shown.begin(), m_shown.end(), [this, surname_id](int one) {
+        return m_entries[std::size_t(one)].Surname_ID == surname_id;
+    });
+    return found == m_shown.end() ? -1 : int(found - m_shown.begin());
+}
+
+std::vector<int> FamilyListModel::surname_ids() const
+{
+    std::vector<int> keys;
+    keys.reserve(m_shown.size());
+    for (const int one : m_shown)
+        keys.push_back(m_entries[std::size_t(one)].Surname_ID);
+    return keys;
+}
+
+int FamilyListModel::rowCount(const QModelIndex& parent) const
+{
+    return parent.isValid() ? 0 : int(m_shown.size());
+}
+
+int FamilyListModel::columnCount(const QModelIndex& parent) const
+{
+    return parent.isValid() ? 0 : column_count;
+}
+
+QVariant FamilyListModel::data(const QModelIndex& index, int role) const
+{
+    if (!index.isValid())
+        return {};
+    const AddressBookEntry& family = entry(index.row());
+    if (role == Qt::DisplayRole)
+        return columns[std::size_t(index.column())].text(family);
+    if (role == Qt::ForegroundRole && index.column() == status)
+        return state_colour(state_of(family), shade_of(QApplication::palette()));
+    return {};
+}
+
+QVariant FamilyListModel::headerData(int section, Qt::Orientation orientation, int role) const
+{
+    if (orientation != Qt::Horizontal || section >= column_count)
+        return {};
+    if (role == Qt::DisplayRole)
+        return QString::fromLatin1(columns[std::size_t(section)].heading);
+    if (role == Qt::TextAlignmentRole)
+        return int(Qt::AlignLeft | Qt::AlignVCenter);
+    return {};
+}
+
+}

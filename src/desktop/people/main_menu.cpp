@@ -1,0 +1,169 @@
+#include "desktop/people/main_menu.h"
+
+#include "desktop/church_choice.h"
+#include "desktop/output/list_report.h"
+#include "desktop/people/family_card.h"
+#include "desktop/people/family_list.h"
+#include "desktop/people/family_totals.h"
+#include "desktop/shell/chip.h"
+#include "desktop/shell/icons.h"
+#include "desktop/shell/link_button.h"
+#include "desktop/shell/look.h"
+#include "desktop/shell/side_panel.h"
+#include "desktop/shell/table_text.h"
+#include "desktop/shell/value_form.h"
+
+#include <QAction>
+#include <QEvent>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QScrollArea>
+
+#include <functional>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+using people::FamilyList;
+
+namespace {
+
+constexpr int side_width = 264;
+
+/// One of the ways out of the main menu.
+struct Task
+{
+    QString key, title, description, icon_name;
+    std::optional<core::Area> right;
+    std::function<void()> run;
+};
+
+std::vector<Task> tasks_of(Desk& desk)
+{
+    return {
+        {u"reports"_s, u"Create Reports and Data Analysis"_s, u"Directories of the church's families."_s,
+         u"office-report"_s, core::Area::report_outputs, [&desk] { desk.navigation.open_area(u"reports"_s); }},
+        {u"load_church"_s, u"Load a New Church Database"_s,
+         u"Load a completely different and Independent database for keeping records."_s, u"document-open-folder"_s, std::nullopt,
+         [&desk] { load_another_church(desk); }},
+        {u"load_training"_s, u"Load Training Data"_s,
+         u"Load sample church data to both learn how to use Kindrel and to experiment with."_s, u"view-presentation"_s,
+         std::nullopt, [&desk] { desk.navigation.load_church(core::training_church); }},
+    };
+}
+
+}
+
+MainMenu::MainMenu(Desk& desk) : Page(desk.office.church_name), m_desk(desk)
+{
+    setObjectName(u"main_menu"_s);
+    auto* content = new QWidget;
+    auto* row = new QHBoxLayout(content);
+    row->setContentsMargins(0, 0, space::group, space::margin);
+    row->setSpacing(space::margin);
+    row->addWidget(make_side());
+    row->addWidget(make_list(), 1);
+    set_content(content);
+    add_list_actions();
+    m_families->choose(FamilyList::active);
+}
+
+QWidget* MainMenu::make_side()
+{
+    m_totals = new FamilyTotals;
+    connect(m_totals, &FamilyTotals::chosen, this, [this](FamilyList list) { m_families->choose(list); });
+    auto* vision = make_value();
+    vision->setObjectName(u"vision"_s);
+    vision->setText(m_desk.office.settings.vision);
+    vision->setVisible(!vision->text().isEmpty());
+    vision->setContentsMargins(space::field, 0, 0, 0);
+
+    auto* column = new QVBoxLayout;
+    column->setContentsMargins(space::field, 0, 0, 0);
+    column->setSpacing(space::group);
+    column->addWidget(vision);
+    column->addWidget(m_totals);
+    add_tasks(*column);
+    column->addStretch(1);
+    return make_side_panel(column, side_width);
+}
+
+void MainMenu::add_tasks(QVBoxLayout& column)
+{
+    auto* tasks = new QVBoxLayout;
+    tasks->setSpacing(space::field / 2);
+    for (const Task& task : tasks_of(m_desk)) {
+        auto* button = new LinkButton(task.title);
+        button->setObjectName(task.key);
+        button->setIcon(icon(task.icon_name));
+        button->set_description(task.description);
+        button->setEnabled(!task.right || m_desk.office.may(*task.right));
+        connect(button, &QAbstractButton::clicked, this, task.run);
+        tasks->addWidget(button);
+    }
+    column.addLayout(tasks);
+}
+
+QWidget* MainMenu::make_list()
+{
+    m_families = new FamilyListWidget(m_desk);
+    connect(m_families, &FamilyListWidget::opened, this, &MainMenu::open);
+    connect(m_families, &FamilyListWidget::shown_changed, this, [this] {
+        m_totals->mark(m_families->list());
+        set_status(m_families->count_words());
+    });
+    return m_families;
+}
+
+void MainMenu::add_list_actions()
+{
+    auto* print_list = add_action(u"Print"_s, u"document-print"_s, u"Print this list (Ctrl+P)"_s);
+    connect(print_list, &QAction::triggered, this, &MainMenu::print);
+    auto* save = add_action(u"Save as CSV"_s, u"document-save"_s, u"Save this list as comma-separated text"_s);
+    connect(save, &QAction::triggered, this, [this] {
+        save_as_csv(m_families->model(), people::family_list_name(m_families->list()), m_desk.office.dialogue);
+    });
+}
+
+void MainMenu::load()
+{
+    m_change_mark = m_desk.office.session->change_mark();
+    m_totals->show_totals(people::family_totals(*m_desk.office.session));
+    m_families->reload();
+}
+
+void MainMenu::load_if_changed()
+{
+    if (m_desk.office.session->change_mark() != m_change_mark)
+        load();
+}
+
+void MainMenu::entered()
+{
+    load_if_changed();
+    m_families->focus_filter();
+}
+
+void MainMenu::find()
+{
+    m_families->focus_filter();
+}
+
+void MainMenu::print()
+{
+    print_list(m_desk, people::family_list_name(m_families->list()), m_families->model());
+}
+
+void MainMenu::open(int row)
+{
+    open_family_card(m_desk, m_families->model().surname_ids(), row);
+}
+
+void MainMenu::changeEvent(QEvent* event)
+{
+    Page::changeEvent(event);
+    if (event->type() == QEvent::ActivationChange && isActiveWindow() && isVisible())
+        load_if_changed();
+}
+
+}

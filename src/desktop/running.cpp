@@ -1,0 +1,90 @@
+#include "desktop/running.h"
+
+#include "desktop/areas.h"
+#include "desktop/church_choice.h"
+#include "desktop/shell/main_window.h"
+#include "desktop/shell/page.h"
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+
+Running::Running(Surroundings surroundings) : m_surroundings(std::move(surroundings)) {}
+
+Running::~Running()
+{
+    close();
+}
+
+bool Running::start(int church)
+{
+    const core::StartRequest request{.church = church, .data_drive = m_surroundings.data_drive};
+    m_office = core::start_up(request, m_surroundings.workstation, m_surroundings.dialogue, m_surroundings.clock,
+                              m_surroundings.progress);
+    if (!m_office)
+        return false;
+    if (m_surroundings.opened)
+        m_surroundings.opened(*m_office);
+    build();
+    return true;
+}
+
+void Running::build()
+{
+    m_remembered = std::make_unique<Remembered>(m_office->paths.folder(core::Folder::local_settings), m_office->church);
+    const int appearance = m_remembered->common_value(u"appearance"_s, int(Appearance::desktop)).toInt();
+    m_surroundings.look.apply(Appearance(appearance), m_remembered->common_value(u"text_percent"_s, 100).toInt());
+    m_windows = std::make_unique<Windows>(*m_remembered);
+    m_desk.reset(new Desk{*m_office, m_surroundings.progress, *m_remembered, *m_windows, m_surroundings.printing, *this});
+    m_window = std::make_unique<MainWindow>(*m_desk, all_areas(), m_surroundings.look);
+    connect(m_window.get(), &MainWindow::closed, this, [this] {
+        m_windows.reset();
+        if (m_surroundings.ended)
+            m_surroundings.ended();
+    });
+    m_window->show();
+}
+
+void Running::close()
+{
+    m_windows.reset();
+    m_window.reset();
+    m_desk.reset();
+    m_remembered.reset();
+    m_office.reset();
+}
+
+void Running::find_family()
+{
+    m_window->open_area(u"main_menu"_s);
+    bring_forward(*m_window);
+    m_window->page()->find();
+}
+
+void Running::open_area(const QString& key)
+{
+    m_window->open_area(key);
+}
+
+void Running::load_church(int church)
+{
+    QMetaObject::invokeMethod(this, [this, church] { switch_to(church); }, Qt::QueuedConnection);
+}
+
+void Running::switch_to(int church)
+{
+    if (!m_window->leave_all())
+        return;
+    // From the moment there is a second church, start-up goes by the marks: the first one needs its own.
+    const bool to_own_church = church < core::training_church;
+    if (to_own_church && church != m_office->church)
+        mark_as_set_up(*m_office);
+    close();
+    const bool started = start(church);
+    if (started && to_own_church)
+        mark_as_set_up(*m_office);
+    if (!started && m_surroundings.ended)
+        m_surroundings.ended();
+}
+
+}

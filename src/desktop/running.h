@@ -1,0 +1,60 @@
+#pragma once
+
+#include "core/startup.h"
+#include "desktop/shell/desk.h"
+#include "desktop/shell/look.h"
+
+#include <QObject>
+
+namespace kindrel::desktop {
+
+class MainWindow;
+class QtDialogue;
+
+/// What the running program was given to work with.
+struct Surroundings
+{
+    core::Workstation& workstation;
+    core::Dialogue& dialogue;
+    core::Clock& clock;
+    core::Progress& progress;
+    Printing& printing;
+    Look& look;
+    QString data_drive; ///< As of StartRequest.
+    std::function<void(const core::Office&)> opened = {}; ///< An office is open; its screens come next.
+    std::function<void()> ended = {};                     ///< The program is to end.
+};
+
+/// The office that is open and its screens; switching church closes both and builds new ones.
+class Running : public QObject, public Navigation
+{
+    Q_OBJECT
+
+public:
+    explicit Running(Surroundings surroundings);
+    ~Running() override;
+
+    /// Starts up and shows the main window. False when start-up ended the program.
+    [[nodiscard]] bool start(int church);
+    /// Null while no office is open.
+    [[nodiscard]] Desk* desk() { return m_desk.get(); }
+    [[nodiscard]] MainWindow* window() { return m_window.get(); }
+
+    void find_family() override;
+    void open_area(const QString& key) override;
+    void load_church(int church) override;
+
+private:
+    void switch_to(int church);
+    void build();
+    void close();
+
+    Surroundings m_surroundings;
+    std::unique_ptr<core::Office> m_office;
+    std::unique_ptr<Remembered> m_remembered;
+    std::unique_ptr<Windows> m_windows;
+    std::unique_ptr<Desk> m_desk;
+    std::unique_ptr<MainWindow> m_window;
+};
+
+}

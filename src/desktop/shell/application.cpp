@@ -1,0 +1,28 @@
+#include "desktop/shell/application.h"
+
+#include "core/files.h"
+#include "core/session.h"
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+
+bool Application::notify(QObject* receiver, QEvent* event)
+{
+    try {
+        return QApplication::notify(receiver, event);
+    } catch (const core::DatabaseError& error) {
+        tell(u"The database could not be read or written."_s, error.text());
+    } catch (const core::FileError& error) {
+        tell(u"A file could not be read or written."_s, error.text());
+    }
+    return true;
+}
+
+void Application::tell(const QString& what, const QString& why)
+{
+    if (m_dialogue)
+        m_dialogue->show({what, why});
+}
+
+}

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "core/office.h"
+#include "core/progress.h"
+#include "desktop/shell/remembered.h"
+#include "desktop/shell/windows.h"
+
+namespace kindrel::desktop {
+
+class Printing;
+
+/// The ways from one screen to another.
+class Navigation
+{
+public:
+    virtual ~Navigation() = default;
+    /// Brings the family list forward with the cursor in its filter.
+    virtual void find_family() = 0;
+    /// `key` names a row of the table of areas.
+    virtual void open_area(const QString& key) = 0;
+    /// Closes the office and starts up again; happens after the caller has returned.
+    virtual void load_church(int church) = 0;
+};
+
+/// What every screen is given. It outlives them all.
+struct Desk
+{
+    core::Office& office;
+    core::Progress& progress;
+    Remembered& remembered;
+    Windows& windows;
+    Printing& printing;
+    Navigation& navigation;
+};
+
+}

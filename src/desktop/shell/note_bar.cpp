@@ -1,0 +1,60 @@
+#include "desktop/shell/note_bar.h"
+
+#include "desktop/shell/icons.h"
+#include "desktop/shell/look.h"
+
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QPainter>
+#include <QPushButton>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+
+NoteBar::NoteBar(QWidget* parent) : QFrame(parent), m_text(new QLabel), m_close(new QPushButton)
+{
+    setObjectName(u"note_bar"_s);
+    m_text->setTextFormat(Qt::PlainText);
+    m_text->setWordWrap(true);
+    m_text->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    m_close->setFlat(true);
+    m_close->setIcon(icon(u"window-close"_s));
+    m_close->setAccessibleName(u"Close this note"_s);
+    connect(m_close, &QPushButton::clicked, this, &NoteBar::clear);
+
+    auto* mark = new QLabel;
+    mark->setPixmap(icon(u"dialog-information"_s).pixmap(16, 16));
+    auto* row = new QHBoxLayout(this);
+    row->setContentsMargins(space::margin, 2, space::field / 2, 2);
+    row->addWidget(mark);
+    row->addWidget(m_text, 1);
+    row->addWidget(m_close);
+    hide();
+}
+
+void NoteBar::say(const QString& text)
+{
+    m_text->setText(text);
+    setAccessibleName(text);
+    setVisible(!text.isEmpty());
+}
+
+void NoteBar::clear()
+{
+    say({});
+}
+
+QString NoteBar::text() const
+{
+    return m_text->text();
+}
+
+void NoteBar::paintEvent(QPaintEvent*)
+{
+    QPainter painter(this);
+    painter.fillRect(rect(), palette().color(QPalette::Button));
+    painter.fillRect(QRect(0, 0, 3, height()), palette().color(QPalette::Highlight));
+}
+
+}

@@ -1,0 +1,58 @@
+#pragma once
+
+#include <QWidget>
+
+class QAction;
+class QHBoxLayout;
+class QLabel;
+class QVBoxLayout;
+
+namespace kindrel::desktop {
+
+class Chip;
+class NoteBar;
+
+/// What every page has in common: a header with title, state chip and actions, the note bar, and the content.
+class Page : public QWidget
+{
+    Q_OBJECT
+
+public:
+    explicit Page(const QString& title, QWidget* parent = nullptr);
+
+    [[nodiscard]] QString title() const;
+    void set_title(const QString& title);
+    [[nodiscard]] NoteBar& note() { return *m_note; }
+    [[nodiscard]] Chip& chip() { return *m_chip; }
+    /// What the status bar shows of the page, for example how many rows its list has.
+    [[nodiscard]] QString status() const { return m_status; }
+    void set_status(const QString& status);
+    /// The name of the page's help text.
+    [[nodiscard]] virtual QString help() const = 0;
+
+    /// The page comes to the front.
+    virtual void entered() {}
+    /// The cursor goes to where one finds things on this page.
+    virtual void find() {}
+    virtual void print() {}
+    /// False: the page must stay open.
+    [[nodiscard]] virtual bool leave() { return true; }
+
+Q_SIGNALS:
+    void status_changed();
+
+protected:
+    /// A button at the right of the header.
+    QAction* add_action(const QString& text, const QString& icon_name, const QString& tip);
+    void set_content(QWidget* content);
+
+private:
+    QLabel* m_title;
+    Chip* m_chip;
+    NoteBar* m_note;
+    QHBoxLayout* m_header;
+    QVBoxLayout* m_column;
+    QString m_status;
+};
+
+}

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "core/dialogue.h"
+#include "core/progress.h"
+
+#include <QElapsedTimer>
+
+#include <memory>
+
+class QProgressDialog;
+
+namespace kindrel::desktop {
+
+/// A box with a bar in front of everything, once a run has lasted long enough to be noticed.
+class QtProgress : public core::Progress
+{
+public:
+    explicit QtProgress(core::Dialogue& dialogue);
+    ~QtProgress() override;
+
+    void begin(const QString& what, int steps, const QString& cancel_question) override;
+    [[nodiscard]] bool step(const QString& what) override;
+    void end() override;
+
+private:
+    void show_state(const QString& what);
+    [[nodiscard]] bool cancel_confirmed();
+
+    core::Dialogue& m_dialogue;
+    std::unique_ptr<QProgressDialog> m_box;
+    QString m_question;
+    int m_done = 0;
+    QElapsedTimer m_running, m_shown;
+};
+
+}

@@ -1,0 +1,294 @@
+#include <QDir>
+#include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QProcess>
+#include <QRegularExpression>
+#include <QSet>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <csignal>
+
+#include <sys/resource.h>
+
+namespace kindrel::test {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// How a run of the program ended.
+struct Ended
+{
+    int status = -1;
+    QByteArray out, err;
+};
+
+std::ostream& operator<<(std::ostream& stream, const Ended& ended)
+{
+    return stream << "status " << ended.status << "\n" << ended.out.toStdString() << "\n" << ended.err.toStdString();
+}
+
+enum class DiskSpace
+{
+    plenty,
+    scarce
+};
+
+/// Room for a few pages, not for the PDF with its fonts.
+void refuse_large_files()
+{
+    constexpr rlim_t most_bytes = 8 * 1024;
+    const rlimit limit{most_bytes, most_bytes};
+    setrlimit(RLIMIT_FSIZE, &limit);
+    signal(SIGXFSZ, SIG_IGN);
+}
+
+/// The real program on a data drive of its own.
+class KindrelctlTest : public testing::Test
+{
+protected:
+    [[nodiscard]] Ended run(const QStringList& words, DiskSpace space = DiskSpace::plenty)
+    {
+        QProcess program;
+        if (space == DiskSpace::scarce)
+            program.setChildProcessModifier(refuse_large_files);
+        program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrelctl"_s,
+                      QStringList{u"--data-drive"_s, drive.path()} + words);
+        program.closeWriteChannel();
+        if (!program.waitForFinished(120'000) || program.exitStatus() != QProcess::NormalExit)
+            return {-1, {}, program.errorString().toUtf8()};
+        return {program.exitCode(), program.readAllStandardOutput(), program.readAllStandardError()};
+    }
+    /// Lays down the data folder and fills church 1.
+    void make_church(int families)
+    {
+        const auto installed = run({u"install"_s});
+        ASSERT_EQ(installed.status, 0) << installed;
+        const auto made = run({u"make-church"_s, u"--families"_s, QString::number(families), u"--seed"_s, u"7"_s});
+        ASSERT_EQ(made.status, 0) << made;
+    }
+    [[nodiscard]] QJsonArray list(const QStringList& words)
+    {
+        const auto ended = run(words + QStringList{u"--json"_s});
+        EXPECT_EQ(ended.status, 0) << ended;
+        const auto document = QJsonDocument::fromJson(ended.out);
+        EXPECT_TRUE(document.isArray()) << ended;
+        return document.array();
+    }
+    [[nodiscard]] QString pdf() const { return drive.filePath(u"report.pdf"_s); }
+    [[nodiscard]] static QByteArray content(const QString& file)
+    {
+        QFile opened(file);
+        return opened.open(QFile::ReadOnly) ? opened.readAll() : QByteArray();
+    }
+
+    QTemporaryDir drive;
+};
+
+} // namespace
+
+TEST_F(KindrelctlTest, AMadeChurchIsCountedListedAndShown)
+{
+    make_church(30);
+
+    const auto totals = list({u"totals"_s});
+    EXPECT_EQ(totals.first()[u"total"_s].toString(), u"Family File Total ="_s);
+    EXPECT_EQ(totals.first()[u"count"_s].toInt(), 30);
+
+    const auto families = list({u"families"_s});
+    ASSERT_EQ(families.size(), 30);
+    const auto first = families.first().toObject();
+    const auto shown = run({u"family"_s, QString::number(first[u"surname_id"_s].toInt())});
+    EXPECT_EQ(shown.status, 0) << shown;
+    EXPECT_TRUE(shown.out.contains(first[u"surname"_s].toString().toUtf8())) << shown;
+}
+
+TEST_F(KindrelctlTest, EachFamilyListHoldsTheFamiliesOfItsStatus)
+{
+    make_church(60);
+    const std::vector<std::pair<QString, QSet<QString>>> lists{
+        {u"active"_s, {u"active"_s}},
+        {u"privacy"_s, {u"privacy"_s}},
+        {u"active-privacy"_s, {u"active"_s, u"privacy"_s}},
+        {u"prospect"_s, {u"prospect"_s}},
+        {u"archive"_s, {u"archive"_s}},
+    };
+    for (const auto& [status, expected] : lists) {
+        QSet<QString> found;
+        for (const auto& family : list({u"families"_s, u"--status"_s, status}))
+            found += family[u"condition"_s].toString();
+        EXPECT_EQ(found, expected) << status.toStdString();
+    }
+    const auto all = list({u"families"_s});
+    const auto booked = list({u"families"_s, u"--status"_s, u"booked-out"_s});
+    EXPECT_EQ(booked.size(), std::ranges::count_if(all, [](auto family) { return family[u"booked_out"_s].toBool(); }));
+}
+
+TEST_F(KindrelctlTest, WhatIsUnlistedIsNotShown)
+{
+    make_church(60);
+    const std::vector<std::pair<QString, QString>> twins{{u"phone_hidden"_s, u"phone"_s},
+                                                         {u"res_hidden"_s, u"res_street"_s},
+                                                         {u"mobile_hidden"_s, u"mobile_phone"_s},
+                                                         {u"birthdate_hidden"_s, u"birthdate"_s}};
+    QSet<QString> met;
+    for (const auto& entry : list({u"families"_s})) {
+        const auto shown = run({u"family"_s, QString::number(entry[u"surname_id"_s].toInt()), u"--json"_s});
+        const auto family = QJsonDocument::fromJson(shown.out).object();
+        auto records = family[u"people"_s].toArray();
+        records.append(family[u"address"_s]);
+        for (const auto& record : records) {
+            for (const auto& [hidden, value] : twins) {
+                if (!record[hidden].toBool())
+                    continue;
+                met += hidden;
+                EXPECT_TRUE(record[value].isNull() || record[value].toString().isEmpty()) << shown;
+            }
+        }
+    }
+    EXPECT_EQ(met.size(), qsizetype(twins.size())) << "the church made for the test hides too little";
+}
+
+TEST_F(KindrelctlTest, AFullChurchIsNotFilledAgain)
+{
+    make_church(5);
+
+    const auto again = run({u"make-church"_s, u"--families"_s, u"5"_s});
+
+    EXPECT_EQ(again.status, 1) << again;
+    EXPECT_TRUE(again.err.contains("holds 5 families already")) << again;
+    EXPECT_EQ(list({u"families"_s}).size(), 5);
+}
+
+TEST_F(KindrelctlTest, ChurchesAreApart)
+{
+    make_church(5);
+
+    ASSERT_EQ(run({u"--church"_s, u"2"_s, u"make-church"_s, u"--families"_s, u"3"_s}).status, 0);
+
+    EXPECT_EQ(list({u"families"_s}).size(), 5);
+    EXPECT_EQ(list({u"families"_s, u"--church"_s, u"2"_s}).size(), 3);
+}
+
+TEST_F(KindrelctlTest, TheReportOfTheActiveFamiliesIsWrittenAsAPdf)
+{
+    make_church(20);
+
+    for (const auto& name : {u"k10"_s, u"Directory 1"_s}) {
+        const auto written = run({u"report"_s, name, u"--pdf"_s, pdf(), u"--paper"_s, u"letter"_s});
+        EXPECT_EQ(written.status, 0) << written;
+        EXPECT_TRUE(content(pdf()).startsWith("%PDF-"));
+        ASSERT_TRUE(QFile::remove(pdf()));
+    }
+}
+
+TEST_F(KindrelctlTest, AReportThatCannotBeWrittenLeavesTheOldFile)
+{
+    make_church(3);
+    QFile old(pdf());
+    ASSERT_TRUE(old.open(QFile::WriteOnly) && old.write("the old report") > 0);
+    old.close();
+    const auto files_before = QDir(drive.path()).entryList(QDir::Files | QDir::Hidden);
+
+    const auto ended = run({u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}, DiskSpace::scarce);
+
+    EXPECT_EQ(ended.status, 1) << ended;
+    EXPECT_TRUE(ended.err.contains("report.pdf could not be written")) << ended;
+    EXPECT_EQ(content(pdf()), "the old report");
+    EXPECT_EQ(QDir(drive.path()).entryList(QDir::Files | QDir::Hidden), files_before);
+}
+
+TEST_F(KindrelctlTest, AReportIntoAFolderThatIsNotThereIsRefused)
+{
+    make_church(3);
+
+    const auto ended = run({u"report"_s, u"k10"_s, u"--pdf"_s, drive.filePath(u"nowhere/report.pdf"_s)});
+
+    EXPECT_EQ(ended.status, 1) << ended;
+    EXPECT_TRUE(ended.err.contains("nowhere/report.pdf could not be written")) << ended;
+}
+
+TEST_F(KindrelctlTest, WhatCannotBeFoundIsRefusedWithAMessageOnStandardError)
+{
+    make_church(3);
+    const std::vector<std::pair<QStringList, QByteArray>> cases{
+        {{u"family"_s, u"4711"_s}, "There is no family with the key 4711."},
+        {{u"report"_s, u"k9999"_s, u"--pdf"_s, pdf()}, "There is no report \"k9999\""},
+    };
+    for (const auto& [words, message] : cases) {
+        const auto ended = run(words);
+        EXPECT_EQ(ended.status, 1) << ended;
+        EXPECT_TRUE(ended.err.contains(message)) << ended;
+        EXPECT_TRUE(ended.out.isEmpty()) << ended;
+    }
+    EXPECT_FALSE(QFile::exists(pdf()));
+}
+
+TEST_F(KindrelctlTest, WithoutADataFolderEveryCommandThatNeedsOneIsRefused)
+{
+    for (const auto& word : {u"totals"_s, u"families"_s}) {
+        const auto ended = run({word});
+        EXPECT_EQ(ended.status, 1) << ended;
+        EXPECT_TRUE(ended.err.contains("unable to establish connection to its data folder")) << ended;
+    }
+}
+
+TEST_F(KindrelctlTest, WrongUsageIsToldApartFromRefusal)
+{
+    make_church(1);
+    const std::vector<QStringList> cases{
+        {},
+        {u"fly"_s},
+        {u"--fly"_s},
+        {u"totals"_s, u"extra"_s},
+        {u"totals"_s, u"--pdf"_s, u"x"_s},
+        {u"family"_s},
+        {u"family"_s, u"Naismith"_s},
+        {u"families"_s, u"--status"_s, u"sleeping"_s},
+        {u"--church"_s, u"10"_s, u"totals"_s},
+        {u"totals"_s, u"--church"_s, u"one"_s},
+        {u"make-church"_s},
+        {u"make-church"_s, u"--families"_s, u"0"_s},
+        {u"report"_s, u"k10"_s},
+        {u"report"_s, u"k10"_s, u"--pdf"_s, pdf(), u"--paper"_s, u"a5"_s},
+    };
+    for (const auto& words : cases) {
+        const auto ended = run(words);
+        EXPECT_EQ(ended.status, 2) << words.join(u' ').toStdString() << "\n" << ended;
+        EXPECT_TRUE(ended.err.contains("--help")) << ended;
+        EXPECT_TRUE(ended.out.isEmpty()) << ended;
+    }
+}
+
+TEST_F(KindrelctlTest, TheHelpNamesEveryCommandAndEachExplainsItself)
+{
+    const auto help = run({u"--help"_s});
+    ASSERT_EQ(help.status, 0) << help;
+    static const QRegularExpression named(u"^  ([a-z][a-z-]+) "_s, QRegularExpression::MultilineOption);
+    int found = 0;
+    for (const auto& match : named.globalMatch(QString::fromUtf8(help.out))) {
+        const auto word = match.captured(1);
+        const auto own = run({word, u"--help"_s});
+        EXPECT_EQ(own.status, 0) << own;
+        EXPECT_TRUE(own.out.startsWith("Usage: kindrelctl [OPTIONS] " + word.toUtf8())) << own;
+        ++found;
+    }
+    EXPECT_GE(found, 7);
+}
+
+TEST_F(KindrelctlTest, AResultThatCannotBeWrittenIsAFailure)
+{
+    QProcess program;
+    program.setStandardOutputFile(u"/dev/full"_s);
+    program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrelctl"_s, {u"reports"_s});
+    ASSERT_TRUE(program.waitForFinished());
+
+    EXPECT_EQ(program.exitCode(), 1);
+}
+
+} // namespace kindrel::test
