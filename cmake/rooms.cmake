@@ -31,5 +31,5 @@ function(kindrel_test name)
         add_dependencies(engine_tests ${name})
     endif()
     gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST PROPERTIES TIMEOUT 300 LABELS ${label}
-        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;KINDREL_BIN=${CMAKE_BINARY_DIR}/bin;LC_ALL=C.UTF-8")
+        ENVIRONMENT KINDREL_BIN=${CMAKE_BINARY_DIR}/bin)
 endfunction()

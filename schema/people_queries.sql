@@ -42,54 +42,47 @@ SELECT [occupation_id], [occupation], [position] FROM [tbl_occupation_setup] ORD
 CREATE VIEW [Qry_suburb_list] AS
 SELECT [suburb_id], [suburb], [postcode], [position] FROM [tbl_suburb_setup] ORDER BY [position], [suburb_id];
 
--- What people and families carry, with the text of each item.
+-- What people and families carry, with the text of each item. The reader orders them: a server does not look into an
+-- ordered view for the one owner that is asked for.
 CREATE VIEW [qry_status_load] AS
 SELECT l.[person_id], l.[status_id], i.[status], l.[s_position]
 FROM [tbl_status] l
-JOIN [tbl_status_setup] i ON i.[status_id] = l.[status_id]
-ORDER BY l.[s_position], i.[position];
+JOIN [tbl_status_setup] i ON i.[status_id] = l.[status_id];
 
 CREATE VIEW [qry_group_load] AS
 SELECT l.[person_id], l.[group_id], i.[group], i.[not_active], l.[g_position]
 FROM [tbl_group] l
-JOIN [tbl_group_setup] i ON i.[group_id] = l.[group_id]
-ORDER BY l.[g_position], i.[position];
+JOIN [tbl_group_setup] i ON i.[group_id] = l.[group_id];
 
 CREATE VIEW [qry_ministry_load] AS
 SELECT l.[person_id], l.[ministry_id], i.[ministry], l.[ministry_type], l.[m_position]
 FROM [tbl_ministry] l
-JOIN [tbl_ministry_setup] i ON i.[ministry_id] = l.[ministry_id]
-ORDER BY l.[m_position], i.[position], l.[ministry_type];
+JOIN [tbl_ministry_setup] i ON i.[ministry_id] = l.[ministry_id];
 
 CREATE VIEW [qry_flexi_load] AS
 SELECT l.[person_id], l.[flexi_id], i.[flexi], l.[flexi_field], l.[flexi_tagged], i.[position]
 FROM [tbl_flexi] l
-JOIN [tbl_flexi_setup] i ON i.[flexi_id] = l.[flexi_id]
-ORDER BY i.[position], l.[flexi_id];
+JOIN [tbl_flexi_setup] i ON i.[flexi_id] = l.[flexi_id];
 
 CREATE VIEW [qry_individual_date_load] AS
 SELECT l.[person_id], l.[in_date_id], i.[date_description], l.[in_date], l.[in_date_tagged], i.[position]
 FROM [tbl_individual_date] l
-JOIN [tbl_individual_date_setup] i ON i.[in_date_id] = l.[in_date_id]
-ORDER BY i.[position], l.[in_date_id];
+JOIN [tbl_individual_date_setup] i ON i.[in_date_id] = l.[in_date_id];
 
 CREATE VIEW [qry_occupation_load] AS
 SELECT l.[person_id], l.[occupation_id], i.[occupation], i.[position]
 FROM [tbl_occupation] l
-JOIN [tbl_occupation_setup] i ON i.[occupation_id] = l.[occupation_id]
-ORDER BY i.[position], l.[occupation_id];
+JOIN [tbl_occupation_setup] i ON i.[occupation_id] = l.[occupation_id];
 
 CREATE VIEW [qry_family_group_load] AS
 SELECT l.[surname_id], l.[family_group_id], i.[family_group], l.[f_position]
 FROM [tbl_family_group] l
-JOIN [tbl_family_group_setup] i ON i.[family_group_id] = l.[family_group_id]
-ORDER BY l.[f_position], i.[position];
+JOIN [tbl_family_group_setup] i ON i.[family_group_id] = l.[family_group_id];
 
 CREATE VIEW [qry_family_date_load] AS
 SELECT l.[surname_id], l.[family_date_id], i.[date_description], l.[family_date], l.[family_date_tagged], i.[position]
 FROM [tbl_family_date] l
-JOIN [tbl_family_date_setup] i ON i.[fam_date_id] = l.[family_date_id]
-ORDER BY i.[position], l.[family_date_id];
+JOIN [tbl_family_date_setup] i ON i.[fam_date_id] = l.[family_date_id];
 
 -- The postcode that holds is the family's own where it has one.
 CREATE VIEW [Qry_suburb_load] AS
@@ -99,7 +92,7 @@ FROM [tbl_suburb] l
 LEFT JOIN [tbl_suburb_setup] i ON i.[suburb_id] = l.[suburb_id];
 
 CREATE VIEW [Qry_events_load] AS
-SELECT [surname_id], [event_date], [event], [e_position] FROM [tbl_events] ORDER BY [e_position];
+SELECT [surname_id], [event_date], [event], [e_position] FROM [tbl_events];
 
 CREATE VIEW [qry_group_history] AS
 SELECT h.[history_id], h.[person_id], h.[group_id], COALESCE(i.[group], h.[group]) AS [group],

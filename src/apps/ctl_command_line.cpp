@@ -15,6 +15,7 @@ namespace {
 constexpr std::array program_options{
     Option{"data-drive", "DIR", "the folder that holds Kindrel_10_Data (default: the workstation's own)"},
     Option{"church", "N", "the church: 1 to 7, 8 for training data, 9 for booked-out data (default: the one in use)"},
+    Option{"password-file", "FILE", "the password's file, where the church asks for one (default: standard input)"},
     Option{"help", nullptr, "show this help, or that of the command"},
 };
 

@@ -22,12 +22,7 @@ namespace {
 /// without one, its parts are shown beneath its label.
 struct Part
 {
-    enum class Kind
-    {
-        value,
-        record,
-        list
-    };
+    enum class Kind { value, record, list };
     Kind kind = Kind::value;
     QString name, label, text;
     QJsonValue value;

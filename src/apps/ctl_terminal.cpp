@@ -1,5 +1,7 @@
 #include "apps/ctl_terminal.h"
 
+#include "core/files.h"
+
 #include <termios.h>
 #include <unistd.h>
 
@@ -45,7 +47,10 @@ private:
 
 } // namespace
 
-TerminalDialogue::TerminalDialogue() : m_in(stdin), m_err(stderr), m_attended(isatty(STDIN_FILENO) != 0) {}
+TerminalDialogue::TerminalDialogue(QString password_file)
+    : m_in(stdin), m_err(stderr), m_attended(isatty(STDIN_FILENO) != 0), m_password_file(std::move(password_file))
+{
+}
 
 void TerminalDialogue::show(const core::Message& message)
 {
@@ -81,9 +86,27 @@ std::optional<bool> TerminalDialogue::confirm_or_cancel(const core::Message& mes
 
 std::optional<QString> TerminalDialogue::ask_text(const core::Message& message, bool secret)
 {
+    if (secret)
+        return password();
     show(message);
-    const Unseen unseen(secret && m_attended);
     return ask(u"> "_s);
+}
+
+std::optional<QString> TerminalDialogue::password()
+{
+    if (!m_password_file.isEmpty()) {
+        const auto content = core::read_file(m_password_file);
+        if (!content)
+            throw core::FileError(u"The password file '%1' is not there."_s.arg(m_password_file));
+        return QString::fromUtf8(content->split('\n').first()).remove(u'\r');
+    }
+    const Unseen unseen(m_attended);
+    if (m_attended)
+        m_err << u"Password: "_s << Qt::flush;
+    const auto typed = m_in.readLine();
+    if (m_attended)
+        m_err << Qt::endl;
+    return typed.isNull() ? std::nullopt : std::optional(typed);
 }
 
 std::optional<int> TerminalDialogue::choose(const core::Message& message, const QStringList& from)

@@ -7,11 +7,12 @@
 namespace kindrel::apps {
 
 /// Speaks on standard error and listens on standard input. Where nobody sits at it, every question gets the answer
-/// that loses nothing.
+/// that loses nothing, but for a password: that is read from the given file, else as a line of standard input.
 class TerminalDialogue final : public core::Dialogue
 {
 public:
-    TerminalDialogue();
+    /// No password file: empty.
+    explicit TerminalDialogue(QString password_file = {});
     void show(const core::Message& message) override;
     [[nodiscard]] bool confirm(const core::Message& message, core::Answer safe) override;
     [[nodiscard]] std::optional<bool> confirm_or_cancel(const core::Message& message) override;
@@ -21,12 +22,14 @@ public:
     void play(const QString& sound) override;
 
 private:
+    [[nodiscard]] std::optional<QString> password();
     /// Nullopt at the end of the input and where nobody sits at it.
     [[nodiscard]] std::optional<QString> ask(const QString& prompt);
 
     QTextStream m_in;
     QTextStream m_err;
     bool m_attended;
+    QString m_password_file;
 };
 
 } // namespace kindrel::apps

@@ -62,18 +62,20 @@ int run(desktop::Application& application, const Options& options)
     desktop::QtPrinting printing(dialogue, progress);
     core::SystemWorkstation workstation(display_size(options), QPixmap::defaultDepth());
     core::SystemClock clock;
-    desktop::Running running({.workstation = workstation,
-                              .dialogue = dialogue,
-                              .clock = clock,
-                              .progress = progress,
-                              .printing = printing,
-                              .look = look,
-                              .data_drive = options.data_drive,
-                              .opened =
-                                  [&boxes](const core::Office& office) {
-                                      boxes.set_audio_folder(office.paths.folder(core::Folder::audio));
-                                  },
-                              .ended = [] { QCoreApplication::quit(); }});
+    desktop::Running running(
+        {.workstation = workstation,
+         .dialogue = dialogue,
+         .clock = clock,
+         .progress = progress,
+         .printing = printing,
+         .look = look,
+         .data_drive = options.data_drive,
+         .opened =
+             [&boxes](const core::Office& office) { boxes.set_audio_folder(office.paths.folder(core::Folder::audio)); },
+         .ended =
+             [] {
+                 QCoreApplication::quit();
+             }});
     if (!running.start(options.church))
         return 1;
     return options.pictures.isEmpty() ? QApplication::exec() : apps::take_pictures(running, look, options.pictures);
@@ -82,10 +84,11 @@ int run(desktop::Application& application, const Options& options)
 /// Pictures are taken without a display.
 bool wants_pictures(int count, char** words)
 {
-    return std::any_of(words, words + count, [](const char* word) { return QByteArray(word).startsWith("--pictures"); });
+    return std::any_of(words, words + count,
+                       [](const char* word) { return QByteArray(word).startsWith("--pictures"); });
 }
 
-}
+} // namespace
 
 int main(int count, char** words)
 {

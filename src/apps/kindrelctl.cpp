@@ -1,10 +1,10 @@
 #include "apps/ctl_command_line.h"
 #include "apps/ctl_terminal.h"
 
+#include "core/entry.h"
 #include "core/files.h"
 #include "core/startup.h"
 #include "core/system_workstation.h"
-#include "output/permission.h"
 
 #include <QGuiApplication>
 
@@ -40,7 +40,7 @@ apps::Status run_in_church(const apps::CommandLine& line, apps::Context& context
     const core::StartRequest request{core::Purpose::command_line, line.arguments.number(u"church"_s).value_or(0),
                                      line.arguments.value(u"data-drive"_s)};
     const auto office = core::start_up(request, context.workstation, context.dialogue, clock, progress);
-    if (!office || (line.command->area && !output::permitted(*office, *line.command->area)))
+    if (!office || (line.command->area && !core::permitted(*office, *line.command->area)))
         return apps::Status::refused;
     context.office = office.get();
     const auto status = line.command->run(context);
@@ -80,7 +80,7 @@ int main(int count, char** words)
         out << (line.command ? apps::help_text(*line.command) : apps::help_text());
         return 0;
     }
-    apps::TerminalDialogue dialogue;
+    apps::TerminalDialogue dialogue(line.arguments.value(u"password-file"_s));
     auto status = apps::Status::wrong_usage;
     if (line.fault.isEmpty()) {
         const auto application = application_for(line.command->needs, count, words);

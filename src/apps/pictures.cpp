@@ -69,7 +69,7 @@ void take_reports(desktop::Running& running, Camera& camera)
         camera.take(*window, u"preview"_s);
 }
 
-}
+} // namespace
 
 void UnattendedDialogue::show(const core::Message& message)
 {
@@ -111,4 +111,4 @@ int take_pictures(desktop::Running& running, desktop::Look& look, const QString&
     return camera.failed() ? 1 : 0;
 }
 
-}
+} // namespace kindrel::apps

@@ -20,4 +20,4 @@ public:
 /// Writes a picture of each screen in both shades into a folder. 0, or 1 when one could not be written.
 [[nodiscard]] int take_pictures(desktop::Running& running, desktop::Look& look, const QString& folder);
 
-}
+} // namespace kindrel::apps

@@ -1,6 +1,7 @@
 #include "core/startup.h"
 
 #include "core/open_church.h"
+#include "core/startup_security.h"
 #include "core/startup_steps.h"
 
 namespace kindrel::core {
@@ -41,6 +42,8 @@ constexpr std::array steps{
     Step{startup_steps::check_version},
     Step{startup_steps::load_settings},
     Step{startup_steps::count_start, For::desktop},
+    Step{startup_steps::ask_password},
+    Step{startup_steps::release_left_locks, For::desktop},
     Step{startup_steps::find_tutorial, For::desktop},
     Step{startup_steps::read_side_settings},
     Step{startup_steps::compact_when_due, For::desktop},

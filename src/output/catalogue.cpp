@@ -1,8 +1,8 @@
 #include "output/catalogue.h"
 
+#include "core/entry.h"
 #include "output/decoration.h"
 #include "output/directory.h"
-#include "output/permission.h"
 
 #include <algorithm>
 #include <array>
@@ -35,7 +35,7 @@ bool is_called(const ReportDefinition& report, QStringView name)
 /// Everything that can be refused before the first page.
 bool may_run(const ReportDefinition& report, const ReportInput& input)
 {
-    if (!permitted(input.office, report.area))
+    if (!core::permitted(input.office, report.area))
         return false;
     if (input.list.members.empty())
         input.office.dialogue.show({u"No people found for creating a report"_s});

@@ -78,14 +78,31 @@ void write_address(pages::Writer& place, const people::DisclosedFamily& family)
     write_line(place, address.res_country, body);
 }
 
+/// Contacts that would not fit beside each other stand beneath each other, so that no caption parts from its value.
+void write_contact_line(pages::Writer& place, std::span<const pages::CaptionValue> pairs)
+{
+    qreal width = 0;
+    for (const auto& pair : pairs) {
+        width += place.metrics().width(pair.caption, place.type().caption);
+        width += place.metrics().width(pair.value, place.type().body);
+    }
+    if (width <= place.width())
+        return place.captions(pairs);
+    for (const auto& pair : pairs)
+        place.captions({&pair, 1});
+}
+
 void write_contacts(pages::Writer& place, const DirectoryLayout& layout, const people::Address& address)
 {
     for (const auto& line : layout.contacts) {
         std::vector<pages::CaptionValue> pairs;
         pairs.reserve(line.size());
-        for (const auto& contact : line)
-            pairs.push_back({QStringView(contact.caption).toString(), address.*contact.value});
-        place.captions(pairs);
+        for (const auto& contact : line) {
+            if (const auto& value = address.*contact.value; !value.isEmpty())
+                pairs.push_back({QStringView(contact.caption).toString(), value});
+        }
+        if (!pairs.empty())
+            write_contact_line(place, pairs);
     }
 }
 

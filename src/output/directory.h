@@ -28,17 +28,9 @@ inline constexpr std::array map_details{Contact{u"Map: ", &people::Address::res_
 inline constexpr std::array<ContactLine, 3> family_contacts{phone_and_fax, family_email, map_details};
 
 /// Names, address and contacts beside each other, or beneath each other where the columns are narrow.
-enum class EntryShape
-{
-    side_by_side,
-    stacked
-};
+enum class EntryShape { side_by_side, stacked };
 /// A band with the letter before the first surname of each letter.
-enum class LetterBands
-{
-    off,
-    on
-};
+enum class LetterBands { off, on };
 
 /// One of the church directories.
 struct DirectoryLayout

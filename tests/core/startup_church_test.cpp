@@ -60,8 +60,7 @@ TEST_F(StartupChurchTest, ARefusedStartIsNotCounted)
 
 TEST_F(StartupChurchTest, TheSettingsAreThoseOfTheOneRow)
 {
-    in_database(
-        u"UPDATE [tbl_startup] SET [American_date]=-1, [vision]='To serve', [search_position]=3, [Security]=-1;"_s);
+    in_database(u"UPDATE [tbl_startup] SET [American_date]=-1, [vision]='To serve', [search_position]=3;"_s);
 
     const auto office = start();
 
@@ -69,7 +68,8 @@ TEST_F(StartupChurchTest, TheSettingsAreThoseOfTheOneRow)
     EXPECT_EQ(office->day_order(), DayOrder::month_first);
     EXPECT_EQ(office->settings.vision, u"To serve"_s);
     EXPECT_EQ(office->settings.search_position, 3);
-    EXPECT_FALSE(office->may(Area::security)) << "With security on nothing is open before the password.";
+    EXPECT_TRUE(office->may(Area::security));
+    EXPECT_FALSE(office->may(Area::read_only_family_data)) << "What restricts is not granted by having no security.";
 }
 
 TEST_F(StartupChurchTest, OneSettingIsWrittenWithoutTouchingTheOthers)

@@ -1,6 +1,6 @@
 #include "output_fixture.h"
 
-#include <algorithm>
+#include "output/directory.h"
 
 namespace kindrel::test {
 
@@ -103,6 +103,42 @@ TEST_F(DirectoryTest, AFaxWithoutAPhoneStandsAtTheBeginningOfItsLine)
     add({one});
 
     EXPECT_EQ(told(entries()), "Abel | Niels | Family Fax: 9555 1235");
+}
+
+TEST_F(DirectoryTest, PhoneAndFaxThatDoNotFitBesideEachOtherStandOnLinesOfTheirOwn)
+{
+    auto one = family(u"Abel"_s, {u"Niels"_s});
+    one.address.phone = u"(03) 9555 1234 after six, or next door"_s;
+    one.address.family_fax = u"9555 1235"_s;
+    add({one});
+
+    EXPECT_EQ(told(entries()),
+              "Abel | Niels | Family Ph: (03) 9555 1234 after six, or next door | Family Fax: 9555 1235");
+}
+
+TEST_F(DirectoryTest, EveryLayoutPrintsTheSameContentAndItsLetterBands)
+{
+    auto ann = at_home(family(u"Abel"_s, {u"Ann"_s}));
+    ann.address.phone = u"9555 1234"_s;
+    add({ann, family(u"Ångström"_s, {u"Bo"_s}), family(u"Zuse"_s, {u"Konrad"_s})});
+    const std::string plain =
+        "Abel | Ann | 12 Long Street | suburb 1 VIC 3000 | Family Ph: 9555 1234 | Ångström | Bo | "
+        "Zuse | Konrad";
+    const std::string banded =
+        "A | Abel | Ann | 12 Long Street | suburb 1 VIC 3000 | Family Ph: 9555 1234 | Ångström | "
+        "Bo | Z | Zuse | Konrad";
+
+    for (const auto shape : {output::EntryShape::side_by_side, output::EntryShape::stacked}) {
+        for (const auto bands : {output::LetterBands::off, output::LetterBands::on}) {
+            const output::DirectoryLayout layout{
+                {.title = "Church Directory", .page = {.columns = shape == output::EntryShape::stacked ? 2 : 1}},
+                shape,
+                bands,
+                output::family_contacts};
+            report.layout = &layout;
+            EXPECT_EQ(told(entries()), bands == output::LetterBands::on ? banded : plain);
+        }
+    }
 }
 
 TEST_F(DirectoryTest, AFamilyStaysTogetherOnItsPage)

@@ -64,7 +64,7 @@ void ReportTest::add(const std::vector<people::FamilyFile>& families)
 
 bool ReportTest::run(pages::PageSpool& spool, pages::Paper paper)
 {
-    return output::run_report(*output::find_report(u"k10"), {office, list}, progress, spool, paper);
+    return output::run_report(report, {office, list}, progress, spool, paper);
 }
 
 std::vector<QStringList> ReportTest::pages()

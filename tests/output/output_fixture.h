@@ -29,9 +29,9 @@ protected:
 
     /// Stores the families and puts all their people on the working list.
     void add(const std::vector<people::FamilyFile>& families);
-    /// Runs Directory 1 over the working list.
+    /// Runs the report, which is Directory 1, over the working list.
     [[nodiscard]] bool run(pages::PageSpool& spool, pages::Paper paper = pages::Paper::a4);
-    /// The texts of each page of Directory 1: header and footer, then the entries. Texts that follow each other closely
+    /// The texts of each page of the report: header and footer, then the entries. Texts that follow each other closely
     /// on a line are one.
     [[nodiscard]] std::vector<QStringList> pages();
     /// The texts of all its pages.
@@ -47,6 +47,7 @@ protected:
     core::Office office;
     people::WorkingList list;
     ScriptedProgress progress;
+    output::ReportDefinition report = *output::find_report(u"k10");
 };
 
 /// What a program of the PDF tools prints.
