@@ -127,7 +127,8 @@ double read_families(Church& church)
     constexpr std::size_t at_once = 500;
     for (std::size_t first = 0; first < keys.size(); first += at_once) {
         const auto count = std::min(at_once, keys.size() - first);
-        static_cast<void>(people::load_families(*church.office.session, std::span(keys).subspan(first, count)));
+        static_cast<void>(people::load_families(*church.office.session, std::span(keys).subspan(first, count),
+                                                people::Extent::names_and_address));
     }
     return seconds_since(start);
 }

@@ -176,6 +176,14 @@ BareRound bare_round(const std::vector<BareSave::Row>& stored, int round)
     return work;
 }
 
+bool same(const Items& ours, const std::vector<BareSave::Row>& bare)
+{
+    return std::ranges::equal(ours, bare, [](const people::SetupItem& item, const BareSave::Row& row) {
+        return item.key == row.key && item.text.toStdString() == row.text &&
+               item.postcode.toStdString() == row.postcode;
+    });
+}
+
 } // namespace
 
 int main(int count, char** arguments)
@@ -198,5 +206,7 @@ int main(int count, char** arguments)
             milliseconds_of([&] { (void)people::save_setup_list(*session, list, ours_work, QDate(2024, 5, 15)); }));
     }
     print("saving a list of suburbs", suburbs, comparison, 1.5);
+    if (!same(people::read_setup_items(*session, list.kind), bare.read()))
+        throw std::runtime_error("The two sides did not do the same work.");
     return 0;
 }

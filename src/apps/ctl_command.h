@@ -12,8 +12,7 @@
 namespace kindrel::apps {
 
 /// What the program ends with.
-enum class Status
-{
+enum class Status {
     done = 0,
     refused = 1,    ///< Refused or failed; the reason stands on standard error.
     wrong_usage = 2 ///< The command line could not be understood; nothing was done.
@@ -53,12 +52,7 @@ struct Context
 };
 
 /// What must be there before a command can run.
-enum class Needs
-{
-    nothing,
-    church,
-    church_and_fonts
-};
+enum class Needs { nothing, church, church_and_fonts };
 
 struct Command
 {

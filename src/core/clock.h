@@ -27,4 +27,4 @@ public:
     [[nodiscard]] bool wait(std::chrono::milliseconds time, Progress& progress) override;
 };
 
-}
+} // namespace kindrel::core

@@ -1,7 +1,7 @@
 #pragma once
 
-#include <QString>
 #include <QDate>
+#include <QString>
 
 #include <compare>
 #include <optional>
@@ -43,4 +43,4 @@ struct Message;
 /// The box that answers a date which could not be read.
 [[nodiscard]] Message bad_date_message(DayOrder order);
 
-}
+} // namespace kindrel::core

@@ -7,17 +7,8 @@
 
 namespace kindrel::core {
 
-enum class Icon
-{
-    caution,
-    information,
-    question
-};
-enum class Answer
-{
-    yes,
-    no
-};
+enum class Icon { caution, information, question };
+enum class Answer { yes, no };
 
 /// What a box says. `more` stands beneath the sentence.
 struct Message
@@ -39,12 +30,7 @@ struct Message
 /// A question for a file: `filter` is a list of name and pattern as "Text (*.txt)".
 struct FileQuestion
 {
-    enum class Kind
-    {
-        open,
-        save,
-        folder
-    };
+    enum class Kind { open, save, folder };
     QString title;
     QString filter;
     QString suggested;

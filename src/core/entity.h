@@ -62,4 +62,4 @@ inline constexpr int entity_count = 50;
 /// The counter table of an entity; empty for a number outside 1 to 50.
 [[nodiscard]] QStringView counter_table(Entity entity);
 
-}
+} // namespace kindrel::core

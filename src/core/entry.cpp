@@ -131,8 +131,7 @@ constexpr Obstacle before_security[]{held_area(
     one_in_security)};
 
 /// What an area takes for as long as somebody is in it.
-enum class Takes
-{
+enum class Takes {
     nothing,
     area_code, ///< The area is for one person at a time.
     people     ///< A place among those who work with people's files.

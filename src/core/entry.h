@@ -5,8 +5,7 @@
 namespace kindrel::core {
 
 /// The areas that are entered from the main menu.
-enum class AreaId
-{
+enum class AreaId {
     family_editor,
     search,
     tagging,

@@ -7,8 +7,7 @@
 namespace kindrel::core {
 
 /// The lock tables.
-enum class LockKind
-{
+enum class LockKind {
     area,          ///< Key: an AreaCode.
     family,        ///< Key: `surname_id`.
     roll_area,     ///< Somebody works with people's files there; held by as many workstations as are at work.
@@ -27,8 +26,7 @@ inline constexpr int lock_kind_count = 13;
 
 /// The areas that one person at a time may be in. 2 and 4 are as old as the lock tables; the others are this
 /// program's own and begin above what older files may hold.
-enum class AreaCode : int
-{
+enum class AreaCode : int {
     setup = 2, ///< The setup of the family file options.
     visitation = 4,
     project_setup = 21, ///< Roll, finance and weekly projects.

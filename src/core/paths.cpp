@@ -14,14 +14,7 @@ namespace {
 
 /// What a folder's name is added to. `moved` is the data root of the mode: a folder of its own for the training data
 /// and for the booked-out data, the data root itself otherwise.
-enum class Base
-{
-    program,
-    local,
-    root,
-    moved,
-    church
-};
+enum class Base { program, local, root, moved, church };
 
 struct Place
 {

@@ -7,16 +7,9 @@
 namespace kindrel::core {
 
 /// How the started program works with its data; fixed for the life of an office.
-enum class Mode
-{
-    normal,
-    network,
-    training,
-    booked_out
-};
+enum class Mode { normal, network, training, booked_out };
 
-enum class Folder
-{
+enum class Folder {
     program,
     data_root,
     local_settings,

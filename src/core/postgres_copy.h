@@ -4,9 +4,10 @@
 
 namespace kindrel::core {
 
-/// Copies every table of a server church into a fresh church file. Throws DatabaseError; a half-written file is removed.
+/// Copies every table of a server church into a fresh church file. Throws DatabaseError; a half-written file is
+/// removed.
 void copy_to_file(Session& server, const QString& file);
 /// Replaces every table's rows by those of a church file, in one transaction.
 void replace_from_file(Session& server, const QString& file);
 
-}
+} // namespace kindrel::core

@@ -25,4 +25,4 @@ public:
     void end() override {}
 };
 
-}
+} // namespace kindrel::core

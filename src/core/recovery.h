@@ -15,8 +15,7 @@ struct RecoveryList
 /// The list of this program: sixteen passwords of eight capital letters, each more costly to try than a user's.
 [[nodiscard]] const RecoveryList& recovery_list();
 
-enum class Recovery
-{
+enum class Recovery {
     unknown,    ///< None of the list.
     admitted,   ///< Lets in, and is marked as used.
     used_before ///< Has let somebody in already.

@@ -33,4 +33,4 @@ struct Home
 
 [[nodiscard]] std::span<const Home> homes();
 
-}
+} // namespace kindrel::core

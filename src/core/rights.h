@@ -69,4 +69,4 @@ private:
     std::bitset<area_count> m_granted;
 };
 
-}
+} // namespace kindrel::core

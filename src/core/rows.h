@@ -77,4 +77,4 @@ private:
     std::unique_ptr<Cursor> m_cursor;
 };
 
-}
+} // namespace kindrel::core

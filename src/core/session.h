@@ -27,11 +27,7 @@ private:
     bool m_constraint_broken;
 };
 
-enum class EngineKind
-{
-    sqlite,
-    postgres
-};
+enum class EngineKind { sqlite, postgres };
 
 /// One open database; the only place that knows an engine. Statements are written once, in the house's dialect:
 /// names in brackets without regard to case, `?` for values, no engine's own functions. Everything throws

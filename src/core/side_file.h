@@ -11,13 +11,7 @@ namespace kindrel::core {
 
 /// `number` is 16 bits wide, low byte first; `yes_no` the same with -1 and 0; `spare` bytes stay as they are found, and
 /// are zero in a new record.
-enum class SideType
-{
-    text,
-    number,
-    yes_no,
-    spare
-};
+enum class SideType { text, number, yes_no, spare };
 
 struct SideField
 {

@@ -10,11 +10,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-enum class For
-{
-    all,
-    desktop
-};
+enum class For { all, desktop };
 
 struct Step
 {

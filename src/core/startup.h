@@ -10,11 +10,7 @@ inline constexpr int program_edition = 100000;
 
 /// Who starts the office: the desktop runs every step; the command line neither rotates backups, counts starts nor
 /// compacts, and asks nothing but the password.
-enum class Purpose
-{
-    desktop,
-    command_line
-};
+enum class Purpose { desktop, command_line };
 
 struct StartRequest
 {

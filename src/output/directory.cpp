@@ -132,7 +132,7 @@ bool write_side_by_side(const ReportInput& input, const DirectoryLayout& layout,
                           {.share = contacts_share}},
                          entry_style());
     const QString gap;
-    return for_each_family(input, progress, [&](const ListedFamily& listed) {
+    const auto write = [&](const ListedFamily& listed) {
         if (layout.bands == LetterBands::on)
             flow.separator(listed.family.family().surname);
         const auto names = [&listed](pages::Writer& cell) {
@@ -147,12 +147,13 @@ bool write_side_by_side(const ReportInput& input, const DirectoryLayout& layout,
             write_contacts(cell, layout, listed.family.address());
         };
         entries.row({pages::Cell::of(names), gap, pages::Cell::of(address), gap, pages::Cell::of(contacts)});
-    });
+    };
+    return for_each_family(input, progress, write, people::Extent::names_and_address);
 }
 
 bool write_stacked(const ReportInput& input, const DirectoryLayout& layout, core::Progress& progress, pages::Flow& flow)
 {
-    return for_each_family(input, progress, [&](const ListedFamily& listed) {
+    const auto write = [&](const ListedFamily& listed) {
         if (layout.bands == LetterBands::on)
             flow.separator(listed.family.family().surname);
         const pages::Keep together(flow);
@@ -160,7 +161,8 @@ bool write_stacked(const ReportInput& input, const DirectoryLayout& layout, core
         write_address(flow, listed.family);
         write_contacts(flow, layout, listed.family.address());
         flow.space(2 * entry_padding);
-    });
+    };
+    return for_each_family(input, progress, write, people::Extent::names_and_address);
 }
 
 } // namespace

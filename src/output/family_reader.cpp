@@ -1,7 +1,5 @@
 #include "output/family_reader.h"
 
-#include "people/family_store.h"
-
 #include <algorithm>
 
 namespace kindrel::output {
@@ -58,7 +56,7 @@ private:
 } // namespace
 
 bool for_each_family(const ReportInput& input, core::Progress& progress,
-                     const std::function<void(const ListedFamily&)>& write)
+                     const std::function<void(const ListedFamily&)>& write, people::Extent extent)
 {
     const auto keys = input.list.families();
     const auto listed = sorted_people(input.list);
@@ -67,7 +65,7 @@ bool for_each_family(const ReportInput& input, core::Progress& progress,
 
     for (std::size_t first = 0; first < keys.size(); first += families_at_once) {
         const auto chunk = std::span(keys).subspan(first, std::min(families_at_once, keys.size() - first));
-        for (auto& file : people::load_families(*input.office.session, chunk)) {
+        for (auto& file : people::load_families(*input.office.session, chunk, extent)) {
             const auto family = people::disclose(std::move(file), disclosure);
             write({family, listed_household(family, listed)});
         }

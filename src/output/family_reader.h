@@ -2,6 +2,7 @@
 
 #include "output/catalogue.h"
 #include "people/disclosed.h"
+#include "people/family_store.h"
 #include "people/names.h"
 
 #include <functional>
@@ -16,9 +17,10 @@ struct ListedFamily
     people::Household household;
 };
 
-/// Reads the working list's families in its order, a few hundred at a time, and hands each to `write`. False when
-/// cancelled. Throws core::DatabaseError.
+/// Reads the working list's families in its order, a few hundred at a time, and hands each to `write`, as far as
+/// `extent` goes. False when cancelled. Throws core::DatabaseError.
 [[nodiscard]] bool for_each_family(const ReportInput& input, core::Progress& progress,
-                                   const std::function<void(const ListedFamily&)>& write);
+                                   const std::function<void(const ListedFamily&)>& write,
+                                   people::Extent extent = people::Extent::whole);
 
 } // namespace kindrel::output

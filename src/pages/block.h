@@ -7,16 +7,8 @@
 
 namespace kindrel::pages {
 
-enum class Glue : quint8
-{
-    none,
-    to_next
-};
-enum class BlockKind : quint8
-{
-    content,
-    space
-};
+enum class Glue : quint8 { none, to_next };
+enum class BlockKind : quint8 { content, space };
 
 struct Block;
 using Blocks = std::vector<Block>;

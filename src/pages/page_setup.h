@@ -5,21 +5,9 @@
 
 namespace kindrel::pages {
 
-enum class Paper
-{
-    a4,
-    letter
-};
-enum class Orientation
-{
-    portrait,
-    landscape
-};
-enum class ColumnRule
-{
-    none,
-    hairline
-};
+enum class Paper { a4, letter };
+enum class Orientation { portrait, landscape };
+enum class ColumnRule { none, hairline };
 
 /// The sheet and how it is divided. All measures of this room are points, 1/72 inch.
 struct PageSetup

@@ -8,25 +8,10 @@
 
 namespace kindrel::pages {
 
-enum class Align : quint8
-{
-    left,
-    centre,
-    right,
-    justified
-};
-enum class VerticalAlign : quint8
-{
-    top,
-    middle,
-    bottom
-};
+enum class Align : quint8 { left, centre, right, justified };
+enum class VerticalAlign : quint8 { top, middle, bottom };
 /// What becomes of text wider than its place: further lines, or an ellipsis at the end of the first.
-enum class LongText : quint8
-{
-    wrap,
-    elide
-};
+enum class LongText : quint8 { wrap, elide };
 
 namespace ink {
 constexpr QRgb black = 0xff000000;

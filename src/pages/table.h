@@ -19,18 +19,9 @@ struct TableColumn
     LongText long_text = LongText::wrap;
 };
 
-enum class TableLines : quint8
-{
-    none,
-    rows,
-    grid
-};
+enum class TableLines : quint8 { none, rows, grid };
 /// Exact rows keep their height (labels, tags) and shrink what does not fit.
-enum class RowHeight : quint8
-{
-    at_least,
-    exact
-};
+enum class RowHeight : quint8 { at_least, exact };
 
 struct TableStyle
 {
@@ -82,13 +73,7 @@ public:
 
 private:
     struct Place;
-    enum class Part : quint8
-    {
-        whole,
-        first,
-        middle,
-        last
-    };
+    enum class Part : quint8 { whole, first, middle, last };
 
     void write_heading();
     void write_cells(std::span<const Cell> cells, const TextStyle& look);

@@ -8,17 +8,7 @@
 namespace kindrel::people {
 
 /// The family lists in the order of the search screen's selector.
-enum class FamilyList
-{
-    all,
-    active,
-    privacy,
-    active_and_privacy,
-    prospect,
-    archive,
-    booked_in,
-    booked_out
-};
+enum class FamilyList { all, active, privacy, active_and_privacy, prospect, archive, booked_in, booked_out };
 inline constexpr int family_list_count = 8;
 
 [[nodiscard]] QString family_list_name(FamilyList list);

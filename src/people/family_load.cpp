@@ -194,9 +194,25 @@ void load_person_rows(Session& session, const Scope& scope, std::vector<FamilyFi
         load_links(scope.people(session, table.load_query, order_of(table)), table, list, people);
 }
 
+/// What hangs on the families themselves.
+void load_belongings(Session& session, const Scope& scope, const FamilyMap& families)
+{
+    load_of_families<RecordAccess>(scope.families(session, "tbl_record_access"), families, access_fields(),
+                                   [](FamilyFile& file) -> RecordAccess& { return file.access; });
+    load_of_families<OtherContact>(
+        scope.families(session, "tbl_other_contact", " ORDER BY [position]"), families, other_contact_fields(),
+        [](FamilyFile& file) -> OtherContact& { return file.other_contacts.emplace_back(); });
+    load_of_families<Event>(scope.families(session, "Qry_events_load", " ORDER BY [e_position]"), families,
+                            event_fields(), [](FamilyFile& file) -> Event& { return file.events.emplace_back(); });
+    load_of_families<Visit>(scope.families(session, "tbl_visitation", " ORDER BY [date]"), families, visit_fields(),
+                            [](FamilyFile& file) -> Visit& { return file.visits.emplace_back(); });
+    for (const auto& [table, list] : family_links())
+        load_links(scope.families(session, table.load_query, order_of(table)), table, list, families);
+}
+
 } // namespace
 
-std::vector<FamilyFile> load_families(Session& session, std::span<const int> surname_ids)
+std::vector<FamilyFile> load_families(Session& session, std::span<const int> surname_ids, Extent extent)
 {
     std::vector<FamilyFile> files;
     if (surname_ids.empty())
@@ -208,19 +224,11 @@ std::vector<FamilyFile> load_families(Session& session, std::span<const int> sur
     load_people_rows(session, scope, families);
     load_of_families<Address>(scope.families(session, "tbl_address"), families, address_fields(),
                               [](FamilyFile& file) -> Address& { return file.address; });
-    load_of_families<RecordAccess>(scope.families(session, "tbl_record_access"), families, access_fields(),
-                                   [](FamilyFile& file) -> RecordAccess& { return file.access; });
     load_suburbs(session, scope, families);
-    load_of_families<OtherContact>(
-        scope.families(session, "tbl_other_contact", " ORDER BY [position]"), families, other_contact_fields(),
-        [](FamilyFile& file) -> OtherContact& { return file.other_contacts.emplace_back(); });
-    load_of_families<Event>(scope.families(session, "Qry_events_load", " ORDER BY [e_position]"), families,
-                            event_fields(), [](FamilyFile& file) -> Event& { return file.events.emplace_back(); });
-    load_of_families<Visit>(scope.families(session, "tbl_visitation", " ORDER BY [date]"), families, visit_fields(),
-                            [](FamilyFile& file) -> Visit& { return file.visits.emplace_back(); });
-    for (const auto& [table, list] : family_links())
-        load_links(scope.families(session, table.load_query, order_of(table)), table, list, families);
-    load_person_rows(session, scope, files);
+    if (extent == Extent::whole) {
+        load_belongings(session, scope, families);
+        load_person_rows(session, scope, files);
+    }
     return files;
 }
 

@@ -7,9 +7,16 @@
 
 namespace kindrel::people {
 
+/// How much of a family is read: a directory needs neither details nor items.
+enum class Extent {
+    whole,
+    names_and_address ///< The family, its people's names and flags, address and suburbs.
+};
+
 /// The families of these keys with everything that hangs on them, in the order of the keys; a key without a row is
 /// passed over. A handful of statements, whatever their number. Throws core::DatabaseError.
-[[nodiscard]] std::vector<FamilyFile> load_families(core::Session& session, std::span<const int> surname_ids);
+[[nodiscard]] std::vector<FamilyFile> load_families(core::Session& session, std::span<const int> surname_ids,
+                                                    Extent extent = Extent::whole);
 
 /// Nullopt when the family is gone.
 [[nodiscard]] std::optional<FamilyFile> load_family(core::Session& session, int surname_id);

@@ -8,12 +8,7 @@
 
 namespace kindrel::people {
 
-enum class Markers
-{
-    none,
-    shortened,
-    full
-};
+enum class Markers { none, shortened, full };
 
 /// The flags' markers in their order, each with its leading blank where full: " (Privacy) (Deceased)".
 [[nodiscard]] QString markers(const Person& person, Markers kind);

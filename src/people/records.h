@@ -9,23 +9,9 @@
 
 namespace kindrel::people {
 
-enum class FileStatus
-{
-    active = 0,
-    privacy = 1,
-    prospect = 2,
-    archive = 3
-};
-enum class SuburbType
-{
-    residential = 1,
-    postal = 2
-};
-enum class MinistryState
-{
-    active = 1,
-    potential = 2
-};
+enum class FileStatus { active = 0, privacy = 1, prospect = 2, archive = 3 };
+enum class SuburbType { residential = 1, postal = 2 };
+enum class MinistryState { active = 1, potential = 2 };
 
 inline constexpr int most_people = 17;
 

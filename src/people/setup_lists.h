@@ -11,8 +11,7 @@
 namespace kindrel::people {
 
 /// The church's own vocabularies, in the order in which they are shown and saved.
-enum class SetupKind
-{
+enum class SetupKind {
     status,
     groups,
     ministries,

@@ -30,9 +30,10 @@ void lend(core::Session& session, const WorkingList& list)
 
 WorkingList active_families(core::Session& session)
 {
-    auto rows = session.select(u"SELECT p.[person_id],s.[Surname_ID] FROM [tbl_surname] s "
-                               "INNER JOIN [tbl_people] p ON p.[Surname_ID]=s.[Surname_ID] WHERE s.[Condition]=0 AND p.[Decease]=0 "
-                               "ORDER BY s.[sort_key],s.[Primary_name],s.[Surname_ID],p.[position];"_s);
+    auto rows = session.select(
+        u"SELECT p.[person_id],s.[Surname_ID] FROM [tbl_surname] s "
+        "INNER JOIN [tbl_people] p ON p.[Surname_ID]=s.[Surname_ID] WHERE s.[Condition]=0 AND p.[Decease]=0 "
+        "ORDER BY s.[sort_key],s.[Primary_name],s.[Surname_ID],p.[position];"_s);
     WorkingList list{{}, u"Active Families"_s};
     for (const core::Row& row : rows)
         list.members.push_back({row.integer(core::Column{0}), row.integer(core::Column{1})});

@@ -1,3 +1,5 @@
+#include "core/sqlite_session.h"
+
 #include <QDir>
 #include <QFile>
 #include <QJsonArray>
@@ -33,11 +35,7 @@ std::ostream& operator<<(std::ostream& stream, const Ended& ended)
     return stream << "status " << ended.status << "\n" << ended.out.toStdString() << "\n" << ended.err.toStdString();
 }
 
-enum class DiskSpace
-{
-    plenty,
-    scarce
-};
+enum class DiskSpace { plenty, scarce };
 
 /// Room for a few pages, not for the PDF with its fonts.
 void refuse_large_files()
@@ -224,6 +222,23 @@ TEST_F(KindrelctlTest, WhatCannotBeFoundIsRefusedWithAMessageOnStandardError)
         const auto ended = run(words);
         EXPECT_EQ(ended.status, 1) << ended;
         EXPECT_TRUE(ended.err.contains(message)) << ended;
+        EXPECT_TRUE(ended.out.isEmpty()) << ended;
+    }
+    EXPECT_FALSE(QFile::exists(pdf()));
+}
+
+TEST_F(KindrelctlTest, AChurchWithSecurityShowsNothingToWhomeverHasNoRights)
+{
+    make_church(2);
+    const auto key = QString::number(list({u"families"_s}).first()[u"surname_id"_s].toInt());
+    core::open_sqlite(drive.filePath(u"Kindrel_10_Data/church1/KR10_records.kdl"_s))
+        ->execute(u"UPDATE [tbl_startup] SET [Security]=?;"_s, true);
+    const std::vector<QStringList> commands{
+        {u"totals"_s}, {u"families"_s}, {u"family"_s, key}, {u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}};
+    for (const auto& words : commands) {
+        const auto ended = run(words);
+        EXPECT_EQ(ended.status, 1) << ended;
+        EXPECT_TRUE(ended.err.contains("does not give access")) << ended;
         EXPECT_TRUE(ended.out.isEmpty()) << ended;
     }
     EXPECT_FALSE(QFile::exists(pdf()));

@@ -20,11 +20,11 @@ QString unreachable(const QString& path)
 {
     return QStringList{
         u"Kindrel is in Network mode and is unable to access the Kindrel Data Files on '%1'. The problem may be "
-         "caused by "
+        "caused by "
         "one of the following:"_s.arg(path),
         u"(1) Your PC is not logged onto the network. (Network connection might be down)"_s,
         u"(2) The Kindrel data files have been moved to a new location on the network server and you need to set a "
-         "new path "
+        "new path "
         "for this PC to access them."_s,
         u"(3) Your PC doesn't have read / write privileges to the folder on the network that has the Kindrel files."_s,
         u"(4) This computer has not been mapped yet for the drive that has the Kindrel network files"_s,
@@ -34,7 +34,7 @@ QString unreachable(const QString& path)
 
 const QString leaving =
     u"\nKindrel is now removing itself from the network, and setting access to a local database. You are unable to "
-     "use any "
+    "use any "
     "Kindrel data files that are saved on the network. You need to contact your network administrator and inform him "
     "of this "
     "message."_s;
@@ -43,10 +43,10 @@ const QString help =
     "Installation.Doc'"_s;
 const QString offer =
     u"Kindrel is unable to access the network. Do you wish to work on the booked out data that is held on this "
-     "computer?"_s;
+    "computer?"_s;
 const QString security_lock =
     u"Unable to Enter Kindrel as a security lock is on, please use the Kindrel Mender Program to reset the security "
-     "lock so "
+    "lock so "
     "that access can be granted into the program"_s;
 
 } // namespace
@@ -146,7 +146,7 @@ TEST_F(StartupNetworkTest, TheNewestEditionIsRecordedAndAnOlderOneTold)
     dialogue.expect_box(
         u"A newer edition of Kindrel has been installed on your network."_s,
         u"At least one of the workstations on your network has been upgraded with a new edition of Kindrel; most "
-         "likely from "
+        "likely from "
         "obtaining the latest update from the Internet. It is highly recommended that you upgrade all workstations "
         "with the "
         "latest update."_s);

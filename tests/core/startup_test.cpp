@@ -25,14 +25,14 @@ namespace {
 
 const QString connect_sentence =
     u"Unable to connect to the family database file, this could have occurred if the database file has become "
-     "corrupted, "
+    "corrupted, "
     "(use the Kindrel Mender utility that came with Kindrel to fix this) or the database file has been deleted, or "
     "another program has locked you out of the database file, if this is so try rebooting your computer. Kindrel is "
     "now "
     "going to shut down."_s;
 const QString older_database =
     u"Please Note - You are trying to load a database that was created in a previous version. Please use the "
-     "conversion "
+    "conversion "
     "program to convert your data files."_s;
 
 /// A fault that ends the program.
@@ -52,16 +52,16 @@ const std::vector<Fault>& faults()
         {"the data folder is gone",
          [](TestStart& start) { QDir(start.data.root() + u"Local_settings"_s).removeRecursively(); },
          u"Kindrel is unable to establish connection to its data folder at '%1Kindrel_10_Data' Please confirm this "
-          "folder "
+         "folder "
          "has not been removed from your computer, if it has then Kindrel will require to be installed again."_s},
         {"another copy runs", [](TestStart& start) { start.workstation.first_copy = false; },
          u"Only one instance of Kindrel is permitted to run on a workstation. Kindrel is a complete network solution "
-          "where "
+         "where "
          "many computers can run Kindrel at the same time."_s,
          QString(), u"System Information"_s},
         {"dates are written with dots", [](TestStart& start) { start.workstation.pattern = u"dd.MM.yyyy"_s; },
          u"Currently you have Windows date configured to have a separator other than a forward slash, for example "
-          "you have "
+         "you have "
          "DD.MM.YYYY or DD-MM-YYYY, you need to configure your date separator to have DD/MM/YYYYY (forward slash) for "
          "Kindrel to correctly work. Kindrel is now going to shut down. After you have changed the Windows setting "
          "to a "
@@ -76,7 +76,7 @@ const std::vector<Fault>& faults()
              QFile::remove(start.data.program() + u"master/KR10_records.kdl"_s);
          },
          u"Unable to access your master database file because it is missing from your system, please reload Kindrel "
-          "again "
+         "again "
          "from the installation CD to recover the master database file."_s},
         {"the church is busy",
          [](TestStart& start) { DataFolder::write(start.data.root() + u"church1/Lock.Dat"_s, "1234567890"); },
@@ -311,7 +311,7 @@ TEST_F(StartupTest, AMonthFirstSystemIsToldUnlessTheChurchWritesDatesSo)
 {
     const QString month_first =
         u"Please note: Kindrel has found your Windows system settings not set to Australian Date format "
-         "(DD-MM-YYYY). Please "
+        "(DD-MM-YYYY). Please "
         "change your settings so that Kindrel can correctly analyse dates, this is done in the regional settings of "
         "the "
         "windows control panel"_s;

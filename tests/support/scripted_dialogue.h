@@ -39,15 +39,7 @@ public:
     void play(const QString& sound) override { m_played += sound; }
 
 private:
-    enum class Kind
-    {
-        box,
-        confirm,
-        confirm_or_cancel,
-        text,
-        choice,
-        file
-    };
+    enum class Kind { box, confirm, confirm_or_cancel, text, choice, file };
     struct Line
     {
         Kind kind;
