@@ -4,15 +4,30 @@ namespace kindrel::people {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+/// One statement, whatever the number of memberships.
+void close_entries(core::Session& session, const std::vector<Membership>& left, const core::Date& date)
+{
+    if (left.empty())
+        return;
+    std::vector<std::vector<core::Value>> rows;
+    for (qint64 place = 0; const auto& [person, group] : left)
+        rows.push_back({++place, core::to_value(person), core::to_value(group)});
+    session.fill_temporary(u"work_left"_s, {u"place"_s, u"person_id"_s, u"group_id"_s}, rows);
+    session.execute(u"UPDATE [tbl_group_history] SET [date_out]=?, [completed]=-1 WHERE [history_id] IN "
+                    "(SELECT h.[history_id] FROM [work_left] w INNER JOIN [tbl_group_history] h "
+                    "ON h.[person_id]=w.[person_id] AND h.[group_id]=w.[group_id] WHERE h.[completed]=0);"_s,
+                    date);
+}
+
+} // namespace
+
 void write_group_history(core::Session& session, const std::vector<Membership>& joined,
                          const std::vector<Membership>& left, const QDate& today)
 {
     const auto date = core::Date::from(today);
-    for (const auto& [person, group] : left) {
-        session.execute(u"UPDATE [tbl_group_history] SET [date_out]=?, [completed]=-1 "
-                        "WHERE [person_id]=? AND [group_id]=? AND [completed]=0;"_s,
-                        date, person, group);
-    }
+    close_entries(session, left, date);
     if (joined.empty())
         return;
     int key = session.allocate(core::Entity::history, static_cast<int>(joined.size()));

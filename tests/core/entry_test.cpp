@@ -6,6 +6,8 @@
 #include <QCoreApplication>
 #include <QFile>
 
+#include <algorithm>
+
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
@@ -35,7 +37,8 @@ struct Refusal
     QString sentence, explanation = {};
 };
 
-std::vector<Refusal> refusals()
+/// Where people work, refused while their setup is open.
+std::vector<Refusal> working_refusals()
 {
     const auto setup = [](AreaId area, AreaCode code, const QString& held, const QString& sentence) {
         return Refusal{area, LockKind::area, code, held, sentence, being_set_up};
@@ -65,6 +68,15 @@ std::vector<Refusal> refusals()
               u"Unable to enter the Wardline program as another user is in the setup area of Kindrel"_s),
         setup(AreaId::wardline, AreaCode::wardline_setup, u"Wardline setup area"_s,
               u"Unable to enter the Wardline program as another user is in the setup area of Kindrel"_s),
+    };
+}
+
+/// What only one person may do, and setups refused while somebody works with what they set up.
+std::vector<Refusal> exclusive_refusals()
+{
+    const QString in_setup = u"Setup area"_s;
+    const QString in_projects = u"Roll/Finance/Weekly setup area"_s;
+    return {
         {AreaId::visitation, LockKind::area, AreaCode::visitation, u"Visitation area"_s,
          u"Unable to enter the Visitation area as another user is working on the Visitation notes"_s,
          u"To insure the integrity of your data files only one user at a time is allowed to work on the Visitation "
@@ -142,7 +154,9 @@ KINDREL_ON_BOTH_ENGINES(EntryTest);
 
 TEST_P(EntryTest, AnAreaIsRefusedWhileALockStandsInItsWayAndOpenOnceItIsReleased)
 {
-    for (const auto& refusal : refusals()) {
+    auto refusals = working_refusals();
+    std::ranges::copy(exclusive_refusals(), std::back_inserter(refusals));
+    for (const auto& refusal : refusals) {
         SCOPED_TRACE(refusal.sentence.toStdString());
         ASSERT_TRUE(there->locks.take(refusal.kind, refusal.key));
         QStringList beneath{refusal.explanation,
