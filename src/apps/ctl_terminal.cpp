@@ -106,7 +106,10 @@ std::optional<QString> TerminalDialogue::password()
     const auto typed = m_in.readLine();
     if (m_attended)
         m_err << Qt::endl;
-    return typed.isNull() ? std::nullopt : std::optional(typed);
+    if (!typed.isNull())
+        return typed;
+    show({u"This church asks for a password: name its file with --password-file, or give it on standard input."_s});
+    return std::nullopt;
 }
 
 std::optional<int> TerminalDialogue::choose(const core::Message& message, const QStringList& from)

@@ -9,4 +9,4 @@ namespace kindrel::desktop {
 /// The areas that the program has, in the order of the rail; the first is home.
 [[nodiscard]] std::span<const AreaDefinition> all_areas();
 
-}
+} // namespace kindrel::desktop

@@ -34,7 +34,7 @@ QStringList offered(const core::Office& office)
     return names;
 }
 
-}
+} // namespace
 
 void load_another_church(Desk& desk)
 {
@@ -53,4 +53,4 @@ void mark_as_set_up(const core::Office& office)
         core::write_side_file(office.paths, mark);
 }
 
-}
+} // namespace kindrel::desktop

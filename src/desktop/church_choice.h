@@ -9,4 +9,4 @@ void load_another_church(Desk& desk);
 /// Leaves the mark by which start-up counts the office's church as set up. Training and booked-out data have none.
 void mark_as_set_up(const core::Office& office);
 
-}
+} // namespace kindrel::desktop

@@ -35,7 +35,8 @@ void Running::build()
     const int appearance = m_remembered->common_value(u"appearance"_s, int(Appearance::desktop)).toInt();
     m_surroundings.look.apply(Appearance(appearance), m_remembered->common_value(u"text_percent"_s, 100).toInt());
     m_windows = std::make_unique<Windows>(*m_remembered);
-    m_desk.reset(new Desk{*m_office, m_surroundings.progress, *m_remembered, *m_windows, m_surroundings.printing, *this});
+    m_desk.reset(
+        new Desk{*m_office, m_surroundings.progress, *m_remembered, *m_windows, m_surroundings.printing, *this});
     m_window = std::make_unique<MainWindow>(*m_desk, all_areas(), m_surroundings.look);
     connect(m_window.get(), &MainWindow::closed, this, [this] {
         m_windows.reset();
@@ -68,7 +69,8 @@ void Running::open_area(const QString& key)
 
 void Running::load_church(int church)
 {
-    QMetaObject::invokeMethod(this, [this, church] { switch_to(church); }, Qt::QueuedConnection);
+    QMetaObject::invokeMethod(
+        this, [this, church] { switch_to(church); }, Qt::QueuedConnection);
 }
 
 void Running::switch_to(int church)
@@ -87,4 +89,4 @@ void Running::switch_to(int church)
         m_surroundings.ended();
 }
 
-}
+} // namespace kindrel::desktop

@@ -20,7 +20,7 @@ struct Surroundings
     core::Progress& progress;
     Printing& printing;
     Look& look;
-    QString data_drive; ///< As of StartRequest.
+    QString data_drive;                                   ///< As of StartRequest.
     std::function<void(const core::Office&)> opened = {}; ///< An office is open; its screens come next.
     std::function<void()> ended = {};                     ///< The program is to end.
 };
@@ -57,4 +57,4 @@ private:
     std::unique_ptr<MainWindow> m_window;
 };
 
-}
+} // namespace kindrel::desktop

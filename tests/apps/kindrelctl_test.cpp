@@ -1,4 +1,5 @@
-#include "core/sqlite_session.h"
+#include "core/security_setup.h"
+#include "support/data_folder.h"
 
 #include <QDir>
 #include <QFile>
@@ -69,6 +70,24 @@ protected:
         ASSERT_EQ(installed.status, 0) << installed;
         const auto made = run({u"make-church"_s, u"--families"_s, QString::number(families), u"--seed"_s, u"7"_s});
         ASSERT_EQ(made.status, 0) << made;
+    }
+    /// The password "finder" may look for families, "keeper" may set up passwords.
+    void switch_security_on()
+    {
+        FakeWorkstation workstation;
+        workstation.drive = drive.path();
+        ScriptedDialogue dialogue;
+        FixedClock clock;
+        core::SilentProgress progress;
+        const auto office = core::start_up({core::Purpose::command_line}, workstation, dialogue, clock, progress);
+        ASSERT_TRUE(office);
+        auto setup = core::SecuritySetup::open(*office);
+        ASSERT_TRUE(setup);
+        setup->switch_on(true);
+        ASSERT_TRUE(setup->set_area(setup->add(u"finder"_s).value(), core::Area::search_for_family, true));
+        ASSERT_TRUE(setup->set_area(setup->add(u"keeper"_s).value(), core::Area::security, true));
+        dialogue.expect_box(u"Security will become operational the next time a user enters Kindrel"_s);
+        ASSERT_TRUE(setup->leave());
     }
     [[nodiscard]] QJsonArray list(const QStringList& words)
     {
@@ -227,20 +246,33 @@ TEST_F(KindrelctlTest, WhatCannotBeFoundIsRefusedWithAMessageOnStandardError)
     EXPECT_FALSE(QFile::exists(pdf()));
 }
 
-TEST_F(KindrelctlTest, AChurchWithSecurityShowsNothingToWhomeverHasNoRights)
+TEST_F(KindrelctlTest, AChurchWithSecurityShowsNothingWithoutItsPassword)
 {
     make_church(2);
-    const auto key = QString::number(list({u"families"_s}).first()[u"surname_id"_s].toInt());
-    core::open_sqlite(drive.filePath(u"Kindrel_10_Data/church1/KR10_records.kdl"_s))
-        ->execute(u"UPDATE [tbl_startup] SET [Security]=?;"_s, true);
-    const std::vector<QStringList> commands{
-        {u"totals"_s}, {u"families"_s}, {u"family"_s, key}, {u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}};
-    for (const auto& words : commands) {
+    switch_security_on();
+
+    for (const auto& words : {QStringList{u"totals"_s}, {u"families"_s}, {u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}}) {
         const auto ended = run(words);
         EXPECT_EQ(ended.status, 1) << ended;
-        EXPECT_TRUE(ended.err.contains("does not give access")) << ended;
+        EXPECT_TRUE(ended.err.contains("This church asks for a password")) << ended;
         EXPECT_TRUE(ended.out.isEmpty()) << ended;
     }
+}
+
+TEST_F(KindrelctlTest, APasswordOpensItsOwnAreasAlone)
+{
+    make_church(2);
+    switch_security_on();
+    const auto file = drive.filePath(u"password"_s);
+    QFile written(file);
+    ASSERT_TRUE(written.open(QFile::WriteOnly) && written.write("finder\n") > 0);
+    written.close();
+
+    const auto totals = run({u"totals"_s, u"--password-file"_s, file});
+    EXPECT_EQ(totals.status, 0) << totals;
+    const auto report = run({u"report"_s, u"k10"_s, u"--pdf"_s, pdf(), u"--password-file"_s, file});
+    EXPECT_EQ(report.status, 1) << report;
+    EXPECT_TRUE(report.err.contains("\"Report Outputs\"")) << report;
     EXPECT_FALSE(QFile::exists(pdf()));
 }
 

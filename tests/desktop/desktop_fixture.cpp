@@ -32,7 +32,9 @@ void DesktopTest::begin_again()
                                                                        .printing = printing,
                                                                        .look = look,
                                                                        .data_drive = {},
-                                                                       .ended = [this] { ++ended; }});
+                                                                       .ended = [this] {
+                                                                           ++ended;
+                                                                       }});
     if (!running->start(1))
         throw std::runtime_error("The program does not start");
     settle();

@@ -8,6 +8,7 @@
 #include <QLineEdit>
 #include <QListWidget>
 #include <QMessageBox>
+#include <QProgressDialog>
 #include <QPushButton>
 
 namespace kindrel::test {
@@ -50,7 +51,9 @@ protected:
 
     std::chrono::milliseconds now{0};
     bool closed_by_answer = false;
-    desktop::QtDialogue dialogue{[this] { return now; }};
+    desktop::QtDialogue dialogue{[this] {
+        return now;
+    }};
 };
 
 const core::Message question{u"Please confirm you wish to delete Ben from the family file"_s, u"Ben has 3 groups."_s};
@@ -155,6 +158,30 @@ TEST_F(DialogueTest, ATypedAnswerIsKeptSecretWhereAsked)
     EXPECT_EQ(dialogue.ask_text(question, true), u"lantern"_s);
     when_asked_press(Qt::Key_Escape);
     EXPECT_EQ(dialogue.ask_text(question, false), std::nullopt);
+}
+
+TEST_F(DialogueTest, ALongRunIsCancelledOnlyAfterAsking)
+{
+    ScriptedDialogue script;
+    desktop::QtProgress progress(script, [this] { return now; });
+    const QString sure = u"Are you sure that you wish to cancel this report?"_s;
+    progress.begin(u"Directory 1"_s, 10, sure);
+    EXPECT_TRUE(progress.step(u"Adder"_s));
+    EXPECT_EQ(QApplication::activeModalWidget(), nullptr) << "a short run needs no box";
+
+    for (const auto answer : {Answer::no, Answer::yes}) {
+        now += 1s;
+        EXPECT_TRUE(progress.step(u"Naismith"_s));
+        auto* box = qobject_cast<QProgressDialog*>(QApplication::activeModalWidget());
+        ASSERT_NE(box, nullptr);
+        EXPECT_EQ(box->labelText(), u"Naismith"_s);
+        QTest::mouseClick(box->findChild<QPushButton*>(), Qt::LeftButton);
+        now += 1s;
+        script.expect_confirm(sure, answer, Answer::no);
+        EXPECT_EQ(progress.step({}), answer == Answer::no);
+    }
+    progress.end();
+    EXPECT_EQ(QApplication::activeModalWidget(), nullptr);
 }
 
 } // namespace kindrel::test

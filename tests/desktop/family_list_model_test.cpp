@@ -1,5 +1,6 @@
 #include "desktop/people/family_list_model.h"
 
+#include "desktop/people/status_words.h"
 #include "desktop/shell/table_text.h"
 
 #include <gtest/gtest.h>
@@ -26,8 +27,8 @@ AddressBookEntry entry(int key, const QString& surname, const QString& name, con
 
 std::vector<AddressBookEntry> some_families()
 {
-    return {entry(1, u"de la Cruz"_s, u"Begoña"_s, u"Pepperwood"_s), entry(2, u"Hannan"_s, u"Lee"_s, u"Ann Bay"_s),
-            entry(3, u"Naismith"_s, u"Ann"_s, u"Ironstone"_s),      entry(4, u"O'Brien"_s, u"Zoë"_s, u"Ironstone"_s),
+    return {entry(1, u"de la Cruz"_s, u"Begoña"_s, u"Pepperwood"_s),  entry(2, u"Hannan"_s, u"Lee"_s, u"Ann Bay"_s),
+            entry(3, u"Naismith"_s, u"Ann"_s, u"Ironstone"_s),        entry(4, u"O'Brien"_s, u"Zoë"_s, u"Ironstone"_s),
             entry(5, u"Smith-Jones"_s, u"Anna"_s, u"Heron's Rest"_s), entry(6, u"Žižek"_s, u"Jan"_s, u"Dry Willow"_s)};
 }
 
@@ -77,7 +78,8 @@ TEST(FamilyListModel, TypingOnNarrowsSixtyThousandFamiliesToTheSameAsTypingItAtO
 {
     std::vector<AddressBookEntry> many;
     for (int key = 0; key < 60'000; ++key)
-        many.push_back(entry(key, u"Family%1"_s.arg(key % 7919), u"Name%1"_s.arg(key % 31), u"Suburb%1"_s.arg(key % 97)));
+        many.push_back(
+            entry(key, u"Family%1"_s.arg(key % 7919), u"Name%1"_s.arg(key % 31), u"Suburb%1"_s.arg(key % 97)));
     FamilyListModel model;
     model.set_entries(many);
 

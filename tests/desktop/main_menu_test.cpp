@@ -1,3 +1,4 @@
+#include "desktop/areas.h"
 #include "desktop/desktop_fixture.h"
 #include "desktop/output/preview_window.h"
 #include "desktop/people/family_card.h"
@@ -25,8 +26,8 @@ people::FamilyFile with_status(people::FamilyFile file, FileStatus status)
 
 std::vector<people::FamilyFile> some_families()
 {
-    return {family(u"Adder"_s, {u"Una"_s}), family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s}),
-            family(u"Nash"_s, {u"Carl"_s}), with_status(family(u"Old"_s, {u"Olga"_s}), FileStatus::archive)};
+    return {family(u"Adder"_s, {u"Una"_s}), family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s}), family(u"Nash"_s, {u"Carl"_s}),
+            with_status(family(u"Old"_s, {u"Olga"_s}), FileStatus::archive)};
 }
 
 class MainMenuTest : public DesktopTest
@@ -131,6 +132,17 @@ TEST_F(MainMenuTest, TheListAsItStandsIsPrinted)
     const QStringList texts = pages::texts_of(previews[0]->document().page(1), 1);
     EXPECT_TRUE(texts.contains(u"Nash"_s));
     EXPECT_FALSE(texts.contains(u"Adder"_s));
+}
+
+TEST_F(MainMenuTest, WithoutTheRightToFindFamiliesNoneAreListed)
+{
+    begin(some_families());
+    desk().office.rights.set(core::Area::fast_find, false);
+    desk().office.rights.set(core::Area::search_for_family, false);
+    desktop::MainWindow other(desk(), desktop::all_areas(), look);
+    other.show();
+    EXPECT_EQ(child<QTableView>(other, u"families"_s).model()->rowCount(), 0);
+    EXPECT_TRUE(visible_texts(other).contains(u"Your password does not open the list of families"_s));
 }
 
 TEST_F(MainMenuTest, FindFamilyComesBackToTheFilterFromAnyWindow)

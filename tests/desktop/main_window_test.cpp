@@ -1,5 +1,5 @@
-#include "desktop/desktop_fixture.h"
 #include "desktop/areas.h"
+#include "desktop/desktop_fixture.h"
 #include "desktop/output/page_view.h"
 #include "desktop/output/preview_window.h"
 #include "desktop/shell/page.h"
@@ -95,7 +95,8 @@ TEST_F(MainWindowTest, WhatTheScreensLookLikeIsRememberedWithoutAnyName)
     press(window(), Qt::Key_P, Qt::ControlModifier);
     EXPECT_EQ(desk().windows.all<desktop::PreviewWindow>().at(0)->view().zoom().percent, 150);
     running.reset();
-    const QByteArray kept = DataFolder::read(place.data.paths().folder(core::Folder::local_settings) + u"desktop.ini"_s);
+    const QByteArray kept =
+        DataFolder::read(place.data.paths().folder(core::Folder::local_settings) + u"desktop.ini"_s);
     EXPECT_FALSE(kept.contains("Naismith"));
 }
 

@@ -141,9 +141,8 @@ TEST_F(PreviewTest, TheFirstPageCanBeReadWhileTheOthersAreBeingMade)
 {
     begin();
     QList<int> shown;
-    PreviewWindow& preview = open(pages_of(3, [&](int) {
-        shown += desk().windows.all<PreviewWindow>().at(0)->view().number();
-    }));
+    PreviewWindow& preview =
+        open(pages_of(3, [&](int) { shown += desk().windows.all<PreviewWindow>().at(0)->view().number(); }));
     // A page is finished once the next one begins.
     EXPECT_EQ(shown, QList<int>({0, 1, 1}));
     EXPECT_EQ(preview.document().page_count(), 3);

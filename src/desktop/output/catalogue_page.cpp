@@ -23,7 +23,7 @@ namespace {
 constexpr int key_role = Qt::UserRole;
 constexpr int tree_width = 320;
 
-}
+} // namespace
 
 CataloguePage::CataloguePage(Desk& desk)
     : Page(u"Create Reports and Data Analysis"_s), m_desk(desk), m_tree(new QTreeWidget), m_leaf(make_heading({})),
@@ -33,7 +33,7 @@ CataloguePage::CataloguePage(Desk& desk)
     m_tree->setObjectName(u"catalogue"_s);
     m_tree->setAccessibleName(u"Reports"_s);
     m_tree->setHeaderHidden(true);
-    m_tree->setFixedWidth(tree_width);
+    keep_width(*m_tree, tree_width);
     m_tree->installEventFilter(this);
     connect(m_tree, &QTreeWidget::currentItemChanged, this, &CataloguePage::show_chosen);
     connect(m_tree, &QTreeWidget::itemDoubleClicked, this, &CataloguePage::open_chosen);
@@ -121,4 +121,4 @@ bool CataloguePage::eventFilter(QObject* target, QEvent* event)
     return Page::eventFilter(target, event);
 }
 
-}
+} // namespace kindrel::desktop

@@ -36,4 +36,4 @@ private:
     QLabel* m_description;
 };
 
-}
+} // namespace kindrel::desktop

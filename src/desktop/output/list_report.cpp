@@ -43,7 +43,7 @@ bool write_rows(pages::Table& table, const std::vector<QStringList>& rows, core:
     return true;
 }
 
-}
+} // namespace
 
 void print_list(Desk& desk, const QString& title, const QAbstractItemModel& model)
 {
@@ -64,4 +64,4 @@ void print_list(Desk& desk, const QString& title, const QAbstractItemModel& mode
     open_preview(desk, title, write);
 }
 
-}
+} // namespace kindrel::desktop

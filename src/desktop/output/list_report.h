@@ -9,4 +9,4 @@ namespace kindrel::desktop {
 /// Shows any list of the screen as a printable table in a preview of its own.
 void print_list(Desk& desk, const QString& title, const QAbstractItemModel& model);
 
-}
+} // namespace kindrel::desktop

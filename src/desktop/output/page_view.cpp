@@ -32,7 +32,7 @@ int neighbour(int percent, bool larger)
     return next == zoom_steps.begin() ? Zoom::least : *(next - 1);
 }
 
-}
+} // namespace
 
 PageView::PageView(const pages::PageSpool& spool, QWidget* parent) : QAbstractScrollArea(parent), m_spool(spool)
 {
@@ -196,4 +196,4 @@ void PageView::wheelEvent(QWheelEvent* event)
         bar.setValue(bar.maximum());
 }
 
-}
+} // namespace kindrel::desktop

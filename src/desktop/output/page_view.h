@@ -72,4 +72,4 @@ private:
     std::vector<pages::Found> m_marks;
 };
 
-}
+} // namespace kindrel::desktop

@@ -34,7 +34,7 @@ constexpr std::array zoom_choices{
 
 constexpr int find_width = 170;
 
-}
+} // namespace
 
 PreviewBar::PreviewBar(QWidget* parent)
     : QToolBar(u"Preview"_s, parent), m_page(new QSpinBox), m_zoom(new QComboBox), m_find(new QLineEdit)
@@ -176,4 +176,4 @@ bool PreviewBar::eventFilter(QObject* target, QEvent* event)
     return true;
 }
 
-}
+} // namespace kindrel::desktop

@@ -51,4 +51,4 @@ private:
     QAction* m_pdf = nullptr;
 };
 
-}
+} // namespace kindrel::desktop

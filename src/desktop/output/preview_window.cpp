@@ -1,5 +1,6 @@
 #include "desktop/output/preview_window.h"
 
+#include "core/files.h"
 #include "desktop/output/preview_bar.h"
 #include "desktop/output/run_strip.h"
 #include "desktop/output/thumbnails.h"
@@ -7,7 +8,6 @@
 #include "desktop/shell/note_bar.h"
 #include "desktop/shell/only_window.h"
 #include "desktop/shell/printing.h"
-#include "core/files.h"
 #include "pages/pdf.h"
 
 #include <QApplication>
@@ -36,7 +36,7 @@ void keep(Remembered& remembered, Zoom zoom)
     remembered.keep(u"preview/percent"_s, zoom.percent);
 }
 
-}
+} // namespace
 
 PreviewWindow::PreviewWindow(Desk& desk, const QString& title)
     : m_desk(desk), m_bar(new PreviewBar), m_note(new NoteBar), m_thumbnails(new Thumbnails(m_spool)),
@@ -176,12 +176,12 @@ void PreviewWindow::save_pdf()
         return;
     const auto file = m_desk.office.dialogue.choose_file({.title = u"Save as PDF"_s,
                                                           .filter = u"PDF (*.pdf)"_s,
-                                                          .suggested = windowTitle() + u".pdf"_s,
+                                                          .suggested = windowTitle().replace(u'/', u'-') + u".pdf"_s,
                                                           .kind = core::FileQuestion::Kind::save});
     if (!file)
         return;
     try {
-        if (pages::write_pdf(m_spool, *file, {windowTitle(), core::product.toString()},&m_desk.progress))
+        if (pages::write_pdf(m_spool, *file, {windowTitle(), core::product.toString()}, &m_desk.progress))
             m_note->say(u"Saved as %1"_s.arg(*file));
     } catch (const core::FileError& error) {
         m_desk.office.dialogue.show({u"The document could not be saved."_s, error.text()});
@@ -202,7 +202,8 @@ void open_preview(Desk& desk, const QString& title, const Producer& produce)
 {
     auto* window = new PreviewWindow(desk, title);
     desk.windows.open(window, first_size);
-    QMetaObject::invokeMethod(window, [window, produce] { window->run(produce); }, Qt::QueuedConnection);
+    QMetaObject::invokeMethod(
+        window, [window, produce] { window->run(produce); }, Qt::QueuedConnection);
 }
 
-}
+} // namespace kindrel::desktop

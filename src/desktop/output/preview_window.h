@@ -60,4 +60,4 @@ private:
 /// Opens a preview and fills it once the caller has returned.
 void open_preview(Desk& desk, const QString& title, const Producer& produce);
 
-}
+} // namespace kindrel::desktop

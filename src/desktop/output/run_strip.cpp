@@ -17,7 +17,7 @@ namespace {
 constexpr int refresh_ms = 40;
 constexpr int bar_width = 220;
 
-}
+} // namespace
 
 RunStrip::RunStrip(core::Dialogue& dialogue, QWidget* parent)
     : QWidget(parent), m_dialogue(dialogue), m_what(new QLabel), m_bar(new QProgressBar),
@@ -76,4 +76,4 @@ void RunStrip::end()
     hide();
 }
 
-}
+} // namespace kindrel::desktop

@@ -39,4 +39,4 @@ private:
     QElapsedTimer m_shown;
 };
 
-}
+} // namespace kindrel::desktop

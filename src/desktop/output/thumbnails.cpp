@@ -43,7 +43,7 @@ public:
     }
 };
 
-}
+} // namespace
 
 ThumbnailModel::ThumbnailModel(const pages::PageSpool& spool, QObject* parent)
     : QAbstractListModel(parent), m_spool(spool), m_pictures(pictures_kept)
@@ -123,4 +123,4 @@ void Thumbnails::show_page(int number)
         setCurrentIndex(index);
 }
 
-}
+} // namespace kindrel::desktop

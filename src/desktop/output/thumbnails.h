@@ -49,4 +49,4 @@ private:
     ThumbnailModel* m_model;
 };
 
-}
+} // namespace kindrel::desktop

@@ -144,7 +144,10 @@ using Address = people::Address;
 constexpr std::array residential{
     FamilyField{"Street", address_text<&Address::res_street>, address_hidden<&Address::res_hidden>},
     FamilyField{"", address_text<&Address::res_street2>},
-    FamilyField{"Suburb", [](const FamilyFile& file, const CardReader&) { return suburb_text(file.residential); }},
+    FamilyField{"Suburb",
+                [](const FamilyFile& file, const CardReader&) {
+                    return suburb_text(file.residential);
+                }},
     FamilyField{"State", address_text<&Address::res_state>},
     FamilyField{"Country", address_text<&Address::res_country>},
     FamilyField{"Map", map_text},
@@ -153,7 +156,10 @@ constexpr std::array residential{
 constexpr std::array postal{
     FamilyField{"Street", address_text<&Address::post_street>, address_hidden<&Address::post_hidden>},
     FamilyField{"", address_text<&Address::post_street2>},
-    FamilyField{"Suburb", [](const FamilyFile& file, const CardReader&) { return suburb_text(file.postal); }},
+    FamilyField{"Suburb",
+                [](const FamilyFile& file, const CardReader&) {
+                    return suburb_text(file.postal);
+                }},
     FamilyField{"State", address_text<&Address::post_state>},
     FamilyField{"Country", address_text<&Address::post_country>},
 };
@@ -190,7 +196,7 @@ constexpr std::array reach{
     PersonField{"PIN", pin_text},
 };
 
-}
+} // namespace
 
 std::span<const FamilyField> residential_fields()
 {
@@ -217,4 +223,4 @@ std::span<const PersonField> reach_fields()
     return reach;
 }
 
-}
+} // namespace kindrel::desktop

@@ -25,7 +25,7 @@ QStringList words_of(const std::vector<const char*>& columns)
     return words;
 }
 
-}
+} // namespace
 
 QString closed_words()
 {
@@ -78,4 +78,4 @@ void CardListView::show_closed()
     say(closed_words());
 }
 
-}
+} // namespace kindrel::desktop

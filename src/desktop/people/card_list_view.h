@@ -31,4 +31,4 @@ private:
 /// Instead of a section that booking has closed.
 [[nodiscard]] QString closed_words();
 
-}
+} // namespace kindrel::desktop

@@ -46,8 +46,9 @@ CardRows item_rows(const Of& of, const CardReader&)
 template <auto Links, class Of>
 CardRows dated_rows(const Of& of, const CardReader& reader)
 {
-    return rows_from(of.*Links,
-                     [&](const LinkRow& row) { return QStringList{row.text, shown(row.date, reader), tagged(row)}; });
+    return rows_from(of.*Links, [&](const LinkRow& row) {
+        return QStringList{row.text, shown(row.date, reader), tagged(row)};
+    });
 }
 
 CardRows ministry_rows(const Person& person, const CardReader&)
@@ -91,13 +92,20 @@ struct Section
 };
 
 constexpr std::array sections{
-    Section{"Address", &RecordAccess::Address},           Section{"Details", &RecordAccess::Details},
-    Section{"Status", &RecordAccess::status},             Section{"Groups", &RecordAccess::groups},
-    Section{"Ministries", &RecordAccess::ministry},       Section{"Dates", &RecordAccess::date},
-    Section{"Flexi fields", &RecordAccess::flexi},        Section{"Other contacts", &RecordAccess::contact},
-    Section{"Visitation", &RecordAccess::visitation},     Section{"Family groups", &RecordAccess::family_group},
-    Section{"Family dates", &RecordAccess::family_date},  Section{"Occupations", &RecordAccess::occupation},
-    Section{"Family events", &RecordAccess::events},      Section{"PIN", &RecordAccess::pin},
+    Section{"Address", &RecordAccess::Address},
+    Section{"Details", &RecordAccess::Details},
+    Section{"Status", &RecordAccess::status},
+    Section{"Groups", &RecordAccess::groups},
+    Section{"Ministries", &RecordAccess::ministry},
+    Section{"Dates", &RecordAccess::date},
+    Section{"Flexi fields", &RecordAccess::flexi},
+    Section{"Other contacts", &RecordAccess::contact},
+    Section{"Visitation", &RecordAccess::visitation},
+    Section{"Family groups", &RecordAccess::family_group},
+    Section{"Family dates", &RecordAccess::family_date},
+    Section{"Occupations", &RecordAccess::occupation},
+    Section{"Family events", &RecordAccess::events},
+    Section{"PIN", &RecordAccess::pin},
 };
 
 CardRows access_rows(const FamilyFile& file, const CardReader&)
@@ -108,7 +116,7 @@ CardRows access_rows(const FamilyFile& file, const CardReader&)
     return rows;
 }
 
-}
+} // namespace
 
 const std::vector<PersonCardList>& group_lists()
 {
@@ -145,8 +153,7 @@ const std::vector<FamilyCardList>& event_lists()
 
 const FamilyCardList& other_contact_list()
 {
-    static const FamilyCardList list{
-        "Other contacts", {"Contact", "Phone"}, contact_rows, &RecordAccess::contact};
+    static const FamilyCardList list{"Other contacts", {"Contact", "Phone"}, contact_rows, &RecordAccess::contact};
     return list;
 }
 
@@ -177,4 +184,4 @@ QString file_dates(const people::Family& family, core::DayOrder order)
     return words.join(u"   "_s);
 }
 
-}
+} // namespace kindrel::desktop

@@ -69,4 +69,4 @@ private:
     std::vector<Part> m_parts;
 };
 
-}
+} // namespace kindrel::desktop

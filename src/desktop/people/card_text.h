@@ -62,4 +62,4 @@ using PersonCardList = CardList<people::Person>;
 /// "File Created 12/03/2020   Last Edit 01/05/2024", as far as known.
 [[nodiscard]] QString file_dates(const people::Family& family, core::DayOrder order);
 
-}
+} // namespace kindrel::desktop

@@ -1,8 +1,8 @@
 #include "desktop/people/family_card.h"
 
-#include "desktop/people/family_list_model.h"
+#include "desktop/people/card_header.h"
 #include "desktop/people/portrait.h"
-#include "desktop/shell/chip.h"
+#include "desktop/people/status_words.h"
 #include "desktop/shell/help.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/note_bar.h"
@@ -11,7 +11,6 @@
 
 #include <QEvent>
 #include <QGridLayout>
-#include <QLabel>
 #include <QListWidget>
 #include <QShortcut>
 #include <QTabWidget>
@@ -24,17 +23,6 @@ namespace {
 
 constexpr QSize first_size{960, 640};
 constexpr int people_width = 210;
-
-/// The state that colours a person's name: the gravest of the flags.
-State state_of(const people::Person& person)
-{
-    return person.Decease    ? State::deceased
-           : person.archive  ? State::archive
-           : person.Privacy  ? State::privacy
-           : person.Prospect ? State::prospect
-           : person.contact  ? State::contact
-                             : State::plain;
-}
 
 /// Parts of a tab in `across` columns.
 QWidget* in_grid(const std::vector<QWidget*>& parts, int across)
@@ -53,17 +41,16 @@ QWidget* in_grid(const std::vector<QWidget*>& parts, int across)
     return tab;
 }
 
-}
+} // namespace
 
 FamilyCard::FamilyCard(Desk& desk, std::vector<int> surname_ids)
-    : m_desk(desk), m_surname_ids(std::move(surname_ids)), m_title(make_value()), m_dates(make_value()),
-      m_status(new Chip), m_booked_out(new Chip), m_note(new NoteBar), m_people(new QListWidget),
-      m_portrait(new Portrait)
+    : m_desk(desk), m_surname_ids(std::move(surname_ids)), m_header(new CardHeader), m_note(new NoteBar),
+      m_people(new QListWidget), m_portrait(new Portrait)
 {
     setObjectName(u"family_card"_s);
     m_people->setObjectName(u"people"_s);
     m_people->setAccessibleName(u"People of the family"_s);
-    m_people->setFixedWidth(people_width);
+    keep_width(*m_people, people_width);
     m_people->setWordWrap(true);
     m_people->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     connect(m_people, &QListWidget::currentRowChanged, this, &FamilyCard::show_person);
@@ -76,30 +63,11 @@ FamilyCard::FamilyCard(Desk& desk, std::vector<int> surname_ids)
     auto* column = new QVBoxLayout(this);
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(0);
-    column->addLayout(make_header());
+    column->addWidget(m_header);
     column->addWidget(m_note);
     column->addLayout(row, 1);
     add_keys();
     m_people->setFocus();
-}
-
-QBoxLayout* FamilyCard::make_header()
-{
-    dress(*m_title, TextSize::title);
-    m_title->setObjectName(u"title"_s);
-    m_title->setWordWrap(false);
-    dress(*m_dates, TextSize::secondary);
-    m_dates->setObjectName(u"dates"_s);
-    m_dates->setWordWrap(false);
-    auto* header = new QHBoxLayout;
-    header->setContentsMargins(space::group, space::margin, space::group, space::margin);
-    header->setSpacing(space::margin);
-    header->addWidget(m_title);
-    header->addWidget(m_status);
-    header->addWidget(m_booked_out);
-    header->addStretch(1);
-    header->addWidget(m_dates);
-    return header;
 }
 
 QTabWidget* FamilyCard::make_tabs()
@@ -143,9 +111,13 @@ QWidget* FamilyCard::make_person_tab()
     auto* row = new QHBoxLayout(tab);
     row->setContentsMargins(space::margin, space::margin, space::margin, space::margin);
     row->setSpacing(2 * space::group);
+    auto* forms = new QVBoxLayout;
+    forms->setSpacing(space::group);
+    forms->addWidget(names);
+    forms->addWidget(reach);
+    forms->addStretch(1);
     row->addWidget(m_portrait, 0, Qt::AlignTop);
-    row->addWidget(names, 1);
-    row->addWidget(reach, 1);
+    row->addLayout(forms, 1);
     return tab;
 }
 
@@ -197,10 +169,7 @@ void FamilyCard::show_family()
 {
     const auto order = m_desk.office.day_order();
     setWindowTitle(card_caption(m_file.family, order));
-    m_title->setText(m_file.family.surname);
-    m_dates->setText(file_dates(m_file.family, order));
-    m_status->set(status_word(m_file.family.Condition), desktop::state_of(m_file.family.Condition));
-    m_booked_out->set(people::booked_out_note(m_file.family, order).trimmed(), State::booked_out);
+    m_header->show_family(m_file.family, order);
     m_family.show(m_file, m_file.access, reader());
     show_people();
 }
@@ -243,8 +212,7 @@ void FamilyCard::show_person()
         return;
     const people::Person& person = m_file.people[std::size_t(row)];
     m_person.show(person, m_file.access, reader());
-    m_portrait->show_file(
-        m_desk.office.paths.file(core::Folder::portrait, u"%1.jpg"_s.arg(person.person_id)));
+    m_portrait->show_file(m_desk.office.paths.file(core::Folder::portrait, u"%1.jpg"_s.arg(person.person_id)));
 }
 
 void open_family_card(Desk& desk, const std::vector<int>& surname_ids, int place)
@@ -259,4 +227,4 @@ void open_family_card(Desk& desk, const std::vector<int>& surname_ids, int place
         desk.windows.open(card.release(), first_size);
 }
 
-}
+} // namespace kindrel::desktop

@@ -5,14 +5,12 @@
 
 #include <QWidget>
 
-class QBoxLayout;
-class QLabel;
 class QListWidget;
 class QTabWidget;
 
 namespace kindrel::desktop {
 
-class Chip;
+class CardHeader;
 class NoteBar;
 class Portrait;
 
@@ -33,7 +31,6 @@ protected:
     void changeEvent(QEvent* event) override;
 
 private:
-    [[nodiscard]] QBoxLayout* make_header();
     [[nodiscard]] QTabWidget* make_tabs();
     [[nodiscard]] QWidget* make_family_tab();
     [[nodiscard]] QWidget* make_person_tab();
@@ -51,10 +48,7 @@ private:
     people::FamilyFile m_file;
     CardSections<people::FamilyFile> m_family;
     CardSections<people::Person> m_person;
-    QLabel* m_title;
-    QLabel* m_dates;
-    Chip* m_status;
-    Chip* m_booked_out;
+    CardHeader* m_header;
     NoteBar* m_note;
     QListWidget* m_people;
     Portrait* m_portrait;
@@ -63,4 +57,4 @@ private:
 /// Opens the card of the family at `place`, or brings it forward where it is open already.
 void open_family_card(Desk& desk, const std::vector<int>& surname_ids, int place);
 
-}
+} // namespace kindrel::desktop

@@ -32,7 +32,7 @@ bool moves_in_list(int key)
     return key == Qt::Key_Down || key == Qt::Key_Up || key == Qt::Key_PageDown || key == Qt::Key_PageUp;
 }
 
-}
+} // namespace
 
 FamilyListWidget::FamilyListWidget(Desk& desk, QWidget* parent)
     : QWidget(parent), m_desk(desk), m_model(new FamilyListModel(this)), m_selector(new QComboBox),
@@ -40,6 +40,7 @@ FamilyListWidget::FamilyListWidget(Desk& desk, QWidget* parent)
 {
     for (int list = 0; list < people::family_list_count; ++list)
         m_selector->addItem(people::family_list_name(people::FamilyList(list)));
+    m_selector->setCurrentIndex(int(people::FamilyList::active));
     m_selector->setObjectName(u"family_list"_s);
     m_selector->setAccessibleName(u"Which families"_s);
     connect(m_selector, &QComboBox::currentIndexChanged, this, [this] { reload(); });
@@ -103,9 +104,15 @@ void FamilyListWidget::reload()
 {
     const int family = chosen_family();
     auto& office = m_desk.office;
-    m_model->set_entries(people::read_address_book(*office.session, list(), office.settings.use_preferred_names));
+    if (may_list())
+        m_model->set_entries(people::read_address_book(*office.session, list(), office.settings.use_preferred_names));
     select(std::max(0, m_model->row_of(family)));
     show_outcome();
+}
+
+bool FamilyListWidget::may_list() const
+{
+    return m_desk.office.may(core::Area::fast_find) || m_desk.office.may(core::Area::search_for_family);
 }
 
 void FamilyListWidget::focus_filter()
@@ -146,7 +153,9 @@ void FamilyListWidget::open_chosen()
 void FamilyListWidget::show_outcome()
 {
     const bool none = m_model->rowCount() == 0;
-    if (none && m_model->total() > 0)
+    if (!may_list())
+        m_empty->say(u"Your password does not open the list of families"_s, {});
+    else if (none && m_model->total() > 0)
         m_empty->say(u"No family answers to \u201c%1\u201d"_s.arg(m_filter->text()),
                      u"Shorten the words, or choose another list beside them."_s);
     else if (none)
@@ -182,4 +191,4 @@ bool FamilyListWidget::eventFilter(QObject* target, QEvent* event)
     return QWidget::eventFilter(target, event);
 }
 
-}
+} // namespace kindrel::desktop

@@ -15,7 +15,7 @@ namespace kindrel::desktop {
 class EmptyPanel;
 
 /// Families to choose from: a selector, a filter that narrows as one types, and the list. Down leads from the filter
-/// into the list, Enter opens.
+/// into the list, Enter opens. Nothing is read before the first reload() or choose().
 class FamilyListWidget : public QWidget
 {
     Q_OBJECT
@@ -42,6 +42,7 @@ protected:
     bool eventFilter(QObject* target, QEvent* event) override;
 
 private:
+    [[nodiscard]] bool may_list() const;
     void set_up_view();
     void set_up_filter();
     void typed(const QString& text);
@@ -59,4 +60,4 @@ private:
     EmptyPanel* m_empty;
 };
 
-}
+} // namespace kindrel::desktop

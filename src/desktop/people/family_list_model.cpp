@@ -1,5 +1,7 @@
 #include "desktop/people/family_list_model.h"
 
+#include "desktop/people/family_search.h"
+#include "desktop/people/status_words.h"
 #include "people/sort_key.h"
 
 #include <QApplication>
@@ -11,7 +13,6 @@ namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
 using people::AddressBookEntry;
-using people::FileStatus;
 
 namespace {
 
@@ -22,97 +23,26 @@ struct ColumnDefinition
 };
 
 constexpr std::array<ColumnDefinition, FamilyListModel::column_count> columns{{
-    {"Name", [](const AddressBookEntry& entry) { return entry.surname; }},
-    {"First name", [](const AddressBookEntry& entry) { return entry.name; }},
-    {"Suburb", [](const AddressBookEntry& entry) { return entry.suburb; }},
-    {"Phone", [](const AddressBookEntry& entry) { return entry.phone; }},
+    {"Name",
+     [](const AddressBookEntry& entry) {
+         return entry.surname;
+     }},
+    {"First name",
+     [](const AddressBookEntry& entry) {
+         return entry.name;
+     }},
+    {"Suburb",
+     [](const AddressBookEntry& entry) {
+         return entry.suburb;
+     }},
+    {"Phone",
+     [](const AddressBookEntry& entry) {
+         return entry.phone;
+     }},
     {"Status", status_words},
 }};
 
-struct StatusLook
-{
-    FileStatus status;
-    const char* word;
-    State state;
-};
-
-constexpr std::array status_looks{
-    StatusLook{FileStatus::active, "Active", State::plain},
-    StatusLook{FileStatus::privacy, "Privacy", State::privacy},
-    StatusLook{FileStatus::prospect, "Prospect", State::prospect},
-    StatusLook{FileStatus::archive, "Archive", State::archive},
-};
-
-const StatusLook& look_of(FileStatus status)
-{
-    const auto* found = std::find_if(status_looks.begin(), status_looks.end(),
-                                     [status](const StatusLook& look) { return look.status == status; });
-    return found == status_looks.end() ? status_looks.front() : *found;
-}
-
-constexpr std::array apostrophes{u'\'', u'\u2019'};
-
-/// With hyphens and stops as blanks, and each apostrophe as `apostrophe`.
-QString parted(QString folded, const QString& apostrophe)
-{
-    for (const QChar mark : {u'-', u',', u'.', u'(', u')'})
-        folded.replace(mark, u' ');
-    for (const QChar mark : apostrophes)
-        folded.replace(QString(mark), apostrophe);
-    return folded;
-}
-
-/// Folded words, each after a blank. An apostrophe parts two words and joins them too: "O'Brien" is found by "bri"
-/// and by "obr".
-QString search_words(const QString& text)
-{
-    const QString folded = people::sort_key(text);
-    const QString words = u' ' + parted(folded, u" "_s);
-    const QString joined = u' ' + parted(folded, {});
-    return words.size() == joined.size() ? words : words + joined;
-}
-
-/// The typed text as the words that must all be found.
-QStringList wanted_words(const QString& typed)
-{
-    QStringList words = parted(people::sort_key(typed), {}).split(u' ', Qt::SkipEmptyParts);
-    for (QString& word : words)
-        word.prepend(u' ');
-    return words;
-}
-
-/// Whether what passes `after` is sure to pass `before` too.
-bool narrows(const QStringList& before, const QStringList& after)
-{
-    return std::all_of(before.begin(), before.end(), [&after](const QString& old) {
-        return std::any_of(after.begin(), after.end(), [&old](const QString& word) { return word.startsWith(old); });
-    });
-}
-
-}
-
-QString status_words(const AddressBookEntry& entry)
-{
-    if (!entry.booked_out)
-        return status_word(entry.Condition);
-    const QString before = entry.Condition == FileStatus::active ? QString() : status_word(entry.Condition) + u' ';
-    return before + u"\u2192 Booked out"_s;
-}
-
-QString status_word(FileStatus status)
-{
-    return QString::fromLatin1(look_of(status).word);
-}
-
-State state_of(FileStatus status)
-{
-    return look_of(status).state;
-}
-
-State state_of(const AddressBookEntry& entry)
-{
-    return entry.booked_out ? State::booked_out : state_of(entry.Condition);
-}
+} // namespace
 
 void FamilyListModel::set_entries(std::vector<AddressBookEntry> entries)
 {
@@ -129,15 +59,15 @@ void FamilyListModel::set_entries(std::vector<AddressBookEntry> entries)
 
 bool FamilyListModel::matches(int entry) const
 {
-    const QString& words = m_search[std::size_t(entry)];
-    return std::all_of(m_words.begin(), m_words.end(), [&words](const QString& word) { return words.contains(word); });
+    return has_all(m_search[std::size_t(entry)], m_words);
 }
 
 void FamilyListModel::filter(std::span<const int> candidates)
 {
     std::vector<int> left;
     left.reserve(candidates.size());
-    std::copy_if(candidates.begin(), candidates.end(), std::back_inserter(left), [this](int one) { return matches(one); });
+    std::copy_if(candidates.begin(), candidates.end(), std::back_inserter(left),
+                 [this](int one) { return matches(one); });
     m_shown = std::move(left);
 }
 
@@ -170,7 +100,9 @@ void FamilyListModel::put_in_order()
     if (m_sort_column == surname && m_sort_order == Qt::AscendingOrder)
         return; // As they were read.
     const std::vector<QString> keys = order_keys(m_sort_column);
-    const auto key = [&keys](int entry) -> const QString& { return keys[std::size_t(entry)]; };
+    const auto key = [&keys](int entry) -> const QString& {
+        return keys[std::size_t(entry)];
+    };
     if (m_sort_order == Qt::AscendingOrder)
         std::ranges::stable_sort(m_order, std::ranges::less(), key);
     else
@@ -242,4 +174,4 @@ QVariant FamilyListModel::headerData(int section, Qt::Orientation orientation, i
     return {};
 }
 
-}
+} // namespace kindrel::desktop

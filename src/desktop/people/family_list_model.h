@@ -1,6 +1,5 @@
 #pragma once
 
-#include "desktop/shell/palette.h"
 #include "people/address_book.h"
 
 #include <QAbstractTableModel>
@@ -46,18 +45,12 @@ private:
     [[nodiscard]] std::vector<QString> order_keys(int column) const;
 
     std::vector<people::AddressBookEntry> m_entries;
-    std::vector<QString> m_search;  ///< Beside `m_entries`: its folded words, each after a blank.
-    std::vector<int> m_order;       ///< All entries as the sorting has them.
-    std::vector<int> m_shown;       ///< What of it the words leave.
-    QStringList m_words;            ///< Folded, each after a blank.
+    std::vector<QString> m_search; ///< Beside `m_entries`: its folded words, each after a blank.
+    std::vector<int> m_order;      ///< All entries as the sorting has them.
+    std::vector<int> m_shown;      ///< What of it the words leave.
+    QStringList m_words;           ///< Folded, each after a blank.
     int m_sort_column = surname;
     Qt::SortOrder m_sort_order = Qt::AscendingOrder;
 };
 
-/// What stands in the status column, and in which colour.
-[[nodiscard]] QString status_words(const people::AddressBookEntry& entry);
-[[nodiscard]] State state_of(const people::AddressBookEntry& entry);
-[[nodiscard]] State state_of(people::FileStatus status);
-[[nodiscard]] QString status_word(people::FileStatus status);
-
-}
+} // namespace kindrel::desktop

@@ -43,4 +43,4 @@ void FamilyTotals::mark(people::FamilyList list)
             link.button->setChecked(true);
 }
 
-}
+} // namespace kindrel::desktop

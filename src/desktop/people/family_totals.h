@@ -37,4 +37,4 @@ private:
     std::vector<Link> m_links;
 };
 
-}
+} // namespace kindrel::desktop

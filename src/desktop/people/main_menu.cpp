@@ -1,5 +1,6 @@
 #include "desktop/people/main_menu.h"
 
+#include "core/entry.h"
 #include "desktop/church_choice.h"
 #include "desktop/output/list_report.h"
 #include "desktop/people/family_card.h"
@@ -42,17 +43,26 @@ std::vector<Task> tasks_of(Desk& desk)
 {
     return {
         {u"reports"_s, u"Create Reports and Data Analysis"_s, u"Directories of the church's families."_s,
-         u"office-report"_s, core::Area::report_outputs, [&desk] { desk.navigation.open_area(u"reports"_s); }},
+         u"office-report"_s, core::Area::report_outputs,
+         [&desk] {
+             desk.navigation.open_area(u"reports"_s);
+         }},
         {u"load_church"_s, u"Load a New Church Database"_s,
-         u"Load a completely different and Independent database for keeping records."_s, u"document-open-folder"_s, std::nullopt,
-         [&desk] { load_another_church(desk); }},
+         u"Load a completely different and Independent database for keeping records."_s, u"document-open-folder"_s,
+         std::nullopt,
+         [&desk] {
+             load_another_church(desk);
+         }},
         {u"load_training"_s, u"Load Training Data"_s,
          u"Load sample church data to both learn how to use Kindrel and to experiment with."_s, u"view-presentation"_s,
-         std::nullopt, [&desk] { desk.navigation.load_church(core::training_church); }},
+         std::nullopt,
+         [&desk] {
+             desk.navigation.load_church(core::training_church);
+         }},
     };
 }
 
-}
+} // namespace
 
 MainMenu::MainMenu(Desk& desk) : Page(desk.office.church_name), m_desk(desk)
 {
@@ -65,7 +75,6 @@ MainMenu::MainMenu(Desk& desk) : Page(desk.office.church_name), m_desk(desk)
     row->addWidget(make_list(), 1);
     set_content(content);
     add_list_actions();
-    m_families->choose(FamilyList::active);
 }
 
 QWidget* MainMenu::make_side()
@@ -121,7 +130,8 @@ void MainMenu::add_list_actions()
     connect(print_list, &QAction::triggered, this, &MainMenu::print);
     auto* save = add_action(u"Save as CSV"_s, u"document-save"_s, u"Save this list as comma-separated text"_s);
     connect(save, &QAction::triggered, this, [this] {
-        save_as_csv(m_families->model(), people::family_list_name(m_families->list()), m_desk.office.dialogue);
+        if (core::permitted(m_desk.office, core::Area::export_text))
+            save_as_csv(m_families->model(), people::family_list_name(m_families->list()), m_desk.office.dialogue);
     });
 }
 
@@ -151,7 +161,8 @@ void MainMenu::find()
 
 void MainMenu::print()
 {
-    print_list(m_desk, people::family_list_name(m_families->list()), m_families->model());
+    if (core::permitted(m_desk.office, core::Area::report_outputs))
+        print_list(m_desk, people::family_list_name(m_families->list()), m_families->model());
 }
 
 void MainMenu::open(int row)
@@ -166,4 +177,4 @@ void MainMenu::changeEvent(QEvent* event)
         load_if_changed();
 }
 
-}
+} // namespace kindrel::desktop

@@ -39,7 +39,7 @@ private:
     Desk& m_desk;
     FamilyTotals* m_totals = nullptr;
     FamilyListWidget* m_families = nullptr;
-    qint64 m_change_mark = 0;
+    std::optional<qint64> m_change_mark; ///< Nothing until the first reading.
 };
 
-}
+} // namespace kindrel::desktop

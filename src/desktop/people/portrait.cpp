@@ -22,7 +22,7 @@ QImage read(const QString& file)
     return reader.read();
 }
 
-}
+} // namespace
 
 Portrait::Portrait(QWidget* parent) : QWidget(parent)
 {
@@ -33,10 +33,10 @@ Portrait::Portrait(QWidget* parent) : QWidget(parent)
 void Portrait::show_file(const QString& file)
 {
     const QImage picture = read(file);
-    m_picture = picture.isNull() ? QPixmap()
-                                 : QPixmap::fromImage(picture.scaled(frame * devicePixelRatio(),
-                                                                     Qt::KeepAspectRatioByExpanding,
-                                                                     Qt::SmoothTransformation));
+    m_picture = picture.isNull()
+                    ? QPixmap()
+                    : QPixmap::fromImage(picture.scaled(frame * devicePixelRatio(), Qt::KeepAspectRatioByExpanding,
+                                                        Qt::SmoothTransformation));
     setAccessibleName(empty() ? u"No photograph"_s : u"Photograph"_s);
     update();
 }
@@ -50,8 +50,9 @@ void Portrait::paintEvent(QPaintEvent*)
     painter.drawRoundedRect(QRectF(rect()).adjusted(0.5, 0.5, -0.5, -0.5), corner, corner);
     if (empty()) {
         constexpr int size = 48;
-        icon(u"user-identity"_s).paint(&painter, rect().adjusted((width() - size) / 2, 0, -(width() - size) / 2, 0),
-                                       Qt::AlignCenter, QIcon::Disabled);
+        icon(u"user-identity"_s)
+            .paint(&painter, rect().adjusted((width() - size) / 2, 0, -(width() - size) / 2, 0), Qt::AlignCenter,
+                   QIcon::Disabled);
         return;
     }
     const QSize seen = frame * devicePixelRatio();
@@ -59,4 +60,4 @@ void Portrait::paintEvent(QPaintEvent*)
     painter.drawPixmap(rect().adjusted(1, 1, -1, -1), m_picture, part);
 }
 
-}
+} // namespace kindrel::desktop

@@ -23,4 +23,4 @@ private:
     QPixmap m_picture;
 };
 
-}
+} // namespace kindrel::desktop

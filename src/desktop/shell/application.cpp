@@ -25,4 +25,4 @@ void Application::tell(const QString& what, const QString& why)
         m_dialogue->show({what, why});
 }
 
-}
+} // namespace kindrel::desktop

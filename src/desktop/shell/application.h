@@ -23,4 +23,4 @@ private:
     core::Dialogue* m_dialogue = nullptr;
 };
 
-}
+} // namespace kindrel::desktop

@@ -16,7 +16,8 @@ struct AreaDefinition
     const char* title;
     const char* icon;
     std::optional<core::Area> right; ///< Nothing: open to everybody.
+    /// Null, after saying why, when the area cannot be entered.
     Page* (*make)(Desk&);
 };
 
-}
+} // namespace kindrel::desktop

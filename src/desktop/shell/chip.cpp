@@ -9,7 +9,7 @@ namespace kindrel::desktop {
 
 Chip::Chip(QWidget* parent) : QLabel(parent)
 {
-    setFont(font_for(TextSize::secondary));
+    keep_text_size(*this, TextSize::secondary);
     setContentsMargins(space::field, 2, space::field, 2);
     setSizePolicy(QSizePolicy::Fixed, QSizePolicy::Fixed);
     setTextInteractionFlags(Qt::NoTextInteraction);
@@ -50,4 +50,4 @@ void Chip::changeEvent(QEvent* event)
         colour();
 }
 
-}
+} // namespace kindrel::desktop

@@ -26,4 +26,4 @@ private:
     State m_state = State::plain;
 };
 
-}
+} // namespace kindrel::desktop

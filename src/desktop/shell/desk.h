@@ -33,4 +33,4 @@ struct Desk
     Navigation& navigation;
 };
 
-}
+} // namespace kindrel::desktop

@@ -56,7 +56,7 @@ QString player()
     return {};
 }
 
-}
+} // namespace
 
 void QtDialogue::show(const core::Message& message)
 {
@@ -124,4 +124,4 @@ void QtDialogue::play(const QString& sound)
         QApplication::beep();
 }
 
-}
+} // namespace kindrel::desktop

@@ -30,4 +30,4 @@ private:
     QString m_audio_folder;
 };
 
-}
+} // namespace kindrel::desktop

@@ -29,4 +29,4 @@ void EmptyPanel::say(const QString& what, const QString& next_step)
     m_next_step->setText(next_step);
 }
 
-}
+} // namespace kindrel::desktop

@@ -20,4 +20,4 @@ private:
     QLabel* m_next_step;
 };
 
-}
+} // namespace kindrel::desktop

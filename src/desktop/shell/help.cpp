@@ -6,6 +6,7 @@
 #include <QFile>
 #include <QShortcut>
 #include <QTextBrowser>
+#include <QTextTable>
 
 namespace kindrel::desktop {
 
@@ -21,6 +22,21 @@ QString help_text(const QString& name)
     return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
 }
 
+/// Rows of keys read better without a frame around every word.
+void lighten_tables(QTextDocument& text)
+{
+    const auto frames = text.rootFrame()->childFrames();
+    for (QTextFrame* frame : frames)
+        if (auto* table = qobject_cast<QTextTable*>(frame)) {
+            QTextTableFormat format = table->format();
+            format.setBorder(0);
+            format.setCellSpacing(0);
+            format.setCellPadding(space::field / 2);
+            format.setBottomMargin(space::field);
+            table->setFormat(format);
+        }
+}
+
 QTextBrowser* help_window(Windows& windows)
 {
     for (auto* window : windows.all<QTextBrowser>())
@@ -34,13 +50,14 @@ QTextBrowser* help_window(Windows& windows)
     return window;
 }
 
-}
+} // namespace
 
 void open_help(Windows& windows, const QString& name)
 {
     QTextBrowser* window = help_window(windows);
     window->setMarkdown(help_text(name));
+    lighten_tables(*window->document());
     bring_forward(*window);
 }
 
-}
+} // namespace kindrel::desktop

@@ -35,7 +35,7 @@ QPen edge_of(const QStyleOption& option, Ground ground)
     return {option.palette.color(QPalette::Mid).darker(dark ? 80 : 115), 1};
 }
 
-}
+} // namespace
 
 void draw_button(const QStyleOption& option, QPainter& painter, Ground ground)
 {
@@ -95,4 +95,4 @@ void draw_scroll_bar(const QStyleOptionSlider& option, const QRect& slider, QPai
     painter.restore();
 }
 
-}
+} // namespace kindrel::desktop

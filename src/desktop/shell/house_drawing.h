@@ -16,4 +16,4 @@ void draw_scroll_bar(const QStyleOptionSlider& option, const QRect& slider, QPai
 /// The slider's place in a scroll bar that has no arrows.
 [[nodiscard]] QRect scroll_slider(const QStyleOptionSlider& option);
 
-}
+} // namespace kindrel::desktop

@@ -127,4 +127,4 @@ void HouseStyle::drawComplexControl(ComplexControl control, const QStyleOptionCo
         QProxyStyle::drawComplexControl(control, option, painter, widget);
 }
 
-}
+} // namespace kindrel::desktop

@@ -27,4 +27,4 @@ public:
                             const QWidget* widget) const override;
 };
 
-}
+} // namespace kindrel::desktop

@@ -8,6 +8,8 @@
 #include <QPainter>
 #include <QSvgRenderer>
 
+#include <algorithm>
+
 namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
@@ -20,7 +22,7 @@ QString file_of(const QString& name, Shade shade, int size)
     const QString folder = shade == Shade::dark ? u":/icons/dark/"_s : u":/icons/light/"_s;
     const int drawn = size <= 16 ? 16 : size <= 32 ? 22 : 64;
     const QString file = u"%1%2/%3.svg"_s.arg(folder).arg(drawn).arg(name);
-    return QFile::exists(file) ? file : u"%122/%2.svg"_s.arg(folder, name);
+    return QFile::exists(file) ? file : folder + u"22/"_s + name + u".svg"_s;
 }
 
 class ThemedIcon : public QIconEngine
@@ -31,11 +33,14 @@ public:
     void paint(QPainter* painter, const QRect& rect, QIcon::Mode mode, QIcon::State) override
     {
         const Shade shade = mode == QIcon::Selected ? Shade::dark : shade_of(QApplication::palette());
-        QSvgRenderer drawing(file_of(m_name, shade, rect.height()));
+        const int side = std::min(rect.width(), rect.height());
+        QRect place(0, 0, side, side);
+        place.moveCenter(rect.center());
+        QSvgRenderer drawing(file_of(m_name, shade, side));
         painter->save();
         if (mode == QIcon::Disabled)
             painter->setOpacity(0.4);
-        drawing.render(painter, rect);
+        drawing.render(painter, place);
         painter->restore();
     }
 
@@ -55,11 +60,11 @@ private:
     QString m_name;
 };
 
-}
+} // namespace
 
 QIcon icon(const QString& name)
 {
     return QIcon(new ThemedIcon(name));
 }
 
-}
+} // namespace kindrel::desktop

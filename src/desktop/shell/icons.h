@@ -9,4 +9,4 @@ namespace kindrel::desktop {
 /// on a selection.
 [[nodiscard]] QIcon icon(const QString& name);
 
-}
+} // namespace kindrel::desktop

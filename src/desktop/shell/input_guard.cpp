@@ -51,4 +51,4 @@ bool InputGuard::eventFilter(QObject* target, QEvent* event)
     return true;
 }
 
-}
+} // namespace kindrel::desktop

@@ -37,4 +37,4 @@ private:
     std::chrono::milliseconds m_shown_at;
 };
 
-}
+} // namespace kindrel::desktop

@@ -14,7 +14,7 @@ constexpr int padding = 5;
 constexpr int hint_width = 200;
 constexpr int bar_width = 3;
 
-}
+} // namespace
 
 LinkButton::LinkButton(const QString& text, QWidget* parent) : QAbstractButton(parent)
 {
@@ -84,7 +84,9 @@ void LinkButton::paint_texts(QPainter& painter) const
     title.setBold(isChecked());
     painter.setFont(title);
     painter.setPen(palette().color(isEnabled() ? QPalette::Link : QPalette::WindowText));
-    painter.drawText(QRect(place.left(), padding, place.width(), line), Qt::AlignLeft | Qt::AlignVCenter, text());
+    const int figure_width = QFontMetrics(title).horizontalAdvance(m_figure);
+    painter.drawText(QRect(place.left(), padding, place.width(), line), Qt::AlignLeft | Qt::AlignVCenter,
+                     QFontMetrics(title).elidedText(text(), Qt::ElideRight, place.width() - figure_width));
     painter.setPen(palette().color(QPalette::WindowText));
     painter.drawText(QRect(place.left(), padding, place.width(), line), Qt::AlignRight | Qt::AlignVCenter, m_figure);
     painter.setFont(font_for(TextSize::secondary));
@@ -110,4 +112,4 @@ void LinkButton::changeEvent(QEvent* event)
         updateGeometry();
 }
 
-}
+} // namespace kindrel::desktop

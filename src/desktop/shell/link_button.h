@@ -35,4 +35,4 @@ private:
     QString m_description;
 };
 
-}
+} // namespace kindrel::desktop

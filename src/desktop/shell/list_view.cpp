@@ -40,7 +40,7 @@ private:
     QTableView& m_view;
 };
 
-}
+} // namespace
 
 void make_row_list(QTableView& view)
 {
@@ -61,4 +61,4 @@ void make_row_list(QTableView& view)
     enable_copy(view);
 }
 
-}
+} // namespace kindrel::desktop

@@ -3,8 +3,7 @@
 #include "desktop/shell/house_style.h"
 
 #include <QApplication>
-#include <QEvent>
-#include <QFontDatabase>
+#include <QFontInfo>
 #include <QLabel>
 
 #include <algorithm>
@@ -22,7 +21,8 @@ struct Size
     QFont::Weight weight;
 };
 
-constexpr std::array sizes{Size{14, QFont::Bold}, Size{11, QFont::Bold}, Size{10, QFont::Normal}, Size{9, QFont::Normal}};
+constexpr std::array sizes{Size{14, QFont::Bold}, Size{11, QFont::Bold}, Size{10, QFont::Normal},
+                           Size{9, QFont::Normal}};
 constexpr int body_points = 10;
 
 /// The desktop's font, or Noto Sans where the desktop names none that exists.
@@ -33,39 +33,29 @@ QString usable_family(const QString& desktop_family)
     return named ? desktop_family : u"Noto Sans"_s;
 }
 
-/// Keeps secondary text quiet when the palette changes under it.
-class QuietText : public QObject
+/// What a widget was dressed with, so that it can be dressed again.
+constexpr auto size_property = "kindrel_text_size";
+constexpr auto width_property = "kindrel_width";
+constexpr auto quiet_property = "kindrel_quiet";
+
+void refresh_colour(QWidget& widget)
 {
-public:
-    explicit QuietText(QLabel& label) : QObject(&label), m_label(label)
-    {
-        label.installEventFilter(this);
-        paint();
-    }
-
-protected:
-    bool eventFilter(QObject* target, QEvent* event) override
-    {
-        if (event->type() == QEvent::PaletteChange)
-            paint();
-        return QObject::eventFilter(target, event);
-    }
-
-private:
-    void paint()
-    {
-        const QColor quiet = quiet_colour(shade_of(m_label.palette()));
-        if (m_label.palette().color(QPalette::WindowText) == quiet)
-            return;
-        QPalette palette;
-        palette.setColor(QPalette::WindowText, quiet);
-        m_label.setPalette(palette);
-    }
-
-    QLabel& m_label;
-};
-
+    QPalette palette;
+    palette.setColor(QPalette::WindowText, quiet_colour(shade_of(QApplication::palette())));
+    widget.setPalette(palette);
 }
+
+void refresh(QWidget& widget)
+{
+    if (const QVariant size = widget.property(size_property); size.isValid())
+        widget.setFont(font_for(TextSize(size.toInt())));
+    if (const QVariant width = widget.property(width_property); width.isValid())
+        widget.setFixedWidth(int(width.toInt() * QApplication::font().pointSizeF() / body_points));
+    if (widget.property(quiet_property).toBool())
+        refresh_colour(widget);
+}
+
+} // namespace
 
 Look::Look(QApplication& application)
     : m_application(application), m_desktop_shade(shade_of(QApplication::palette())),
@@ -83,6 +73,9 @@ void Look::apply(Appearance appearance, int percent)
     QFont font(m_font_family);
     font.setPointSizeF(body_points * percent / 100.0);
     QApplication::setFont(font);
+    const auto widgets = QApplication::allWidgets();
+    for (QWidget* widget : widgets)
+        refresh(*widget);
 }
 
 QFont font_for(TextSize size)
@@ -99,11 +92,22 @@ int row_height()
     return std::max(space::row, QFontMetrics(QApplication::font()).height() + 6);
 }
 
-void dress(QLabel& label, TextSize size)
+void keep_text_size(QWidget& widget, TextSize size)
 {
-    label.setFont(font_for(size));
-    if (size == TextSize::secondary)
-        new QuietText(label);
+    widget.setProperty(size_property, int(size));
+    refresh(widget);
 }
 
+void keep_width(QWidget& widget, int pixels)
+{
+    widget.setProperty(width_property, pixels);
+    refresh(widget);
 }
+
+void dress(QLabel& label, TextSize size)
+{
+    label.setProperty(quiet_property, size == TextSize::secondary);
+    keep_text_size(label, size);
+}
+
+} // namespace kindrel::desktop

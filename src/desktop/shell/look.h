@@ -6,6 +6,7 @@
 
 class QApplication;
 class QLabel;
+class QWidget;
 
 namespace kindrel::desktop {
 
@@ -22,7 +23,7 @@ inline constexpr int margin = 12;
 inline constexpr int group = 16;
 inline constexpr int row = 24;
 inline constexpr int control = 28;
-}
+} // namespace space
 
 /// Style, palette and font of the whole program.
 class Look
@@ -48,7 +49,11 @@ private:
 [[nodiscard]] QFont font_for(TextSize size);
 /// The program's own row height, grown with the text.
 [[nodiscard]] int row_height();
-/// Sets size, and the quiet colour for secondary text; the colour follows a change of palette.
+/// Gives a widget's text its size for good: it grows and shrinks with the program's text.
+void keep_text_size(QWidget& widget, TextSize size);
+/// Fixes a width that is right for text at 100 percent and grows with it.
+void keep_width(QWidget& widget, int pixels);
+/// Size for good, and the quiet colour of either shade for secondary text.
 void dress(QLabel& label, TextSize size);
 
-}
+} // namespace kindrel::desktop

@@ -1,10 +1,11 @@
 #include "desktop/shell/main_window.h"
 
 #include "desktop/shell/help.h"
+#include "desktop/shell/idle_watch.h"
 #include "desktop/shell/page.h"
 #include "desktop/shell/rail.h"
+#include "desktop/shell/view_menu.h"
 
-#include <QActionGroup>
 #include <QCloseEvent>
 #include <QHBoxLayout>
 #include <QLabel>
@@ -38,30 +39,7 @@ QString mode_words(const core::Office& office)
     return u"This workstation"_s;
 }
 
-struct Choice
-{
-    const char* text;
-    int value;
-};
-
-constexpr std::array appearances{Choice{"&Light", int(Appearance::light)}, Choice{"&Dark", int(Appearance::dark)},
-                                 Choice{"As the d&esktop", int(Appearance::desktop)}};
-constexpr std::array percents{Choice{"Text 100 %", 100}, Choice{"Text 115 %", 115}, Choice{"Text 130 %", 130}};
-
-/// One group of a menu of which exactly one is ticked.
-void add_choices(QMenu& menu, std::span<const Choice> choices, int chosen, const std::function<void(int)>& choose)
-{
-    auto* group = new QActionGroup(&menu);
-    for (const Choice& choice : choices) {
-        QAction* action = menu.addAction(QString::fromLatin1(choice.text));
-        action->setCheckable(true);
-        action->setChecked(choice.value == chosen);
-        group->addAction(action);
-        QObject::connect(action, &QAction::triggered, &menu, [choose, value = choice.value] { choose(value); });
-    }
-}
-
-}
+} // namespace
 
 MainWindow::MainWindow(Desk& desk, std::span<const AreaDefinition> areas, Look& look)
     : m_desk(desk), m_areas(areas), m_look(look), m_rail(new Rail), m_stack(new QStackedWidget), m_mode(new QLabel),
@@ -83,6 +61,9 @@ MainWindow::MainWindow(Desk& desk, std::span<const AreaDefinition> areas, Look& 
     add_keys();
     follow_window(desk.remembered, *this, first_size);
     open_place(0);
+    auto* watch = new IdleWatch(this);
+    connect(watch, &IdleWatch::idle, this, [this] { set_idle(true); });
+    connect(watch, &IdleWatch::returned, this, [this] { set_idle(false); });
 }
 
 bool MainWindow::granted(const AreaDefinition& area) const
@@ -98,8 +79,8 @@ void MainWindow::add_areas()
         const QKeySequence key(Qt::CTRL | Qt::Key(Qt::Key_1 + place));
         button->setObjectName(QString::fromLatin1(area.key));
         button->setEnabled(granted(area));
-        button->setToolTip(granted(area) ? u"%1 (%2)"_s.arg(button->text(), key.toString(QKeySequence::NativeText))
-                                         : u"Your password does not open this area"_s);
+        button->set_tip(granted(area) ? u"%1 (%2)"_s.arg(button->text(), key.toString(QKeySequence::NativeText))
+                                      : u"Your password does not open this area"_s);
         if (place < 9) {
             auto* shortcut = new QShortcut(key, this);
             connect(shortcut, &QShortcut::activated, this, [this, place] { open_place(place); });
@@ -113,7 +94,7 @@ void MainWindow::add_foot()
     auto* view = m_rail->add_foot(u"configure"_s, u"View"_s);
     view->setObjectName(u"view"_s);
     connect(view, &QAbstractButton::clicked, this, [this, view] {
-        QMenu* menu = view_menu();
+        QMenu* menu = make_view_menu(m_look, m_desk.remembered, this);
         menu->popup(view->mapToGlobal(QPoint(view->width(), view->height() - menu->sizeHint().height())));
     });
     auto* help = m_rail->add_foot(u"help-contents"_s, u"Help"_s);
@@ -139,6 +120,7 @@ void MainWindow::add_keys()
     };
     key(Qt::CTRL | Qt::Key_K, [this] { m_desk.navigation.find_family(); });
     key(QKeySequence::Find, [this] { page()->find(); });
+    key(QKeySequence::Save, [this] { page()->save(); });
     key(QKeySequence::Print, [this] { page()->print(); });
     key(Qt::CTRL | Qt::Key_W, [this] { close_page(); });
     key(Qt::Key_F1, [this] { show_help(); });
@@ -158,29 +140,60 @@ void MainWindow::open_area(const QString& key)
 
 void MainWindow::open_place(std::size_t place)
 {
-    if (!granted(m_areas[place]))
+    if (!granted(m_areas[place]) || !(m_pages[place] || make_page(place)))
         return;
-    if (!m_pages[place]) {
-        m_pages[place] = m_areas[place].make(m_desk);
-        m_stack->addWidget(m_pages[place]);
-        connect(m_pages[place], &Page::status_changed, this, &MainWindow::show_status);
-    }
     m_stack->setCurrentWidget(m_pages[place]);
     m_rail->choose(int(place));
     m_pages[place]->entered();
     show_status();
 }
 
+bool MainWindow::make_page(std::size_t place)
+{
+    if (page())
+        m_rail->choose(int(place_of(page()))); // Until the area lets us in.
+    Page* made = m_areas[place].make(m_desk);
+    if (!made)
+        return false;
+    m_pages[place] = made;
+    m_stack->addWidget(made);
+    connect(made, &Page::status_changed, this, &MainWindow::show_status);
+    connect(made, &Page::state_changed, this, &MainWindow::show_marks);
+    show_marks();
+    return true;
+}
+
+std::size_t MainWindow::place_of(const Page* page) const
+{
+    return std::size_t(std::find(m_pages.begin(), m_pages.end(), page) - m_pages.begin());
+}
+
+void MainWindow::show_marks()
+{
+    for (std::size_t place = 0; place < m_pages.size(); ++place) {
+        const Page* page = m_pages[place];
+        const bool locked = page && page->holds_lock();
+        m_rail->mark(int(place), {.altered = page && page->altered(), .locked = locked, .idle = locked && m_idle});
+    }
+}
+
+void MainWindow::set_idle(bool idle)
+{
+    m_idle = idle;
+    show_marks();
+}
+
 void MainWindow::close_page()
 {
-    const int place = int(std::find(m_pages.begin(), m_pages.end(), page()) - m_pages.begin());
+    const std::size_t place = place_of(page());
     if (place == 0 || !page()->leave())
         return;
     Page* closing = page();
-    m_pages[std::size_t(place)] = nullptr;
+    m_pages[place] = nullptr;
     open_place(0);
     closing->deleteLater();
     m_stack->removeWidget(closing);
+    show_marks();
 }
 
 bool MainWindow::leave_all()
@@ -198,25 +211,6 @@ void MainWindow::show_help()
     open_help(m_desk.windows, page()->help());
 }
 
-void MainWindow::set_appearance(Appearance appearance, int percent)
-{
-    m_look.apply(appearance, percent);
-    m_desk.remembered.keep_common(u"appearance"_s, int(appearance));
-    m_desk.remembered.keep_common(u"text_percent"_s, percent);
-}
-
-QMenu* MainWindow::view_menu()
-{
-    auto* menu = new QMenu(this);
-    menu->setAttribute(Qt::WA_DeleteOnClose);
-    add_choices(*menu, appearances, int(m_look.appearance()),
-                [this](int value) { set_appearance(Appearance(value), m_look.percent()); });
-    menu->addSeparator();
-    add_choices(*menu, percents, m_look.percent(),
-                [this](int value) { set_appearance(m_look.appearance(), value); });
-    return menu;
-}
-
 void MainWindow::closeEvent(QCloseEvent* event)
 {
     if (!leave_all()) {
@@ -230,7 +224,20 @@ void MainWindow::closeEvent(QCloseEvent* event)
 void MainWindow::resizeEvent(QResizeEvent* event)
 {
     QMainWindow::resizeEvent(event);
-    m_rail->set_narrow(width() < narrow_below);
+    fit_rail();
 }
 
+void MainWindow::changeEvent(QEvent* event)
+{
+    QMainWindow::changeEvent(event);
+    if (event->type() == QEvent::FontChange)
+        fit_rail();
 }
+
+void MainWindow::fit_rail()
+{
+    // Larger text needs the room sooner.
+    m_rail->set_narrow(width() < narrow_below * m_look.percent() / 100);
+}
+
+} // namespace kindrel::desktop

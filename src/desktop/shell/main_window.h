@@ -9,7 +9,6 @@
 #include <vector>
 
 class QLabel;
-class QMenu;
 class QStackedWidget;
 
 namespace kindrel::desktop {
@@ -38,18 +37,24 @@ Q_SIGNALS:
 protected:
     void closeEvent(QCloseEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
 private:
+    void fit_rail();
     void add_areas();
     void add_foot();
     void add_status_bar();
     void add_keys();
     void open_place(std::size_t place);
+    /// False when the area does not let anybody in.
+    [[nodiscard]] bool make_page(std::size_t place);
+    [[nodiscard]] std::size_t place_of(const Page* page) const;
+    /// What the rail shows of the pages' states.
+    void show_marks();
+    void set_idle(bool idle);
     void close_page();
     void show_status();
     void show_help();
-    void set_appearance(Appearance appearance, int percent);
-    [[nodiscard]] QMenu* view_menu();
     [[nodiscard]] bool granted(const AreaDefinition& area) const;
 
     Desk& m_desk;
@@ -60,6 +65,7 @@ private:
     QLabel* m_mode;
     QLabel* m_count;
     std::vector<Page*> m_pages; ///< Beside `m_areas`; null while an area is closed.
+    bool m_idle = false;
 };
 
-}
+} // namespace kindrel::desktop

@@ -19,14 +19,15 @@ NoteBar::NoteBar(QWidget* parent) : QFrame(parent), m_text(new QLabel), m_close(
     m_text->setWordWrap(true);
     m_text->setTextInteractionFlags(Qt::TextSelectableByMouse);
     m_close->setFlat(true);
-    m_close->setIcon(icon(u"window-close"_s));
+    m_close->setText(u"\u00d7"_s);
+    m_close->setFixedWidth(space::control);
     m_close->setAccessibleName(u"Close this note"_s);
     connect(m_close, &QPushButton::clicked, this, &NoteBar::clear);
 
     auto* mark = new QLabel;
     mark->setPixmap(icon(u"dialog-information"_s).pixmap(16, 16));
     auto* row = new QHBoxLayout(this);
-    row->setContentsMargins(space::margin, 2, space::field / 2, 2);
+    row->setContentsMargins(space::group, 2, space::field / 2, 2);
     row->addWidget(mark);
     row->addWidget(m_text, 1);
     row->addWidget(m_close);
@@ -57,4 +58,4 @@ void NoteBar::paintEvent(QPaintEvent*)
     painter.fillRect(QRect(0, 0, 3, height()), palette().color(QPalette::Highlight));
 }
 
-}
+} // namespace kindrel::desktop

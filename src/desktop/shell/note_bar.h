@@ -27,4 +27,4 @@ private:
     QPushButton* m_close;
 };
 
-}
+} // namespace kindrel::desktop

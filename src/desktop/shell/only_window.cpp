@@ -28,7 +28,7 @@ bool is_input(const QEvent& event)
     }
 }
 
-}
+} // namespace
 
 OnlyWindow::OnlyWindow(QWidget& window) : m_window(window)
 {
@@ -49,4 +49,4 @@ bool OnlyWindow::eventFilter(QObject* target, QEvent* event)
     return true;
 }
 
-}
+} // namespace kindrel::desktop

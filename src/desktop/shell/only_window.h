@@ -23,4 +23,4 @@ private:
     QWidget& m_window;
 };
 
-}
+} // namespace kindrel::desktop

@@ -71,4 +71,4 @@ void Page::set_content(QWidget* content)
     m_column->addWidget(content, 1);
 }
 
-}
+} // namespace kindrel::desktop

@@ -35,11 +35,19 @@ public:
     /// The cursor goes to where one finds things on this page.
     virtual void find() {}
     virtual void print() {}
-    /// False: the page must stay open.
+    /// False, after saying why, when something could not be saved.
+    virtual bool save() { return true; }
+    /// Something was changed that is not saved yet.
+    [[nodiscard]] virtual bool altered() const { return false; }
+    /// The page keeps other workstations out of what it works on.
+    [[nodiscard]] virtual bool holds_lock() const { return false; }
+    /// Saves or drops what is altered, as the person wishes. False: the page must stay open.
     [[nodiscard]] virtual bool leave() { return true; }
 
 Q_SIGNALS:
     void status_changed();
+    /// What altered() or holds_lock() answers.
+    void state_changed();
 
 protected:
     /// A button at the right of the header.
@@ -55,4 +63,4 @@ private:
     QString m_status;
 };
 
-}
+} // namespace kindrel::desktop

@@ -76,7 +76,7 @@ void set_disabled(QPalette& palette, const Colours& of)
     palette.setColor(QPalette::Disabled, QPalette::Base, of.window);
 }
 
-}
+} // namespace
 
 QPalette palette_of(Shade shade)
 {
@@ -117,4 +117,4 @@ QColor hover_colour(Shade shade)
     return colours(shade).hover;
 }
 
-}
+} // namespace kindrel::desktop

@@ -24,4 +24,4 @@ enum class State { plain, deceased, archive, prospect, privacy, contact, booked_
 /// Behind what the mouse is over.
 [[nodiscard]] QColor hover_colour(Shade shade);
 
-}
+} // namespace kindrel::desktop

@@ -29,7 +29,7 @@ int rounds(const QPrinter& printer)
     return printer.supportsMultipleCopies() ? 1 : printer.copyCount();
 }
 
-}
+} // namespace
 
 bool QtPrinting::print(const PrintJob& job, QWidget& parent)
 {
@@ -52,4 +52,4 @@ bool QtPrinting::print(const PrintJob& job, QWidget& parent)
     }
 }
 
-}
+} // namespace kindrel::desktop

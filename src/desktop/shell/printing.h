@@ -37,4 +37,4 @@ private:
     core::Progress& m_progress;
 };
 
-}
+} // namespace kindrel::desktop

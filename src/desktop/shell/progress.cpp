@@ -11,12 +11,14 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int noticed_after_ms = 300;
-constexpr int refresh_ms = 50;
+using namespace std::chrono_literals;
 
-}
+constexpr auto noticed_after = 300ms;
+constexpr auto refresh_time = 50ms;
 
-QtProgress::QtProgress(core::Dialogue& dialogue) : m_dialogue(dialogue) {}
+} // namespace
+
+QtProgress::QtProgress(core::Dialogue& dialogue, Stopwatch now) : m_dialogue(dialogue), m_now(std::move(now)) {}
 
 QtProgress::~QtProgress() = default;
 
@@ -29,18 +31,16 @@ void QtProgress::begin(const QString& what, int steps, const QString& cancel_que
     m_box->setWindowModality(Qt::ApplicationModal);
     m_box->setAutoClose(false);
     m_box->setAutoReset(false);
-    m_box->setMinimumDuration(noticed_after_ms);
     m_box->setMinimumWidth(420);
     if (!cancel_question.isEmpty())
         m_box->setCancelButtonText(u"Cancel"_s);
-    m_running.start();
-    m_shown.start();
+    m_begun = m_shown = m_now();
 }
 
 bool QtProgress::step(const QString& what)
 {
     ++m_done;
-    if (!m_box || m_running.elapsed() < noticed_after_ms || (m_box->isVisible() && m_shown.elapsed() < refresh_ms))
+    if (!m_box || m_now() - m_begun < noticed_after || (m_box->isVisible() && m_now() - m_shown < refresh_time))
         return true;
     show_state(what);
     return !m_box->wasCanceled() || !cancel_confirmed();
@@ -53,7 +53,7 @@ void QtProgress::show_state(const QString& what)
     m_box->show();
     m_box->setValue(m_done);
     QApplication::processEvents();
-    m_shown.restart();
+    m_shown = m_now();
 }
 
 bool QtProgress::cancel_confirmed()
@@ -68,4 +68,4 @@ void QtProgress::end()
     m_box.reset();
 }
 
-}
+} // namespace kindrel::desktop

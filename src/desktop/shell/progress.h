@@ -2,8 +2,7 @@
 
 #include "core/dialogue.h"
 #include "core/progress.h"
-
-#include <QElapsedTimer>
+#include "desktop/shell/input_guard.h"
 
 #include <memory>
 
@@ -15,7 +14,7 @@ namespace kindrel::desktop {
 class QtProgress : public core::Progress
 {
 public:
-    explicit QtProgress(core::Dialogue& dialogue);
+    explicit QtProgress(core::Dialogue& dialogue, Stopwatch now = since_start);
     ~QtProgress() override;
 
     void begin(const QString& what, int steps, const QString& cancel_question) override;
@@ -30,7 +29,8 @@ private:
     std::unique_ptr<QProgressDialog> m_box;
     QString m_question;
     int m_done = 0;
-    QElapsedTimer m_running, m_shown;
+    Stopwatch m_now;
+    std::chrono::milliseconds m_begun{0}, m_shown{0};
 };
 
-}
+} // namespace kindrel::desktop

@@ -23,7 +23,7 @@ QLabel* plain_label(const QString& text)
     return label;
 }
 
-}
+} // namespace
 
 QString icon_name(core::Icon icon)
 {
@@ -68,4 +68,4 @@ QuestionBox::QuestionBox(const core::Message& message, QWidget* answer, QWidget*
     new InputGuard(*this, now);
 }
 
-}
+} // namespace kindrel::desktop

@@ -24,4 +24,4 @@ public:
     [[nodiscard]] bool ask() { return exec() == Accepted; }
 };
 
-}
+} // namespace kindrel::desktop

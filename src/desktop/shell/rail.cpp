@@ -10,13 +10,18 @@
 
 namespace kindrel::desktop {
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 constexpr int icon_size = 22;
 constexpr int inset = 4;
 constexpr int button_height = 40;
+constexpr int dot_size = 8;
+constexpr int mark_size = 16;
+constexpr QStringView still_locked = u"still locked for others";
 
-}
+} // namespace
 
 RailButton::RailButton(const QString& icon_name, const QString& text)
 {
@@ -35,39 +40,104 @@ void RailButton::set_narrow(bool narrow)
     update();
 }
 
+void RailButton::set_tip(const QString& tip)
+{
+    m_tip = tip;
+    set_marks(m_marks);
+}
+
+void RailButton::set_marks(const RailMarks& marks)
+{
+    m_marks = marks;
+    const QString words = mark_words();
+    setToolTip(words.isEmpty() ? m_tip : m_tip + u'\n' + words);
+    setAccessibleDescription(words);
+    update();
+}
+
+QString RailButton::mark_words() const
+{
+    QStringList words;
+    if (m_marks.altered)
+        words += u"has unsaved work"_s;
+    if (m_marks.locked)
+        words += m_marks.idle ? still_locked.toString() : u"locked for others"_s;
+    return words.join(u'\n');
+}
+
 QSize RailButton::sizeHint() const
 {
     return {m_narrow ? Rail::narrow : Rail::wide, std::max(button_height, fontMetrics().height() + 2 * space::field)};
+}
+
+void RailButton::paint_ground(QPainter& painter) const
+{
+    const QRectF place = QRectF(rect()).adjusted(inset, 2, -inset, -2);
+    if (stands_out() || (isEnabled() && underMouse())) {
+        painter.setPen(Qt::NoPen);
+        painter.setBrush(stands_out() ? palette().color(QPalette::Highlight) : hover_colour(shade_of(palette())));
+        painter.drawRoundedRect(place, 5, 5);
+    }
+    if (!hasFocus())
+        return;
+    painter.setBrush(Qt::NoBrush);
+    painter.setPen(QPen(palette().color(stands_out() ? QPalette::HighlightedText : QPalette::Highlight), 2));
+    painter.drawRoundedRect(place.adjusted(2, 2, -2, -2), 4, 4);
+}
+
+void RailButton::paint_words(QPainter& painter, QRect place) const
+{
+    const auto elided = [&](const QString& words) {
+        return painter.fontMetrics().elidedText(words, Qt::ElideRight, place.width(), Qt::TextShowMnemonic);
+    };
+    painter.setPen(palette().color(stands_out() ? QPalette::HighlightedText : QPalette::WindowText));
+    if (!m_marks.idle) {
+        painter.drawText(place, Qt::AlignVCenter | Qt::TextShowMnemonic, elided(text()));
+        return;
+    }
+    place.adjust(0, inset, 0, -inset);
+    painter.drawText(place, Qt::AlignTop | Qt::TextShowMnemonic, elided(text()));
+    painter.setFont(font_for(TextSize::secondary));
+    painter.drawText(place.adjusted(0, 0, dot_size + mark_size, 0), Qt::AlignBottom, still_locked.toString());
+}
+
+void RailButton::paint_marks(QPainter& painter) const
+{
+    // On the icon's corners when there is no room beside the name.
+    const int right = width() - inset - (m_narrow ? 2 : space::field);
+    const int middle = m_narrow || m_marks.idle ? inset + mark_size / 2 + 2 : height() / 2;
+    int place = right;
+    if (m_marks.locked) {
+        place -= mark_size;
+        desktop::icon(u"object-locked"_s)
+            .paint(&painter,
+                   QRect(place, m_narrow ? height() - inset - mark_size : middle - mark_size / 2, mark_size, mark_size),
+                   Qt::AlignCenter, stands_out() ? QIcon::Selected : QIcon::Normal);
+        place = m_narrow ? right : place - inset;
+    }
+    if (m_marks.altered) {
+        painter.setPen(Qt::NoPen);
+        painter.setBrush(stands_out() ? palette().color(QPalette::HighlightedText)
+                                      : state_colour(State::altered, shade_of(palette())));
+        painter.drawEllipse(QRectF(place - dot_size, middle - dot_size / 2.0, dot_size, dot_size));
+    }
 }
 
 void RailButton::paintEvent(QPaintEvent*)
 {
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
-    const QRectF place = QRectF(rect()).adjusted(inset, 2, -inset, -2);
-    const bool shown = isChecked() || isDown();
-    if (shown || (isEnabled() && underMouse())) {
-        painter.setPen(Qt::NoPen);
-        painter.setBrush(shown ? palette().color(QPalette::Highlight) : hover_colour(shade_of(palette())));
-        painter.drawRoundedRect(place, 5, 5);
-    }
-    if (hasFocus()) {
-        painter.setBrush(Qt::NoBrush);
-        painter.setPen(QPen(shown ? palette().color(QPalette::HighlightedText) : palette().color(QPalette::Highlight), 2));
-        painter.drawRoundedRect(place.adjusted(2, 2, -2, -2), 4, 4);
-    }
+    paint_ground(painter);
     const QRect picture(m_narrow ? (width() - icon_size) / 2 : space::margin, (height() - icon_size) / 2, icon_size,
                         icon_size);
     icon().paint(&painter, picture, Qt::AlignCenter,
-                 !isEnabled() ? QIcon::Disabled
-                 : shown      ? QIcon::Selected
-                              : QIcon::Normal);
-    if (m_narrow)
-        return;
-    painter.setPen(palette().color(shown ? QPalette::HighlightedText : QPalette::WindowText));
-    const QRect words = rect().adjusted(picture.right() + space::field + 2, 0, -space::field, 0);
-    painter.drawText(words, Qt::AlignVCenter | Qt::TextShowMnemonic,
-                     fontMetrics().elidedText(text(), Qt::ElideRight, words.width(), Qt::TextShowMnemonic));
+                 !isEnabled()   ? QIcon::Disabled
+                 : stands_out() ? QIcon::Selected
+                                : QIcon::Normal);
+    const int marks = (m_marks.altered ? dot_size + inset : 0) + (m_marks.locked ? mark_size + inset : 0);
+    if (!m_narrow)
+        paint_words(painter, rect().adjusted(picture.right() + space::field + 2, 0, -space::field - marks, 0));
+    paint_marks(painter);
 }
 
 Rail::Rail(QWidget* parent) : QWidget(parent), m_column(new QVBoxLayout(this))
@@ -111,6 +181,11 @@ void Rail::choose(int area)
     m_areas.at(std::size_t(area))->setChecked(true);
 }
 
+void Rail::mark(int area, const RailMarks& marks)
+{
+    m_areas.at(std::size_t(area))->set_marks(marks);
+}
+
 void Rail::paintEvent(QPaintEvent*)
 {
     QPainter painter(this);
@@ -119,4 +194,4 @@ void Rail::paintEvent(QPaintEvent*)
     painter.drawLine(rect().topRight(), rect().bottomRight());
 }
 
-}
+} // namespace kindrel::desktop

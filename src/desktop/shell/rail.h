@@ -9,6 +9,16 @@ class QVBoxLayout;
 
 namespace kindrel::desktop {
 
+/// What the rail shows of a page beside its name.
+struct RailMarks
+{
+    bool altered = false; ///< A dot.
+    bool locked = false;  ///< A padlock.
+    bool idle = false;    ///< A reminder that others still wait for the lock.
+
+    friend bool operator==(const RailMarks&, const RailMarks&) = default;
+};
+
 /// One area of the rail: icon and name, or the icon alone when space is short.
 class RailButton : public QAbstractButton
 {
@@ -18,12 +28,25 @@ public:
     RailButton(const QString& icon_name, const QString& text);
 
     void set_narrow(bool narrow);
+    void set_tip(const QString& tip);
+    void set_marks(const RailMarks& marks);
+    [[nodiscard]] const RailMarks& marks() const { return m_marks; }
+    /// The marks in words, a line each.
+    [[nodiscard]] QString mark_words() const;
     [[nodiscard]] QSize sizeHint() const override;
 
 protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
+    void paint_ground(QPainter& painter) const;
+    void paint_words(QPainter& painter, QRect place) const;
+    void paint_marks(QPainter& painter) const;
+    /// Chosen or pressed: on the ground of a selection.
+    [[nodiscard]] bool stands_out() const { return isChecked() || isDown(); }
+
+    QString m_tip;
+    RailMarks m_marks;
     bool m_narrow = false;
 };
 
@@ -42,6 +65,7 @@ public:
     RailButton* add_foot(const QString& icon_name, const QString& text);
     void set_narrow(bool narrow);
     void choose(int area);
+    void mark(int area, const RailMarks& marks);
 
 Q_SIGNALS:
     void chosen(int area);
@@ -54,4 +78,4 @@ private:
     std::vector<RailButton*> m_areas, m_foot;
 };
 
-}
+} // namespace kindrel::desktop

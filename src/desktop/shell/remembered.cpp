@@ -40,7 +40,8 @@ class ColumnKeeper : public QObject
 public:
     ColumnKeeper(Remembered& remembered, QHeaderView& header, std::span<const int> shares)
         : QObject(&header), m_remembered(remembered), m_header(header), m_shares(shares.begin(), shares.end()),
-          m_key(u"columns/"_s + header.objectName()), m_placed(header.restoreState(remembered.value(m_key).toByteArray()))
+          m_key(u"columns/"_s + header.objectName()),
+          m_placed(header.restoreState(remembered.value(m_key).toByteArray()))
     {
         header.installEventFilter(this);
         connect(&header, &QHeaderView::sectionResized, this, &ColumnKeeper::moved_by_hand);
@@ -86,7 +87,7 @@ private:
     bool m_placed;
 };
 
-}
+} // namespace
 
 Remembered::Remembered(const QString& local_settings, int church)
     : m_file(local_settings + u"desktop.ini"_s, QSettings::IniFormat), m_church(u"church%1/"_s.arg(church))
@@ -133,4 +134,4 @@ void follow_window(Remembered& remembered, QWidget& window, QSize first_size)
     new WindowKeeper(remembered, window);
 }
 
-}
+} // namespace kindrel::desktop

@@ -37,4 +37,4 @@ void follow(Remembered& remembered, QHeaderView& header, std::span<const int> sh
 /// A window's size and place; kept whenever it is hidden or closed.
 void follow_window(Remembered& remembered, QWidget& window, QSize first_size);
 
-}
+} // namespace kindrel::desktop

@@ -1,5 +1,7 @@
 #include "desktop/shell/side_panel.h"
 
+#include "desktop/shell/look.h"
+
 #include <QScrollArea>
 
 namespace kindrel::desktop {
@@ -14,10 +16,10 @@ QScrollArea* make_side_panel(QLayout* content, int width)
     scroll->setFrameShape(QFrame::NoFrame);
     scroll->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     scroll->setFocusPolicy(Qt::NoFocus);
-    scroll->setFixedWidth(width);
+    keep_width(*scroll, width);
     scroll->setWidget(panel);
     scroll->viewport()->setAutoFillBackground(false);
     return scroll;
 }
 
-}
+} // namespace kindrel::desktop

@@ -45,7 +45,7 @@ QString csv_line(QStringList words)
     return words.join(u',') + u"\r\n"_s;
 }
 
-}
+} // namespace
 
 QByteArray csv_of(const QAbstractItemModel& model)
 {
@@ -95,4 +95,4 @@ void enable_copy(QAbstractItemView& view)
     view.addAction(copy);
 }
 
-}
+} // namespace kindrel::desktop

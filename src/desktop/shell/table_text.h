@@ -17,4 +17,4 @@ void save_as_csv(const QAbstractItemModel& model, const QString& suggested, core
 /// Ctrl+C copies the chosen rows.
 void enable_copy(QAbstractItemView& view);
 
-}
+} // namespace kindrel::desktop

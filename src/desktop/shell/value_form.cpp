@@ -12,7 +12,10 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+constexpr int greatest_width = 520; // The mark stays near its value.
 constexpr int caption_width = 96;
+constexpr int longest_without_tip = 20;
+constexpr int least_value_width = 80; // A long word must not push the window wider.
 
 QWidget* make_hidden_mark()
 {
@@ -31,7 +34,7 @@ QWidget* make_hidden_mark()
     return mark;
 }
 
-}
+} // namespace
 
 QString hidden_mark()
 {
@@ -57,6 +60,7 @@ QLabel* make_value()
 ValueForm::ValueForm(const QString& title, const QStringList& captions, QWidget* parent)
     : QWidget(parent), m_grid(new QGridLayout(this))
 {
+    setMaximumWidth(greatest_width);
     m_grid->setContentsMargins(0, 0, 0, 0);
     m_grid->setHorizontalSpacing(space::margin);
     m_grid->setVerticalSpacing(space::field / 2);
@@ -76,7 +80,7 @@ void ValueForm::add_row(const QString& caption)
     dress(*words, TextSize::secondary);
     auto* value = make_value();
     value->setAccessibleName(caption);
-    value->setMinimumHeight(value->fontMetrics().height());
+    value->setMinimumSize(least_value_width, value->fontMetrics().height());
     words->setBuddy(value);
     auto* hidden = make_hidden_mark();
     m_grid->addWidget(words, line, 0, Qt::AlignTop);
@@ -92,8 +96,9 @@ void ValueForm::set(int row, const QString& value, bool hidden)
     place.caption->setVisible(wanted);
     place.value->setVisible(wanted);
     place.value->setText(value);
+    place.value->setToolTip(value.size() > longest_without_tip ? value : QString());
     place.value->setFocusPolicy(value.isEmpty() ? Qt::NoFocus : Qt::StrongFocus);
     place.hidden->setVisible(hidden);
 }
 
-}
+} // namespace kindrel::desktop

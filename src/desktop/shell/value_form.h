@@ -42,4 +42,4 @@ private:
 /// A text that can be selected by mouse and keyboard.
 [[nodiscard]] QLabel* make_value();
 
-}
+} // namespace kindrel::desktop

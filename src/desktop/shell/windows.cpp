@@ -42,4 +42,4 @@ void bring_forward(QWidget& window)
     window.activateWindow();
 }
 
-}
+} // namespace kindrel::desktop

@@ -39,4 +39,4 @@ private:
 /// To the front, with the keyboard.
 void bring_forward(QWidget& window);
 
-}
+} // namespace kindrel::desktop
