@@ -23,6 +23,25 @@ void close_entries(core::Session& session, const std::vector<Membership>& left, 
 
 } // namespace
 
+std::vector<HistoryEntry> read_group_history(core::Session& session, int surname_id)
+{
+    auto rows = session.select(u"SELECT * FROM [qry_group_history] WHERE [person_id] IN "
+                               "(SELECT [person_id] FROM [tbl_people] WHERE [Surname_ID]=?) "
+                               "ORDER BY [date_in] DESC,[history_id] DESC;"_s,
+                               surname_id);
+    const auto person = rows.column(u"person_id");
+    const auto group = rows.column(u"group");
+    const auto date_in = rows.column(u"date_in");
+    const auto date_out = rows.column(u"date_out");
+    const auto completed = rows.column(u"completed");
+    std::vector<HistoryEntry> history;
+    for (const core::Row& row : rows) {
+        history.push_back(
+            {row.integer(person), row.text(group), row.date(date_in), row.date(date_out), row.flag(completed)});
+    }
+    return history;
+}
+
 void write_group_history(core::Session& session, const std::vector<Membership>& joined,
                          const std::vector<Membership>& left, const QDate& today)
 {

@@ -16,6 +16,19 @@ struct Membership
     auto operator<=>(const Membership&) const = default;
 };
 
+/// A person's time in a group, past or present.
+struct HistoryEntry
+{
+    int person_id = 0;
+    QString group; ///< As the list has it, else the name the group had when it was removed.
+    std::optional<core::Date> date_in;
+    std::optional<core::Date> date_out;
+    bool completed = false;
+};
+
+/// Of all people of a family, the latest joining first.
+[[nodiscard]] std::vector<HistoryEntry> read_group_history(core::Session& session, int surname_id);
+
 /// Writes what joining and leaving groups leaves behind: an open entry for each joined group, and the open entries of
 /// the left ones closed today. The only writer of group history, whoever changes the memberships. Call inside the
 /// transaction that does.

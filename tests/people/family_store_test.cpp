@@ -1,4 +1,5 @@
 #include "people/family_store.h"
+#include "people/group_history.h"
 #include "support/families.h"
 #include "support/processes.h"
 #include "support/test_church.h"
@@ -93,16 +94,16 @@ TEST_P(FamilyStoreTest, JoiningAndLeavingAGroupIsWrittenIntoItsHistory)
     file = save_family(session(), file, later);
     file = save_family(session(), file, QDate(2026, 12, 25));
 
-    auto rows = session().select(u"SELECT [group_id],[date_in],[date_out],[completed] FROM [qry_group_history] "
-                                 "WHERE [person_id]=? ORDER BY [group_id];"_s,
-                                 file.people[0].person_id);
     QStringList history;
-    for (const core::Row& row : rows) {
-        history += u"%1 %2 %3 %4"_s.arg(row.number(core::Column{0}))
-                       .arg(row.text(core::Column{1}), row.text(core::Column{2}))
-                       .arg(row.number(core::Column{3}));
+    for (const auto& entry : read_group_history(session(), file.family.Surname_ID)) {
+        if (entry.person_id == file.people[0].person_id)
+            history += u"%1 %2 %3 %4"_s.arg(entry.group, entry.date_in.value_or(Date{}).stored(),
+                                            entry.date_out.value_or(Date{}).stored(),
+                                            entry.completed ? u"left"_s : u"there"_s);
     }
-    EXPECT_EQ(history, (QStringList{u"1 2026-11-22  0"_s, u"2 2026-12-01  0"_s, u"3 2026-11-22 2026-12-01 -1"_s}));
+    history.sort();
+    EXPECT_EQ(history, (QStringList{u"group 1 2026-11-22  there"_s, u"group 2 2026-12-01  there"_s,
+                                    u"group 3 2026-11-22 2026-12-01 left"_s}));
 }
 
 TEST_P(FamilyStoreTest, ManyFamiliesComeInTheOrderAskedForAndMissingOnesAreLeftOut)

@@ -16,6 +16,8 @@ using namespace Qt::StringLiterals;
 namespace {
 
 constexpr int first_column_width = 170;
+/// With more columns than these, all but the first take what they need.
+constexpr std::size_t most_wide_columns = 3;
 
 QStringList words_of(const std::vector<const char*>& columns)
 {
@@ -44,6 +46,10 @@ CardListView::CardListView(const QString& title, const std::vector<const char*>&
     m_table->verticalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
     for (std::size_t column = 0; column + 1 < columns.size(); ++column)
         m_table->setColumnWidth(int(column), first_column_width);
+    if (columns.size() > most_wide_columns) {
+        m_table->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
+        m_table->horizontalHeader()->setSectionResizeMode(0, QHeaderView::Stretch);
+    }
     dress(*m_words, TextSize::secondary);
 
     auto* layout = new QVBoxLayout(this);

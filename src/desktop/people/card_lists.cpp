@@ -61,6 +61,17 @@ CardRows flexi_rows(const Person& person, const CardReader&)
     return rows_from(person.flexi, [](const LinkRow& row) { return QStringList{row.text, row.field, tagged(row)}; });
 }
 
+CardRows history_rows(const Person& person, const CardReader& reader)
+{
+    CardRows rows;
+    for (const auto& entry : reader.history) {
+        if (entry.person_id == person.person_id)
+            rows.push_back({entry.group, shown(entry.date_in, reader), shown(entry.date_out, reader),
+                            entry.completed ? u"Yes"_s : QString()});
+    }
+    return rows;
+}
+
 CardRows event_rows(const FamilyFile& file, const CardReader& reader)
 {
     CardRows rows;
@@ -123,6 +134,7 @@ const std::vector<PersonCardList>& group_lists()
     static const std::vector<PersonCardList> lists{
         {"Status", {}, item_rows<&Person::status, Person>, &RecordAccess::status},
         {"Groups", {}, item_rows<&Person::groups, Person>, &RecordAccess::groups},
+        {"Group history", {"Group", "In", "Out", "Completed:"}, history_rows, &RecordAccess::groups},
         {"Ministries", {}, ministry_rows, &RecordAccess::ministry},
         {"Occupations", {}, item_rows<&Person::occupations, Person>, &RecordAccess::occupation},
     };

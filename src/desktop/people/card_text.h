@@ -1,6 +1,7 @@
 #pragma once
 
 #include "people/disclosed.h"
+#include "people/group_history.h"
 #include "people/records.h"
 
 #include <QStringList>
@@ -15,6 +16,7 @@ struct CardReader
 {
     people::Disclosure disclosure;
     bool visits = true;
+    std::span<const people::HistoryEntry> history = {}; ///< Of all people of the family.
 };
 
 /// A caption and its value; a null `hidden` means that the value has no hidden twin.

@@ -154,6 +154,7 @@ bool FamilyCard::show_place(int place)
     }
     m_place = place;
     m_file = std::move(*file);
+    m_history = people::read_group_history(*m_desk.office.session, m_file.family.Surname_ID);
     show_family();
     return true;
 }
@@ -162,6 +163,7 @@ CardReader FamilyCard::reader() const
 {
     CardReader reader{people::Disclosure::of(m_desk.office)};
     reader.disclosure.pins = reader.disclosure.pins && m_file.access.pin;
+    reader.history = m_history;
     return reader;
 }
 

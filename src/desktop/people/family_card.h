@@ -46,6 +46,7 @@ private:
     std::vector<int> m_surname_ids;
     int m_place = 0;
     people::FamilyFile m_file;
+    std::vector<people::HistoryEntry> m_history;
     CardSections<people::FamilyFile> m_family;
     CardSections<people::Person> m_person;
     CardHeader* m_header;
