@@ -81,23 +81,24 @@ int run(desktop::Application& application, const Options& options)
     return options.pictures.isEmpty() ? QApplication::exec() : apps::take_pictures(running, look, options.pictures);
 }
 
-/// Pictures are taken without a display.
-bool wants_pictures(int count, char** words)
+/// Before any window: help and a wrong option need no display.
+Options options_of(int& count, char** words)
 {
-    return std::any_of(words, words + count,
-                       [](const char* word) { return QByteArray(word).startsWith("--pictures"); });
+    const QCoreApplication application(count, words);
+    return read_options(application);
 }
 
 } // namespace
 
 int main(int count, char** words)
 {
-    if (wants_pictures(count, words))
-        qputenv("QT_QPA_PLATFORM", "offscreen");
-    desktop::Application application(count, words);
     QCoreApplication::setApplicationName(u"kindrel"_s);
     QCoreApplication::setApplicationVersion(QStringLiteral(KINDREL_VERSION));
+    const Options options = options_of(count, words);
+    if (!options.pictures.isEmpty())
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    desktop::Application application(count, words);
     QGuiApplication::setApplicationDisplayName(core::product.toString());
     QGuiApplication::setQuitOnLastWindowClosed(false);
-    return run(application, read_options(application));
+    return run(application, options);
 }
