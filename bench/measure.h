@@ -18,6 +18,7 @@ public:
     void add(double milliseconds) { m_all.push_back(milliseconds); }
     [[nodiscard]] double median() const { return sorted()[m_all.size() / 2]; }
     [[nodiscard]] double best() const { return sorted().front(); }
+    [[nodiscard]] double worst() const { return sorted().back(); }
 
 private:
     [[nodiscard]] std::vector<double> sorted() const

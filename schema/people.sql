@@ -42,7 +42,7 @@ CREATE TABLE [tbl_personal_details] (
     [person_id] INTEGER PRIMARY KEY,
     [Title] TEXT,
     [birthdate] TEXT,
-    [school_year] INTEGER,                          -- never 0: -1 is the year before year 1, -2 kinder
+    [school_year] INTEGER CHECK ([school_year] <> 0), -- -1 is the year before year 1, -2 kinder
     [middle_name] TEXT,
     [other_surname] TEXT,
     [mobile_phone] TEXT,

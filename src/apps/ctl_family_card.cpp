@@ -1,6 +1,6 @@
 #include "apps/ctl_family_card.h"
 
-#include "apps/ctl_labels.h"
+#include "people/field_labels.h"
 #include "people/fields.h"
 #include "people/link_tables.h"
 #include "people/names.h"
@@ -71,6 +71,7 @@ public:
 
 private:
     [[nodiscard]] Part value(const char* name, int number) const;
+    [[nodiscard]] Part value(const char* name, std::optional<int> number) const;
     [[nodiscard]] Part value(const char* name, bool flag) const;
     [[nodiscard]] Part value(const char* name, const QString& text) const;
     [[nodiscard]] Part value(const char* name, const std::optional<core::Date>& date) const;
@@ -98,7 +99,7 @@ private:
 
 Part named(Part::Kind kind, const char* name)
 {
-    return {kind, QString::fromLatin1(name), label_of(name), {}, {}, {}};
+    return {kind, QString::fromLatin1(name), people::label_of(name), {}, {}, {}};
 }
 
 Part CardMaker::value(const char* name, int number) const
@@ -106,6 +107,15 @@ Part CardMaker::value(const char* name, int number) const
     auto part = named(Part::Kind::value, name);
     part.value = number;
     part.text = number ? QString::number(number) : QString();
+    return part;
+}
+
+Part CardMaker::value(const char* name, std::optional<int> number) const
+{
+    if (number)
+        return value(name, *number);
+    auto part = named(Part::Kind::value, name);
+    part.value = QJsonValue(QJsonValue::Null);
     return part;
 }
 

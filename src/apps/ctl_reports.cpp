@@ -23,7 +23,7 @@ Status write_report(Context& context, const output::ReportDefinition& report, pa
     const auto list = people::active_families(*context.office->session);
     core::SilentProgress progress;
     pages::PageSpool spool;
-    if (!output::run_report(report, {*context.office, list}, progress, spool, paper))
+    if (!output::run_report(report, {*context.office, list, {.paper = paper}}, progress, spool))
         return Status::refused;
     const pages::PdfProperties properties{QString::fromUtf8(report.leaf), context.office->church_name};
     if (!pages::write_pdf(spool, file, properties))

@@ -3,6 +3,8 @@
 #include "core/files.h"
 #include "desktop/output/preview_window.h"
 #include "desktop/people/family_card.h"
+#include "desktop/people/group_details_dialog.h"
+#include "desktop/people/quick_add_dialogs.h"
 #include "desktop/shell/main_window.h"
 #include "people/address_book.h"
 
@@ -19,6 +21,7 @@ using desktop::Appearance;
 namespace {
 
 constexpr QSize smallest_screen{1024, 690};
+constexpr QSize narrow_window{800, 560};
 
 /// Writes under "name-light.png" and "name-dark.png".
 class Camera
@@ -58,15 +61,49 @@ void take_cards(desktop::Desk& desk, Camera& camera)
     }
 }
 
+void open_area(desktop::Running& running, const QString& key)
+{
+    running.open_area(key);
+    QApplication::processEvents();
+}
+
 void take_reports(desktop::Running& running, Camera& camera)
 {
-    running.open_area(u"reports"_s);
+    open_area(running, u"reports"_s);
     camera.take(*running.window(), u"reports"_s);
     if (auto* preview = running.window()->findChild<QPushButton*>(u"preview"_s))
         preview->click();
     QApplication::processEvents();
     for (auto* window : running.desk()->windows.all<desktop::PreviewWindow>())
         camera.take(*window, u"preview"_s);
+}
+
+void take_setup_areas(desktop::Running& running, Camera& camera)
+{
+    for (const auto& key : {u"setup"_s, u"security"_s, u"network"_s}) {
+        open_area(running, key);
+        camera.take(*running.window(), key);
+    }
+}
+
+void take_dialog(QDialog& dialog, Camera& camera)
+{
+    dialog.show();
+    camera.take(dialog, dialog.objectName());
+}
+
+void take_dialogs(core::Office& office, Camera& camera)
+{
+    using people::SetupKind;
+    for (const auto kind : {SetupKind::occupations, SetupKind::suburbs}) {
+        desktop::QuickAddDialog dialog(office, kind, {});
+        take_dialog(dialog, camera);
+    }
+    const auto groups = people::read_setup_items(*office.session, SetupKind::groups);
+    if (groups.empty())
+        return;
+    desktop::GroupDetailsDialog dialog(office, groups.front().key, groups.front().text);
+    take_dialog(dialog, camera);
 }
 
 } // namespace
@@ -108,6 +145,11 @@ int take_pictures(desktop::Running& running, desktop::Look& look, const QString&
     camera.take(*running.window(), u"main-menu"_s);
     take_cards(*running.desk(), camera);
     take_reports(running, camera);
+    take_setup_areas(running, camera);
+    take_dialogs(running.desk()->office, camera);
+    open_area(running, u"main_menu"_s);
+    running.window()->resize(narrow_window);
+    camera.take(*running.window(), u"main-menu-narrow"_s);
     return camera.failed() ? 1 : 0;
 }
 

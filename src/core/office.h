@@ -3,6 +3,7 @@
 #include "core/clock.h"
 #include "core/dialogue.h"
 #include "core/paths.h"
+#include "core/person_guard.h"
 #include "core/plugin_catalogue.h"
 #include "core/rights.h"
 #include "core/session.h"
@@ -11,6 +12,7 @@
 #include "core/workstation.h"
 
 #include <memory>
+#include <vector>
 
 namespace kindrel::core {
 
@@ -36,6 +38,7 @@ struct Office
     Workstation& workstation;
     Dialogue& dialogue;
     Clock& clock;
+    std::vector<const PersonGuard*> person_guards = {}; ///< Of the rooms above; they outlive the office.
 
     [[nodiscard]] bool may(Area area) const { return rights.may(area); }
     /// Whether several workstations can be in this church at once.

@@ -27,15 +27,6 @@ std::optional<Marker> wait_for_turn(const Paths& paths, Clock& clock, Progress& 
     return std::nullopt;
 }
 
-/// Null when it did not become this workstation's turn.
-std::unique_ptr<Session> connect_in_turn(const Paths& paths, Mode mode, Clock& clock, Progress& progress)
-{
-    if (mode != Mode::network)
-        return connect_church(paths);
-    const auto turn = wait_for_turn(paths, clock, progress);
-    return turn ? connect_church(paths) : nullptr;
-}
-
 void prime(Session& session)
 {
     auto rows = session.select(u"SELECT COUNT(*) FROM [qry_search_window];"_s);
@@ -90,6 +81,14 @@ std::unique_ptr<Session> connect_church(const Paths& paths)
     return connection ? open_postgres(QString::fromUtf8(*connection).trimmed()) : open_sqlite(paths.database());
 }
 
+std::unique_ptr<Session> connect_in_turn(const Paths& paths, Mode mode, Clock& clock, Progress& progress)
+{
+    if (mode != Mode::network)
+        return connect_church(paths);
+    const auto turn = wait_for_turn(paths, clock, progress);
+    return turn ? connect_church(paths) : nullptr;
+}
+
 std::unique_ptr<Session> open_church(const Paths& paths, Mode mode, Dialogue& dialogue, Clock& clock,
                                      Progress& progress)
 {
@@ -116,6 +115,15 @@ Message unable_to_connect(const QString& why)
         "deleted, or another program has locked you out of the database file, if this is so try rebooting your "
         "computer. Kindrel is now going to shut down."_s,
         why);
+}
+
+Message busy_notice()
+{
+    return information(
+        u"Unable to Enter Kindrel"_s,
+        u"Another user is either compacting files, upgrading them, backing them up, restoring files or booking out "
+        "families. Please try latter. If you are permanently locked out of Kindrel then use the Kindrel Mender program "
+        "to unlock Kindrel"_s);
 }
 
 bool network_guard(const Office& office)

@@ -13,6 +13,8 @@ inline constexpr QStringView connection_file = u"KR10_records.server";
 /// Opens what the church folder names: the server of the connection file, else the church file. Throws DatabaseError
 /// or FileError.
 [[nodiscard]] std::unique_ptr<Session> connect_church(const Paths& paths);
+/// The same, in network mode behind the `security.dat` looks. Null when it did not become this workstation's turn.
+[[nodiscard]] std::unique_ptr<Session> connect_in_turn(const Paths& paths, Mode mode, Clock& clock, Progress& progress);
 
 /// Opens the church's session behind the `security.dat` looks of network mode. On failure the stated message is shown
 /// and null is returned: the program ends.
@@ -21,6 +23,8 @@ inline constexpr QStringView connection_file = u"KR10_records.server";
 
 /// The box of a database that cannot be opened or read; `why` stands beneath.
 [[nodiscard]] Message unable_to_connect(const QString& why);
+/// The box of a church whose busy marker is there: somebody works on its whole database.
+[[nodiscard]] Message busy_notice();
 
 /// True while the church's database is reachable; false after telling the person that it is not.
 [[nodiscard]] bool network_guard(const Office& office);

@@ -6,6 +6,8 @@
 #include <QFileInfo>
 #include <QStringList>
 
+#include <algorithm>
+
 namespace kindrel::core {
 
 using namespace Qt::StringLiterals;
@@ -73,16 +75,23 @@ QString moved_root(const QString& root, Mode mode)
     return mode == Mode::booked_out ? inside(root, u"booked out"_s) : root;
 }
 
+constexpr int most_letters = 7;
+
+/// A name of few letters is looked up in each spelling: listing a folder of 60,000 photographs for one that is not
+/// there would take a tenth of a second.
 QString existing_part(const QString& folder, const QString& name)
 {
     if (QFileInfo::exists(folder + name))
         return name;
-    const auto found = QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot, QDir::Name);
-    for (const auto& entry : found) {
-        if (entry.compare(name, Qt::CaseInsensitive) == 0)
-            return entry;
-    }
-    return name;
+    const auto letters = std::ranges::count_if(name, [](QChar c) { return c.toLower() != c.toUpper(); });
+    const bool few = letters <= most_letters;
+    const auto names = few ? spellings(name)
+                           : QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot, QDir::Name);
+    const auto is_it = [&](const QString& each) {
+        return few ? QFileInfo::exists(folder + each) : each.compare(name, Qt::CaseInsensitive) == 0;
+    };
+    const auto found = std::ranges::find_if(names, is_it);
+    return found == names.end() ? name : *found;
 }
 
 } // namespace
@@ -119,6 +128,20 @@ bool Paths::exists(Folder folder, const QString& name) const
 QString Paths::database() const
 {
     return file(Folder::church, u"KR10_records.kdl"_s);
+}
+
+QStringList spellings(const QString& name)
+{
+    QStringList found{QString()};
+    for (const QChar c : name) {
+        const QChar other = c.isUpper() ? c.toLower() : c.toUpper();
+        const auto begun = found.size();
+        for (qsizetype i = 0; other != c && i < begun; ++i)
+            found += found[i] + other;
+        for (qsizetype i = 0; i < begun; ++i)
+            found[i] += c;
+    }
+    return found;
 }
 
 QString existing_name(const QString& folder, const QString& name)

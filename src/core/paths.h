@@ -1,6 +1,6 @@
 #pragma once
 
-#include <QString>
+#include <QStringList>
 
 #include <array>
 
@@ -58,6 +58,9 @@ private:
     QString m_data_drive;
     std::array<QString, folder_count> m_folders;
 };
+
+/// The name in every mixture of small and capital letters, as it is given first: two to the power of its letters.
+[[nodiscard]] QStringList spellings(const QString& name);
 
 /// The spelling of `name` that exists in `folder`, found without regard to case; `name` itself when there is none.
 /// A name of several parts has them separated by "/".

@@ -19,11 +19,6 @@ namespace {
 constexpr int depth_of_256_colours = 8;
 constexpr QSize smallest_display{1024, 768};
 
-const QString unable_to_enter = u"Unable to Enter Kindrel"_s;
-const QString another_user =
-    u"Another user is either compacting files, upgrading them, backing them up, restoring files or booking "
-    "out families. Please try latter. If you are permanently locked out of Kindrel then use the Kindrel "
-    "Mender program to unlock Kindrel"_s;
 const QString newer_edition = u"A newer edition of Kindrel has been installed on your network."_s;
 const QString newer_edition_advice =
     u"At least one of the workstations on your network has been upgraded with a new edition of Kindrel; most "
@@ -54,11 +49,6 @@ const QString too_few_colours =
 const QString display_too_small =
     u"Your display is smaller than 1024 X 768. Please set it to at least this size so that every part of "
     "Kindrel can be seen."_s;
-
-Message busy_notice()
-{
-    return information(unable_to_enter, another_user);
-}
 
 /// Why the work failed; nullopt when it did not.
 template <class Work>

@@ -116,6 +116,7 @@ std::vector<User> load_users(Session& session)
 bool enter_by_password(Office& office, Progress& progress, const EntryRules& rules)
 {
     const Message question{.text = u"Please enter your password to gain access to %1."_s.arg(product),
+                           .more = office.church_name,
                            .caption = product.toString(),
                            .icon = Icon::question};
     for (int wrong_ones = 0; rules.tries == 0 || wrong_ones < rules.tries;) {

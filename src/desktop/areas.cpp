@@ -3,8 +3,12 @@
 #include "desktop/core/network_page.h"
 #include "desktop/core/security_page.h"
 #include "desktop/output/catalogue_page.h"
+#include "desktop/people/editor_page.h"
+#include "desktop/people/filters_page.h"
+#include "desktop/people/fusion_page.h"
 #include "desktop/people/main_menu.h"
 #include "desktop/people/setup_page.h"
+#include "desktop/people/tagging_page.h"
 
 #include <array>
 
@@ -26,11 +30,19 @@ Page* enter(Desk& desk)
 }
 
 constexpr std::array areas{
-    AreaDefinition{"main_menu", "Main Menu", "go-home", std::nullopt, make<MainMenu>},
-    AreaDefinition{"reports", "Reports", "office-report", core::Area::report_outputs, make<CataloguePage>},
-    AreaDefinition{"setup", "Setup", "settings-configure", core::Area::family_file_setup, enter<SetupPage>},
-    AreaDefinition{"security", "Security", "object-locked", core::Area::security, enter<SecurityPage>},
-    AreaDefinition{"network", "Network", "network-workgroup", core::Area::network_setup, enter<NetworkPage>},
+    AreaDefinition{"main_menu", "Main Menu", "go-home", std::nullopt, Parked::stay, make<MainMenu>},
+    AreaDefinition{"editor", "Family Editor", "user-identity", std::nullopt, Parked::setups_leave, enter<EditorPage>},
+    AreaDefinition{"filters", "Filters", "view-filter", core::Area::search_for_family, Parked::stay, make<FiltersPage>},
+    AreaDefinition{"tagging", "Tagging", "tag", core::Area::tagging, Parked::setups_leave, enter<TaggingPage>},
+    AreaDefinition{"reports", "Reports", "office-report", core::Area::report_outputs, Parked::stay,
+                   make<CataloguePage>},
+    AreaDefinition{"setup", "Setup", "settings-configure", core::Area::family_file_setup, Parked::leave_first,
+                   enter<SetupPage>},
+    AreaDefinition{"fusions", "Fusions", "merge", core::Area::filter_fusion_setup, Parked::stay, enter<FusionPage>},
+    AreaDefinition{"security", "Security", "object-locked", core::Area::security, Parked::leave_first,
+                   enter<SecurityPage>},
+    AreaDefinition{"network", "Network", "network-workgroup", core::Area::network_setup, Parked::leave_first,
+                   enter<NetworkPage>},
 };
 
 } // namespace

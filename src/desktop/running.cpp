@@ -2,6 +2,7 @@
 
 #include "desktop/areas.h"
 #include "desktop/church_choice.h"
+#include "desktop/people/editor_page.h"
 #include "desktop/shell/main_window.h"
 #include "desktop/shell/page.h"
 
@@ -64,7 +65,40 @@ void Running::find_family()
 
 void Running::open_area(const QString& key)
 {
-    m_window->open_area(key);
+    QMetaObject::invokeMethod(
+        m_window.get(), [this, key] { m_window->open_area(key); }, Qt::QueuedConnection);
+}
+
+void Running::in_editor(std::function<bool(EditorPage&)> act)
+{
+    QMetaObject::invokeMethod(
+        m_window.get(),
+        [this, act = std::move(act)] {
+            const auto key = u"editor"_s;
+            const bool parked = m_window->page_of(key);
+            m_window->open_area(key);
+            auto* page = qobject_cast<EditorPage*>(m_window->page());
+            if (page && !act(*page) && !parked)
+                Q_EMIT page->finished();
+        },
+        Qt::QueuedConnection);
+}
+
+void Running::open_family(int surname_id, std::vector<int> among, const QString& among_name)
+{
+    in_editor([surname_id, among = std::move(among), among_name](EditorPage& page) {
+        return page.open_family(surname_id, among, among_name);
+    });
+}
+
+void Running::new_family()
+{
+    in_editor([](EditorPage& page) { return page.new_family(); });
+}
+
+void Running::open_draft(int surname_id)
+{
+    in_editor([surname_id](EditorPage& page) { return page.open_draft(surname_id); });
 }
 
 void Running::load_church(int church)

@@ -8,6 +8,7 @@
 
 namespace kindrel::desktop {
 
+class EditorPage;
 class MainWindow;
 class QtDialogue;
 
@@ -42,9 +43,14 @@ public:
 
     void find_family() override;
     void open_area(const QString& key) override;
+    void open_family(int surname_id, std::vector<int> among, const QString& among_name) override;
+    void new_family() override;
+    void open_draft(int surname_id) override;
     void load_church(int church) override;
 
 private:
+    /// Enters the editor; it is closed again when nothing could be opened in it.
+    void in_editor(std::function<bool(EditorPage&)> act);
     void switch_to(int church);
     void build();
     void close();

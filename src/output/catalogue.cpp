@@ -37,6 +37,8 @@ bool may_run(const ReportDefinition& report, const ReportInput& input)
 {
     if (!core::permitted(input.office, report.area))
         return false;
+    if (input.options.hidden_details && !core::permitted(input.office, core::Area::security))
+        return false;
     if (input.list.members.empty())
         input.office.dialogue.show({u"No people found for creating a report"_s});
     return !input.list.members.empty();
@@ -57,15 +59,17 @@ const ReportDefinition* find_report(QStringView key_or_leaf)
 }
 
 bool run_report(const ReportDefinition& report, const ReportInput& input, core::Progress& progress,
-                pages::PageSpool& spool, pages::Paper paper)
+                pages::PageSpool& spool)
 {
     if (!may_run(report, input))
         return false;
     const auto& layout = layout_of(report);
     auto setup = layout.page;
-    setup.paper = paper;
-    pages::Flow flow(spool, setup, pages::TypeScale::around({.size = layout.text_size}));
-    decorate(flow, QString::fromUtf8(layout.title), input);
+    const auto& options = input.options;
+    setup.paper = options.paper;
+    const double text_size = layout.text_size * options.text_percent / 100;
+    pages::Flow flow(spool, setup, pages::TypeScale::around({.size = text_size}));
+    decorate(flow, options.title.isEmpty() ? QString::fromUtf8(layout.title) : options.title, input);
     if (!report.write(input, report.layout, progress, flow))
         return false;
     flow.finish();

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "core/office.h"
+#include "output/run_options.h"
 #include "pages/flow.h"
 #include "people/working_list.h"
 
@@ -12,6 +13,7 @@ struct ReportInput
 {
     core::Office& office;
     const people::WorkingList& list;
+    RunOptions options = {};
 };
 
 /// A leaf of the catalogue's tree. Leaves of one family follow each other.
@@ -30,6 +32,6 @@ struct ReportDefinition
 /// Writes the report of the working list's people into the spool and closes it. False when it was refused, which the
 /// person has been told, or cancelled; the spool then stays open. Throws core::DatabaseError and core::FileError.
 [[nodiscard]] bool run_report(const ReportDefinition& report, const ReportInput& input, core::Progress& progress,
-                              pages::PageSpool& spool, pages::Paper paper = pages::Paper::a4);
+                              pages::PageSpool& spool);
 
 } // namespace kindrel::output

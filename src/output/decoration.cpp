@@ -37,6 +37,7 @@ struct Header
 struct Footer
 {
     QString title;
+    QString note;
     Statement vision;
     qreal line = 0; ///< Above everything; 0 for none.
 };
@@ -65,15 +66,16 @@ Header header_of(const ReportInput& input, const QString& title, const pages::Ty
 {
     const auto& office = input.office;
     const auto& settings = office.settings;
+    const auto parts = input.options.head.value_or(HeadParts::of(settings));
     Header header;
     header.title = title;
-    if (settings.title_church)
+    if (parts.church)
         header.church = office.church_name;
-    if (settings.title_logo && !office.logo.isEmpty())
+    if (parts.logo && !office.logo.isEmpty())
         header.logo = pages::Picture::from_file(office.logo, logo_room);
-    if (settings.title_date)
+    if (parts.date)
         header.date = u"Report Date - "_s + core::Date::from(office.clock.today()).shown(office.day_order());
-    if (settings.title_filters && !input.list.criteria.isEmpty())
+    if (parts.filters && !input.list.criteria.isEmpty())
         header.filters = u"Filters in Use = "_s + input.list.criteria;
     if (settings.Include_vision_reports)
         header.vision = statement(settings, settings.vision, type.body);
@@ -89,7 +91,8 @@ Footer footer_of(const ReportInput& input, const QString& title, const pages::Ty
     if (settings.include_vision_footer)
         lines = {settings.footer_vision, settings.footer_vision_line2};
     lines.removeAll(QString());
-    return {title, statement(settings, lines.join(u'\n'), type.small), settings.footer_line ? thin_line : 0};
+    const QString note = input.options.hidden_details ? hidden_details_note.toString() : QString();
+    return {title, note, statement(settings, lines.join(u'\n'), type.small), settings.footer_line ? thin_line : 0};
 }
 
 void write_title(pages::Writer& place, const Header& header)
@@ -151,7 +154,7 @@ void write_footer(pages::Writer& band, const Footer& footer, int number)
     if (footer.line > 0)
         band.rule({.thickness = footer.line, .colour = pages::ink::black, .before = 0, .after = 3});
     write_vision(band, footer.vision);
-    band.spread(footer.title, {}, u"Page %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
+    band.spread(footer.title, footer.note, u"Page %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
 }
 
 } // namespace

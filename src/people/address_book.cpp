@@ -43,9 +43,14 @@ const ListRow& row_of(FamilyList list)
     return list_table[static_cast<std::size_t>(list)];
 }
 
-QString statement_of(const ListRow& list)
+QString statement_of(const ListRow& list, bool of_a_group)
 {
-    const auto where = list.condition.isEmpty() ? QString() : u" WHERE %1"_s.arg(list.condition);
+    QStringList conditions{list.condition.toString()};
+    if (of_a_group)
+        conditions +=
+            u"[surname_id] IN (SELECT g.[surname_id] FROM [tbl_family_group] g WHERE g.[family_group_id]=?)"_s;
+    conditions.removeAll(QString());
+    const auto where = conditions.isEmpty() ? QString() : u" WHERE %1"_s.arg(conditions.join(u" AND "_s));
     return u"SELECT * FROM [%1]%2 ORDER BY [sort_key],[Primary_name],[surname_id];"_s.arg(list.query, where);
 }
 
@@ -81,9 +86,13 @@ QString family_list_name(FamilyList list)
     return row_of(list).name.toString();
 }
 
-std::vector<AddressBookEntry> read_address_book(core::Session& session, FamilyList list, bool use_preferred_names)
+std::vector<AddressBookEntry> read_address_book(core::Session& session, FamilyList list, bool use_preferred_names,
+                                                std::optional<int> family_group)
 {
-    auto rows = session.select(statement_of(row_of(list)));
+    std::vector<core::Value> values;
+    if (family_group)
+        values.push_back(core::to_value(*family_group));
+    auto rows = session.select_with(statement_of(row_of(list), family_group.has_value()), values);
     const BookColumns columns(rows);
     std::vector<AddressBookEntry> entries;
     for (const core::Row& row : rows) {

@@ -26,9 +26,10 @@ struct AddressBookEntry
     QString phone; ///< Empty where hidden.
 };
 
-/// In order of surname and first name. One statement.
+/// In order of surname and first name; those of one family group alone where its key is given. One statement.
 [[nodiscard]] std::vector<AddressBookEntry> read_address_book(core::Session& session, FamilyList list,
-                                                              bool use_preferred_names);
+                                                              bool use_preferred_names,
+                                                              std::optional<int> family_group = {});
 
 struct FamilyTotal
 {

@@ -63,12 +63,23 @@ void blank_hidden(Record& record, const Twins& twins)
     }
 }
 
+void blank_address(FamilyFile& file)
+{
+    blank_hidden(file.address, address_twins);
+    if (file.address.res_hidden)
+        file.residential.reset();
+    if (file.address.post_hidden)
+        file.postal.reset();
+}
+
 void blank_person(Person& person, const Disclosure& disclosure)
 {
-    blank_hidden(person, person_twins);
-    if (person.Bussiness_hidden)
+    const bool hides = !disclosure.hidden_details;
+    if (hides)
+        blank_hidden(person, person_twins);
+    if (hides && person.Bussiness_hidden)
         person.occupations.clear();
-    if (person.birthdate_hidden || !disclosure.birth_dates)
+    if ((hides && person.birthdate_hidden) || !disclosure.birth_dates)
         person.birthdate.reset();
     if (!disclosure.pins)
         person.personal_pin.clear();
@@ -93,11 +104,8 @@ DisclosedFamily disclose(FamilyFile file, const Disclosure& disclosure)
     DisclosedFamily disclosed;
     disclosed.m_use_preferred_names = disclosure.use_preferred_names;
     disclosed.m_day_order = disclosure.day_order;
-    blank_hidden(file.address, address_twins);
-    if (file.address.res_hidden)
-        file.residential.reset();
-    if (file.address.post_hidden)
-        file.postal.reset();
+    if (!disclosure.hidden_details)
+        blank_address(file);
     for (auto& person : file.people)
         blank_person(person, disclosure);
     disclosed.m_file = std::move(file);

@@ -12,11 +12,12 @@ struct Disclosure
     bool birth_dates = true;
     bool pins = true;
     core::DayOrder day_order = core::DayOrder::day_first;
+    bool hidden_details = false; ///< What is hidden shows too, for the office's own eyes.
 
     [[nodiscard]] static Disclosure of(const core::Office& office);
 };
 
-/// A family with everything hidden or not permitted already blanked; the only form in which output ever sees one.
+/// A family with everything that the reader may not see already blanked; the only form in which output ever sees one.
 /// Made by disclose() alone.
 class DisclosedFamily
 {

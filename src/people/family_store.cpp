@@ -1,10 +1,14 @@
 #include "people/family_store.h"
 
 #include "core/removal.h"
+#include "people/family_checks.h"
 #include "people/family_rows.h"
+#include "people/fields.h"
 #include "people/group_history.h"
+#include "people/person_files.h"
 
 #include <algorithm>
+#include <array>
 
 namespace kindrel::people {
 
@@ -110,6 +114,7 @@ FamilyFile save_family(Session& session, FamilyFile file, const QDate& today)
         add_families(session, files, today);
         return std::move(files.front());
     }
+    require_storable(file);
     allocate_people(session, {&file, 1});
     number_positions(file);
     file.family.last_edit = core::Date::from(today);
@@ -119,10 +124,41 @@ FamilyFile save_family(Session& session, FamilyFile file, const QDate& today)
     return file;
 }
 
+void remove_family_rows(Session& session, int surname_id)
+{
+    core::Transaction transaction(session);
+    core::remove_entities(session, Entity::surname, std::array{surname_id});
+    transaction.commit();
+}
+
+void remove_family_files(const core::Office& office, const FamilyFile& file)
+{
+    auto files = files_of_family(file.family.Surname_ID);
+    for (const auto& person : file.people)
+        std::ranges::move(files_of_person(person.person_id), std::back_inserter(files));
+    remove_files(office.paths, files);
+}
+
+void remove_stored_family(core::Office& office, const FamilyFile& file)
+{
+    remove_family_rows(*office.session, file.family.Surname_ID);
+    remove_family_files(office, file);
+}
+
+void add_visit(Session& session, int surname_id, const Visit& visit)
+{
+    QStringList fields{u"surname_id"_s};
+    append_names(fields, visit_fields());
+    std::vector<std::vector<core::Value>> rows{{to_value(surname_id)}};
+    append_values(rows.front(), visit, visit_fields());
+    session.insert(u"tbl_visitation"_s, fields, rows);
+}
+
 void add_families(Session& session, std::vector<FamilyFile>& files, const QDate& today)
 {
     if (files.empty())
         return;
+    std::ranges::for_each(files, require_storable);
     int key = session.allocate(Entity::surname, static_cast<int>(files.size()));
     allocate_people(session, files);
     FamilyRows rows;

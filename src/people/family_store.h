@@ -1,6 +1,6 @@
 #pragma once
 
-#include "core/session.h"
+#include "core/office.h"
 #include "people/records.h"
 
 #include <span>
@@ -24,8 +24,19 @@ enum class Extent {
 /// Writes the whole set as one transaction: rows of people and items that are no longer in the file go, the others
 /// are rewritten. New families and people get their keys, positions are renumbered, `Primary_name` and `last_edit`
 /// are set; the file comes back as it was stored. A new file's `created` is `today`. Visits and booking state are left
-/// alone on a family that exists. Throws core::DatabaseError, and then nothing is written.
+/// alone on a family that exists. Throws core::DatabaseError, or std::logic_error for a family that must never be
+/// stored (see require_storable()), and then nothing is written.
 [[nodiscard]] FamilyFile save_family(core::Session& session, FamilyFile file, const QDate& today);
+
+/// Deletes a family with everything that goes with it, and then its files and those of its people. What outlives them
+/// stays: giving, attendance, audits. Throws core::DatabaseError, and then nothing is gone, or core::FileError.
+void remove_stored_family(core::Office& office, const FamilyFile& file);
+/// The halves of it: the rows, and the files.
+void remove_family_rows(core::Session& session, int surname_id);
+void remove_family_files(const core::Office& office, const FamilyFile& file);
+
+/// Adds an entry to the visits, which a save leaves alone.
+void add_visit(core::Session& session, int surname_id, const Visit& visit);
 
 /// Many new families in few statements; all keys must be 0. For making and importing churches.
 void add_families(core::Session& session, std::vector<FamilyFile>& files, const QDate& today);

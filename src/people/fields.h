@@ -14,7 +14,9 @@ template <class Record>
 struct Field
 {
     const char* name;
-    std::variant<int Record::*, bool Record::*, QString Record::*, std::optional<core::Date> Record::*> member;
+    std::variant<int Record::*, bool Record::*, QString Record::*, std::optional<core::Date> Record::*,
+                 std::optional<int> Record::*>
+        member;
 };
 
 [[nodiscard]] std::span<const Field<Family>> family_fields(); ///< Without key, `Condition` and the booking state.
@@ -30,6 +32,12 @@ struct Field
 inline void read_cell(const core::Row& row, core::Column column, int& value)
 {
     value = row.integer(column);
+}
+/// A number that may be missing is never 0.
+inline void read_cell(const core::Row& row, core::Column column, std::optional<int>& value)
+{
+    const int number = row.integer(column);
+    value = number ? std::optional(number) : std::nullopt;
 }
 inline void read_cell(const core::Row& row, core::Column column, bool& value)
 {

@@ -6,18 +6,29 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+/// The entries of the lent memberships that a condition on `h` holds for.
+QString entries_where(const QString& condition)
+{
+    return u"[history_id] IN (SELECT h.[history_id] FROM [work_memberships] w INNER JOIN [tbl_group_history] h "
+           "ON h.[person_id]=w.[person_id] AND h.[group_id]=w.[group_id] WHERE %1);"_s.arg(condition);
+}
+
+void lend(core::Session& session, const std::vector<Membership>& memberships)
+{
+    std::vector<std::vector<core::Value>> rows;
+    for (qint64 place = 0; const auto& [person, group] : memberships)
+        rows.push_back({++place, core::to_value(person), core::to_value(group)});
+    session.fill_temporary(u"work_memberships"_s, {u"place"_s, u"person_id"_s, u"group_id"_s}, rows);
+}
+
 /// One statement, whatever the number of memberships.
 void close_entries(core::Session& session, const std::vector<Membership>& left, const core::Date& date)
 {
     if (left.empty())
         return;
-    std::vector<std::vector<core::Value>> rows;
-    for (qint64 place = 0; const auto& [person, group] : left)
-        rows.push_back({++place, core::to_value(person), core::to_value(group)});
-    session.fill_temporary(u"work_left"_s, {u"place"_s, u"person_id"_s, u"group_id"_s}, rows);
-    session.execute(u"UPDATE [tbl_group_history] SET [date_out]=?, [completed]=-1 WHERE [history_id] IN "
-                    "(SELECT h.[history_id] FROM [work_left] w INNER JOIN [tbl_group_history] h "
-                    "ON h.[person_id]=w.[person_id] AND h.[group_id]=w.[group_id] WHERE h.[completed]=0);"_s,
+    lend(session, left);
+    session.execute(u"UPDATE [tbl_group_history] SET [date_out]=?, [completed]=-1 WHERE "_s +
+                        entries_where(u"h.[completed]=0"_s),
                     date);
 }
 
@@ -57,6 +68,22 @@ void write_group_history(core::Session& session, const std::vector<Membership>& 
     }
     session.insert(u"tbl_group_history"_s,
                    {u"history_id"_s, u"person_id"_s, u"group_id"_s, u"date_in"_s, u"completed"_s}, rows);
+}
+
+void take_back_group_history(core::Session& session, const std::vector<Membership>& memberships, HistoryAct act,
+                             const QDate& day)
+{
+    if (memberships.empty())
+        return;
+    lend(session, memberships);
+    const auto date = core::Date::from(day);
+    if (act == HistoryAct::joining)
+        session.execute(
+            u"DELETE FROM [tbl_group_history] WHERE "_s + entries_where(u"h.[completed]=0 AND h.[date_in]=?"_s), date);
+    else
+        session.execute(u"UPDATE [tbl_group_history] SET [date_out]=NULL, [completed]=0 WHERE "_s +
+                            entries_where(u"h.[completed]=-1 AND h.[date_out]=?"_s),
+                        date);
 }
 
 } // namespace kindrel::people

@@ -35,4 +35,11 @@ struct HistoryEntry
 void write_group_history(core::Session& session, const std::vector<Membership>& joined,
                          const std::vector<Membership>& left, const QDate& today);
 
+enum class HistoryAct { joining, leaving };
+
+/// Takes back what write_group_history() wrote on a day: entries of joining go, entries of leaving are open again.
+/// Those that something has happened to since stay. Call inside the transaction that takes the memberships back.
+void take_back_group_history(core::Session& session, const std::vector<Membership>& memberships, HistoryAct act,
+                             const QDate& day);
+
 } // namespace kindrel::people

@@ -1,5 +1,7 @@
 #include "people/quick_add.h"
 
+#include "core/entry.h"
+#include "core/open_church.h"
 #include "people/setup_rows.h"
 
 #include <algorithm>
@@ -33,12 +35,25 @@ int add_at_end(core::Session& session, const SetupList& list, SetupItem item)
     return item.key;
 }
 
+/// Whoever sets up the lists may add to them, and so may whoever fills in families.
+bool may_add(const core::Office& office)
+{
+    if (office.may(core::Area::family_file_setup))
+        return true;
+    if (!core::may_enter(office, core::AreaId::family_editor))
+        return core::permitted(office, core::Area::family_file_setup);
+    if (!office.may(core::Area::read_only_family_data))
+        return true;
+    office.dialogue.show({u"Unable to add this item as you only have read only access within family files"_s});
+    return false;
+}
+
 std::optional<int> add(core::Office& office, SetupKind kind, const SetupItem& item)
 {
-    if (office.may(core::Area::read_only_family_data) && !office.may(core::Area::family_file_setup))
-        return refused(office, {u"Unable to add this item as you only have read only access within family files"_s});
     if (const auto message = too_long(item))
         return refused(office, *message);
+    if (!may_add(office) || !core::network_guard(office))
+        return std::nullopt;
     return add_at_end(*office.session, setup_list(kind), item);
 }
 

@@ -109,7 +109,7 @@ struct Person
 
     QString Title;
     std::optional<core::Date> birthdate;
-    int school_year = 0; ///< 0: none. 1 upwards for school years, -1 the year before, -2 kinder.
+    std::optional<int> school_year; ///< Never 0: 1 upwards for school years, -1 the year before, -2 kinder.
     QString middle_name, other_surname;
     QString mobile_phone, Personal_email;
     QString business_phone, business_fax, business_email;

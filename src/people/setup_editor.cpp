@@ -1,6 +1,7 @@
 #include "people/setup_editor.h"
 
 #include "core/entry.h"
+#include "core/open_church.h"
 #include "people/setup_import.h"
 #include "people/setup_rows.h"
 #include "people/sort_key.h"
@@ -236,8 +237,7 @@ std::optional<int> SetupEditor::group_for_details(int group_index)
     if (groups[group_index].key == 0) {
         const Message question{u"Unable to access this groups details as this is a new group and needs to be created "
                                "and saved first. Save this group now and then access this groups details?"_s};
-        if (!m_office.dialogue.confirm(question, Answer::no) ||
-            !core::permitted(m_office, core::Area::family_file_setup))
+        if (!m_office.dialogue.confirm(question, Answer::no) || !may_save())
             return std::nullopt;
         save_list(SetupKind::groups);
     }
@@ -249,9 +249,14 @@ bool SetupEditor::altered() const
     return std::ranges::any_of(m_lists, &List::altered);
 }
 
+bool SetupEditor::may_save() const
+{
+    return core::permitted(m_office, core::Area::family_file_setup) && core::network_guard(m_office);
+}
+
 bool SetupEditor::save()
 {
-    if (!core::permitted(m_office, core::Area::family_file_setup))
+    if (!may_save())
         return false;
     for (const auto& list : setup_lists())
         save_list(list.kind);

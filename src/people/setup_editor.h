@@ -55,8 +55,8 @@ public:
 
     [[nodiscard]] bool altered() const;
     /// Each altered list in a transaction of its own; items that other workstations have added meanwhile are kept at
-    /// the end. False without the right. Throws core::DatabaseError: the lists before the failing one are stored, and
-    /// save() may be tried again.
+    /// the end. False, after saying why, without the right or the connection. Throws core::DatabaseError: the lists
+    /// before the failing one are stored, and save() may be tried again.
     [[nodiscard]] bool save();
 
 private:
@@ -64,6 +64,7 @@ private:
     bool refuse(const core::Message& message) const;
     /// Whether text and postcode may stand in the list beside all items but the one at `except`.
     [[nodiscard]] bool fits(SetupKind kind, const SetupItem& item, int except) const;
+    [[nodiscard]] bool may_save() const;
     void save_list(SetupKind kind);
     [[nodiscard]] List& at(SetupKind kind) { return m_lists[static_cast<std::size_t>(kind)]; }
 

@@ -159,6 +159,15 @@ QString tidy(const QString& text)
     return text.normalized(QString::NormalizationForm_C).trimmed();
 }
 
+int faulty_field(SetupKind kind, const QString& text, const QString& postcode)
+{
+    const auto fits = [](const QString& typed) {
+        const auto size = tidy(typed).size();
+        return size > 0 && size <= longest_setup_text;
+    };
+    return kind == SetupKind::suburbs && fits(text) && !fits(postcode) ? 1 : 0;
+}
+
 QString sameness(const QString& text, const QString& postcode)
 {
     return tidy(text).toUpper() + u'\n' + tidy(postcode).toUpper();

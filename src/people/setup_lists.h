@@ -74,6 +74,8 @@ inline constexpr int longest_setup_text = 255;
 
 /// A typed or read text as it is stored: without blanks around it, accents joined to their letters.
 [[nodiscard]] QString tidy(const QString& text);
+/// Which typed field of an item cannot be stored: 1 when it is the postcode alone, else 0.
+[[nodiscard]] int faulty_field(SetupKind kind, const QString& text, const QString& postcode);
 /// Equal for two items that a list may not hold both: case and surrounding blanks make no difference, and a suburb
 /// may stand under several postcodes.
 [[nodiscard]] QString sameness(const QString& text, const QString& postcode = {});

@@ -35,11 +35,11 @@ constexpr std::array plans{
 
 /// Year 1 is the year of the sixth birthday for those born until April, else the one after. Zero is nobody's year: the
 /// year before year 1 is -1.
-int school_year_of(const QDate& birth, const QDate& today)
+std::optional<int> school_year_of(const QDate& birth, const QDate& today)
 {
     const int level = today.year() - birth.year() - (birth.month() > 4 ? 6 : 5);
     if (level > 12 || level < -1)
-        return 0;
+        return std::nullopt;
     return level > 0 ? level : level - 1;
 }
 
@@ -102,7 +102,7 @@ void add_deceased_child(MadeFamily& family, const Stock& stock, Chance& chance)
     const int age = std::max(1, family.figures.front().age - chance.between(22, 34));
     auto& child = add_person(family, small_child, chance.percent(50), age, stock, chance);
     child.Decease = true;
-    child.school_year = 0;
+    child.school_year.reset();
     child.Title.clear();
 }
 

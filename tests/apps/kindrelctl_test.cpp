@@ -97,6 +97,23 @@ protected:
         EXPECT_TRUE(document.isArray()) << ended;
         return document.array();
     }
+    /// A file that holds the password.
+    [[nodiscard]] QString password_file(const QByteArray& password)
+    {
+        const auto file = drive.filePath(u"password"_s);
+        QFile written(file);
+        EXPECT_TRUE(written.open(QFile::WriteOnly) && written.write(password + '\n') > 0);
+        return file;
+    }
+    /// Those that the help names.
+    [[nodiscard]] QStringList commands()
+    {
+        static const QRegularExpression named(u"^  ([a-z][a-z-]+) "_s, QRegularExpression::MultilineOption);
+        QStringList words;
+        for (const auto& match : named.globalMatch(QString::fromUtf8(run({u"--help"_s}).out)))
+            words += match.captured(1);
+        return words;
+    }
     [[nodiscard]] QString pdf() const { return drive.filePath(u"report.pdf"_s); }
     [[nodiscard]] static QByteArray content(const QString& file)
     {
@@ -263,16 +280,38 @@ TEST_F(KindrelctlTest, APasswordOpensItsOwnAreasAlone)
 {
     make_church(2);
     switch_security_on();
-    const auto file = drive.filePath(u"password"_s);
-    QFile written(file);
-    ASSERT_TRUE(written.open(QFile::WriteOnly) && written.write("finder\n") > 0);
-    written.close();
+    const auto file = password_file("finder");
 
     const auto totals = run({u"totals"_s, u"--password-file"_s, file});
     EXPECT_EQ(totals.status, 0) << totals;
     const auto report = run({u"report"_s, u"k10"_s, u"--pdf"_s, pdf(), u"--password-file"_s, file});
     EXPECT_EQ(report.status, 1) << report;
     EXPECT_TRUE(report.err.contains("\"Report Outputs\"")) << report;
+    EXPECT_FALSE(QFile::exists(pdf()));
+}
+
+TEST_F(KindrelctlTest, EveryCommandOnAChurchAsksForItsRight)
+{
+    make_church(2);
+    switch_security_on();
+    const auto file = password_file("keeper");
+    const std::vector<std::pair<QStringList, QByteArray>> cases{
+        {{u"make-church"_s, u"--families"_s, u"1"_s}, "\"Add Family\""},
+        {{u"totals"_s}, "\"Search for Family\""},
+        {{u"families"_s}, "\"Search for Family\""},
+        {{u"family"_s, u"1"_s}, "\"Search for Family\""},
+        {{u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}, "\"Report Outputs\""},
+    };
+    QStringList asked{u"install"_s, u"reports"_s}; // They open no church.
+    for (const auto& [words, area] : cases) {
+        const auto ended = run(words + QStringList{u"--password-file"_s, file});
+        EXPECT_EQ(ended.status, 1) << ended;
+        EXPECT_TRUE(ended.err.contains("Your password does not give access to " + area)) << ended;
+        EXPECT_TRUE(ended.out.isEmpty()) << ended;
+        asked += words.first();
+    }
+    const auto all = commands();
+    EXPECT_EQ(QSet<QString>(asked.begin(), asked.end()), QSet<QString>(all.begin(), all.end()));
     EXPECT_FALSE(QFile::exists(pdf()));
 }
 
@@ -314,18 +353,13 @@ TEST_F(KindrelctlTest, WrongUsageIsToldApartFromRefusal)
 
 TEST_F(KindrelctlTest, TheHelpNamesEveryCommandAndEachExplainsItself)
 {
-    const auto help = run({u"--help"_s});
-    ASSERT_EQ(help.status, 0) << help;
-    static const QRegularExpression named(u"^  ([a-z][a-z-]+) "_s, QRegularExpression::MultilineOption);
-    int found = 0;
-    for (const auto& match : named.globalMatch(QString::fromUtf8(help.out))) {
-        const auto word = match.captured(1);
+    const auto words = commands();
+    EXPECT_GE(words.size(), 7);
+    for (const auto& word : words) {
         const auto own = run({word, u"--help"_s});
         EXPECT_EQ(own.status, 0) << own;
         EXPECT_TRUE(own.out.startsWith("Usage: kindrelctl [OPTIONS] " + word.toUtf8())) << own;
-        ++found;
     }
-    EXPECT_GE(found, 7);
 }
 
 TEST_F(KindrelctlTest, AResultThatCannotBeWrittenIsAFailure)

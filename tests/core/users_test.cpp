@@ -140,8 +140,11 @@ TEST_P(UsersTest, TheRightPasswordBringsItsUsersRightsAndIsLogged)
     add_user(9, u"blue"_s, u"Cleo Ott"_s, {Area::security});
     dialogue().expect_text(question, u"green"_s);
 
+    place->office.church_name = u"St Mary's"_s;
+
     ASSERT_TRUE(enter());
 
+    EXPECT_EQ(dialogue().seen().front().more, u"St Mary's"_s);
     const Office& office = place->office;
     EXPECT_EQ(office.user_id, 4);
     EXPECT_EQ(office.user_name, u"Ann Naismith, Ben Naismith"_s);

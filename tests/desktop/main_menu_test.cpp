@@ -8,6 +8,7 @@
 #include "support/families.h"
 
 #include <QComboBox>
+#include <QHeaderView>
 #include <QLineEdit>
 #include <QTableView>
 
@@ -66,16 +67,31 @@ TEST_F(MainMenuTest, DownLeadsFromTheFilterToTheFirstFamilyAndEnterOpensIt)
     press(window(), Qt::Key_Down);
     press(window(), Qt::Key_Return);
 
-    const auto cards = desk().windows.all<desktop::FamilyCard>();
-    ASSERT_EQ(cards.size(), 1U);
-    EXPECT_EQ(cards[0]->surname_id(), stored[2].family.Surname_ID);
+    EXPECT_EQ(window().page()->objectName(), u"Editor"_s);
+    EXPECT_EQ(window().page()->title(), u"Nash Family File"_s);
 }
 
-TEST_F(MainMenuTest, AFamilyOpenedTwiceHasOneCard)
+TEST_F(MainMenuTest, SpaceAndControlEnterLookAtTheCardWithoutOpeningTheFile)
 {
     begin(some_families());
-    press(window(), Qt::Key_Return);
-    press(window(), Qt::Key_Return);
+    type(window(), u"na"_s);
+    press(window(), Qt::Key_Return, Qt::ControlModifier);
+    const auto cards = desk().windows.all<desktop::FamilyCard>();
+    ASSERT_EQ(cards.size(), 1U);
+    EXPECT_EQ(cards[0]->surname_id(), stored[1].family.Surname_ID);
+
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Space);
+    EXPECT_EQ(desk().windows.all<desktop::FamilyCard>().size(), 2U);
+    EXPECT_EQ(window().page()->objectName(), u"main_menu"_s);
+}
+
+TEST_F(MainMenuTest, AFamilyLookedAtTwiceHasOneCard)
+{
+    begin(some_families());
+    press(window(), Qt::Key_Return, Qt::ControlModifier);
+    press(window(), Qt::Key_Return, Qt::ControlModifier);
     EXPECT_EQ(desk().windows.all<desktop::FamilyCard>().size(), 1U);
 }
 
@@ -148,14 +164,26 @@ TEST_F(MainMenuTest, WithoutTheRightToFindFamiliesNoneAreListed)
 TEST_F(MainMenuTest, FindFamilyComesBackToTheFilterFromAnyWindow)
 {
     begin(some_families());
-    press(window(), Qt::Key_Return);
+    press(window(), Qt::Key_Return, Qt::ControlModifier);
     auto* card = desk().windows.all<desktop::FamilyCard>().at(0);
     running->open_area(u"reports"_s);
+    settle();
 
     press(*card, Qt::Key_K, Qt::ControlModifier);
 
     EXPECT_EQ(window().page()->objectName(), u"main_menu"_s);
     EXPECT_EQ(window().focusWidget(), &child<QLineEdit>(window(), u"filter"_s));
+}
+
+TEST_F(MainMenuTest, TheColumnsFillTheListAndNoMore)
+{
+    begin(some_families());
+    const auto& list = child<QTableView>(window(), u"families"_s);
+    for (const int width : {1024, 800, 1400, 720}) {
+        window().resize(width, 600);
+        settle();
+        EXPECT_EQ(list.horizontalHeader()->length(), list.viewport()->width()) << "in a window of " << width;
+    }
 }
 
 } // namespace kindrel::test

@@ -24,7 +24,11 @@ protected:
         elsewhere.machine = u"office-2"_s;
         begin({family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s})});
     }
-    void open_page() { running->open_area(u"network"_s); }
+    void open_page()
+    {
+        running->open_area(u"network"_s);
+        settle();
+    }
     void close_page() { press(window(), Qt::Key_W, Qt::ControlModifier); }
     [[nodiscard]] bool in_page() { return window().page()->objectName() == u"network"_s; }
     void tab_to(const QString& name)

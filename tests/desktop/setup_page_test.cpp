@@ -36,6 +36,7 @@ protected:
     void open(SetupKind kind)
     {
         running->open_area(u"setup"_s);
+        settle();
         child<QTabWidget>(window(), u"lists"_s).setCurrentIndex(int(kind));
         settle();
     }
@@ -76,6 +77,7 @@ TEST_F(SetupPageTest, ASuburbListIsBuiltSortedImportedAndSavedByKeyboardAlone)
     const QString file = place.data.drive() + u"suburbs.txt"_s;
     DataFolder::write(file, "Ashfield,2131\nMosman,2088\n");
     running->open_area(u"setup"_s);
+    settle();
     press(window(), Qt::Key_PageUp, Qt::ControlModifier);
     add_suburb(u"Mosman"_s, u"2088"_s);
     add_suburb(u"Balmain"_s, u"2041"_s);
@@ -107,6 +109,25 @@ TEST_F(SetupPageTest, ARefusedSuburbPutsTheCursorIntoTheGuiltyField)
     place.dialogue.expect_box(u"Please enter a suburb before attempting to add a new suburb to the list"_s);
     press(window(), Qt::Key_Return);
     EXPECT_EQ(in_focus(), u"new_0"_s);
+
+    tab().findChild<QLineEdit*>(u"new_0"_s)->setText(QString(255, u'x'));
+    tab().findChild<QLineEdit*>(u"new_1"_s)->setText(QString(256, u'1'));
+    for (const auto keys : {QKeyCombination(Qt::Key_Return), Qt::CTRL | Qt::Key_S}) {
+        place.dialogue.expect_box(u"Please enter no more than 255 characters"_s);
+        press(window(), keys.key(), keys.keyboardModifiers());
+        EXPECT_EQ(in_focus(), u"new_1"_s);
+    }
+}
+
+TEST_F(SetupPageTest, ARefusedNameIsToldOnceAndStaysInItsCell)
+{
+    open(SetupKind::titles);
+    press(window(), Qt::Key_Return);
+    type(window(), u" "_s);
+    place.dialogue.expect_box(u"Please enter an item"_s);
+    press(window(), Qt::Key_S, Qt::ControlModifier);
+    EXPECT_EQ(in_focus(), u"cell"_s);
+    EXPECT_TRUE(window().page()->altered());
 }
 
 TEST_F(SetupPageTest, AnItemStopsAtTheEndsOfItsList)
@@ -201,14 +222,25 @@ TEST_F(SetupPageTest, TheRailShowsTheLockAndRemindsOfItUntilThePageIsClosed)
     EXPECT_FALSE(session().select(u"SELECT [locked_area] FROM [tbl_locked_area];"_s).first());
 }
 
-TEST_F(SetupPageTest, AGroupWithMembersIsRemovedAfterBothQuestions)
+TEST_F(SetupPageTest, MembersOfARemovedGroupLeaveItIntoTheirHistory)
 {
     place.in_database(u"INSERT INTO [tbl_group] ([person_id],[group_id]) VALUES (1,1);"_s);
+    place.in_database(u"INSERT INTO [tbl_group_history] ([history_id],[person_id],[group_id],[date_in]) "
+                      "VALUES (1,1,1,'2020-03-01');"_s);
     open(SetupKind::groups);
     place.dialogue.expect_confirm(u"Please confirm that you wish to remove this item 'group 1'"_s, core::Answer::yes);
     place.dialogue.expect_confirm(u"Do you wish to remove everybody attached to this group?"_s, core::Answer::yes);
     press(window(), Qt::Key_Delete);
     EXPECT_EQ(table().model()->rowCount(), 2);
+
+    press(window(), Qt::Key_S, Qt::ControlModifier);
+
+    EXPECT_FALSE(session().select(u"SELECT [person_id] FROM [tbl_group];"_s).first());
+    auto history = session().select(u"SELECT [date_out],[completed] FROM [tbl_group_history];"_s);
+    const auto* row = history.first();
+    ASSERT_TRUE(row);
+    EXPECT_EQ(row->text(core::Column{0}), place.clock.today().toString(Qt::ISODate));
+    EXPECT_TRUE(row->flag(core::Column{1}));
 }
 
 TEST_F(SetupPageTest, DetailsOfANewGroupOpenOnceItIsSaved)

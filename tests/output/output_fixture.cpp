@@ -64,7 +64,8 @@ void ReportTest::add(const std::vector<people::FamilyFile>& families)
 
 bool ReportTest::run(pages::PageSpool& spool, pages::Paper paper)
 {
-    return output::run_report(report, {office, list}, progress, spool, paper);
+    options.paper = paper;
+    return output::run_report(report, {office, list, options}, progress, spool);
 }
 
 std::vector<QStringList> ReportTest::pages()

@@ -46,6 +46,7 @@ protected:
     FixedClock clock;
     core::Office office;
     people::WorkingList list;
+    output::RunOptions options;
     ScriptedProgress progress;
     output::ReportDefinition report = *output::find_report(u"k10");
 };

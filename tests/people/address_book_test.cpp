@@ -82,6 +82,33 @@ TEST_P(AddressBookTest, HiddenAddressAndPhoneStayOutOfTheList)
     EXPECT_EQ(list[1].phone + list[1].street, QString());
 }
 
+TEST_P(AddressBookTest, AFamilyGroupNarrowsEachOfTheLists)
+{
+    add_setup_items(session());
+    for (const bool in_group : {false, true}) {
+        const auto carry = [in_group](FamilyFile& file) {
+            file.family_groups.resize(in_group ? 2 : 1);
+            for (int item = 0; LinkRow & row : file.family_groups)
+                row.item = ++item;
+        };
+        const QString mark = in_group ? u"in"_s : u"out"_s;
+        for (const auto status : {FileStatus::active, FileStatus::privacy, FileStatus::prospect, FileStatus::archive})
+            add(mark, status, carry);
+        add(mark, FileStatus::active, [&](FamilyFile& file) {
+            carry(file);
+            file.family.booked_out = file.family.active_in_book = true;
+        });
+    }
+    for (int list = 0; list < family_list_count; ++list) {
+        const auto whole = read_address_book(session(), FamilyList(list), false).size();
+        const auto narrowed = read_address_book(session(), FamilyList(list), false, 2);
+        EXPECT_EQ(narrowed.size() * 2, whole) << list;
+        ASSERT_FALSE(narrowed.empty()) << list;
+        EXPECT_TRUE(std::ranges::all_of(narrowed, [](const auto& entry) { return entry.surname == u"in"_s; })) << list;
+        EXPECT_TRUE(read_address_book(session(), FamilyList(list), false, 3).empty()) << list;
+    }
+}
+
 TEST_P(AddressBookTest, TotalsCountFamiliesWhoeverLives)
 {
     EXPECT_EQ(family_totals(session()).front().count, 0);

@@ -56,15 +56,38 @@ TEST_P(QuickAddTest, WhatIsMissingIsAskedForAndNothingIsAdded)
     EXPECT_EQ(stored(occupations).size() + stored(suburbs).size(), 6);
 }
 
-TEST_P(QuickAddTest, WhoMayOnlyReadFamiliesAddsNothing)
+TEST_P(QuickAddTest, WhoFillsInFamiliesOrSetsUpTheListsMayAdd)
 {
-    auto& rights = desk->office.rights;
-    rights.set(core::Area::read_only_family_data, true);
-    EXPECT_TRUE(add_occupation(desk->office, u"Nurse"_s)) << "The setup of lists is allowed.";
-    rights.set(core::Area::family_file_setup, false);
-    desk->dialogue.expect_box(u"Unable to add this item as you only have read only access within family files"_s);
+    const auto read_only = u"Unable to add this item as you only have read only access within family files"_s;
+    const auto no_access = u"Your password does not give access to \"Family File Setup\""_s;
+    struct Case
+    {
+        std::vector<core::Area> granted;
+        QString refusal = {};
+    };
+    int added = 0;
+    for (const auto& [granted, refusal] :
+         {Case{{core::Area::search_for_family}}, Case{{core::Area::add_family}}, Case{{core::Area::family_file_setup}},
+          Case{{core::Area::family_file_setup, core::Area::read_only_family_data}},
+          Case{{core::Area::search_for_family, core::Area::read_only_family_data}, read_only},
+          Case{{core::Area::roll}, no_access}}) {
+        desk->office.rights = {};
+        for (const auto area : granted)
+            desk->office.rights.set(area, true);
+        if (!refusal.isEmpty())
+            desk->dialogue.expect_box(refusal);
+        EXPECT_EQ(add_occupation(desk->office, u"job %1"_s.arg(added)).has_value(), refusal.isEmpty());
+        added += refusal.isEmpty();
+    }
+    EXPECT_EQ(stored(occupations).size(), 3 + added);
+}
+
+TEST_P(QuickAddTest, NothingIsAddedWhileTheNetworkIsGone)
+{
+    desk->office.mode = core::Mode::network; // Its folder names no church.
+    desk->dialogue.expect_box(u"Unable to access your network files."_s);
     EXPECT_FALSE(add_occupation(desk->office, u"Cook"_s));
-    EXPECT_EQ(stored(occupations).size(), 4);
+    EXPECT_EQ(stored(occupations).size(), 3);
 }
 
 TEST_P(QuickAddTest, WorkstationsThatAddAndSaveAtOnceLoseNothingAndDoubleNothing)

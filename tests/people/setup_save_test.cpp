@@ -139,6 +139,17 @@ TEST_P(SetupSaveTest, EveryListIsSavedAsThoseWhoCarryItsItemsSeeIt)
     }
 }
 
+TEST_P(SetupSaveTest, NothingIsSavedWhileTheNetworkIsGone)
+{
+    auto editor = open();
+    ASSERT_TRUE(editor.add(titles, u"Deacon"_s));
+    desk->office.mode = core::Mode::network; // Its folder names no church.
+    desk->dialogue.expect_box(u"Unable to access your network files."_s);
+    EXPECT_FALSE(editor.save());
+    EXPECT_TRUE(editor.altered());
+    EXPECT_EQ(stored(titles).size(), 3);
+}
+
 TEST_P(SetupSaveTest, TheMembersOfARemovedGroupLeaveItIntoTheirHistory)
 {
     const auto file = add(full_family(false));

@@ -4,9 +4,10 @@
 #include "desktop/shell/page.h"
 
 class QLabel;
-class QTreeWidget;
 
 namespace kindrel::desktop {
+
+class ReportTree;
 
 /// The reports that there are, in their families, each with what it prints. Enter shows the chosen one over the
 /// families of active people.
@@ -21,17 +22,12 @@ public:
     void entered() override;
     void print() override { open_chosen(); }
 
-protected:
-    bool eventFilter(QObject* target, QEvent* event) override;
-
 private:
-    void fill_tree();
     void show_chosen();
     void open_chosen();
-    [[nodiscard]] QString chosen_key() const;
 
     Desk& m_desk;
-    QTreeWidget* m_tree;
+    ReportTree* m_tree;
     QLabel* m_leaf;
     QLabel* m_description;
 };

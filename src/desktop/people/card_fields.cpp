@@ -1,4 +1,5 @@
 #include "desktop/people/card_text.h"
+#include "people/family_roles.h"
 
 #include <array>
 
@@ -80,7 +81,7 @@ QString birth_text(const Person& person, const CardReader& reader)
 
 QString school_text(const Person& person, const CardReader&)
 {
-    switch (person.school_year) {
+    switch (person.school_year.value_or(0)) {
     case 0:
         return {};
     case -1:
@@ -88,31 +89,13 @@ QString school_text(const Person& person, const CardReader&)
     case -2:
         return u"-2 (kinder)"_s;
     default:
-        return QString::number(person.school_year);
+        return QString::number(*person.school_year);
     }
 }
 
-/// Words for the codes of `Marital`, beside their numbers from 1.
-constexpr std::array family_types{"Single Adult",
-                                  "Single Parent",
-                                  "Married, No Child",
-                                  "Married, With Child",
-                                  "Child",
-                                  "Child",
-                                  "Child",
-                                  "Widower, No Child",
-                                  "Single Adult, Deceased Child",
-                                  "Widower, No Child, Deceased Child",
-                                  "Widower, with Child",
-                                  "Single Parent, Deceased Child",
-                                  "Widower, with Child, Deceased Child",
-                                  "Married, No Child, Deceased Child",
-                                  "Married, With Child, Deceased Child"};
-
 QString type_text(const Person& person, const CardReader&)
 {
-    const auto place = std::size_t(person.Marital - 1);
-    return place < family_types.size() ? QString::fromLatin1(family_types[place]) : QString();
+    return people::marital_word(person.Marital);
 }
 
 struct Flag

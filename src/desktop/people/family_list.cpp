@@ -32,6 +32,11 @@ bool moves_in_list(int key)
     return key == Qt::Key_Down || key == Qt::Key_Up || key == Qt::Key_PageDown || key == Qt::Key_PageUp;
 }
 
+bool is_enter(const QKeyEvent& key)
+{
+    return key.key() == Qt::Key_Return || key.key() == Qt::Key_Enter;
+}
+
 } // namespace
 
 FamilyListWidget::FamilyListWidget(Desk& desk, QWidget* parent)
@@ -144,10 +149,21 @@ int FamilyListWidget::chosen_family() const
     return index.isValid() ? m_model->entry(index.row()).Surname_ID : 0;
 }
 
+int FamilyListWidget::chosen_row() const
+{
+    return m_view->currentIndex().row();
+}
+
 void FamilyListWidget::open_chosen()
 {
-    if (m_view->currentIndex().isValid())
-        Q_EMIT opened(m_view->currentIndex().row());
+    if (chosen_row() >= 0)
+        Q_EMIT opened(chosen_row());
+}
+
+void FamilyListWidget::look_at_chosen()
+{
+    if (chosen_row() >= 0)
+        Q_EMIT looked_at(chosen_row());
 }
 
 void FamilyListWidget::show_outcome()
@@ -174,20 +190,33 @@ QString FamilyListWidget::count_words() const
     return u"%1 of %2 families"_s.arg(shown, locale.toString(m_model->total()));
 }
 
+bool FamilyListWidget::key_in_view(const QKeyEvent& key)
+{
+    if (is_enter(key))
+        open_chosen();
+    else if (key.key() == Qt::Key_Space)
+        look_at_chosen();
+    else
+        return false;
+    return true;
+}
+
 bool FamilyListWidget::eventFilter(QObject* target, QEvent* event)
 {
     if (event->type() != QEvent::KeyPress)
         return QWidget::eventFilter(target, event);
     auto* key = static_cast<QKeyEvent*>(event);
+    if (is_enter(*key) && key->modifiers() == Qt::ControlModifier) {
+        look_at_chosen();
+        return true;
+    }
     if (target == m_filter && moves_in_list(key->key())) {
         m_view->setFocus(Qt::TabFocusReason);
         // The first family stands chosen already: Down goes to it, not past it.
         return key->key() == Qt::Key_Down || QApplication::sendEvent(m_view, event);
     }
-    if (target == m_view && (key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter)) {
-        open_chosen();
+    if (target == m_view && key_in_view(*key))
         return true;
-    }
     return QWidget::eventFilter(target, event);
 }
 

@@ -6,6 +6,7 @@
 #include <QWidget>
 
 class QComboBox;
+class QKeyEvent;
 class QLineEdit;
 class QStackedWidget;
 class QTableView;
@@ -30,12 +31,16 @@ public:
     void focus_filter();
     [[nodiscard]] FamilyListModel& model() { return *m_model; }
     [[nodiscard]] QTableView& view() { return *m_view; }
+    /// Its place in the list; -1 when none is.
+    [[nodiscard]] int chosen_row() const;
     /// "312 of 1,204 families".
     [[nodiscard]] QString count_words() const;
 
 Q_SIGNALS:
     /// A family was asked for; `row` is its place in the list.
     void opened(int row);
+    /// A look at a family was asked for, with Space or Ctrl+Enter.
+    void looked_at(int row);
     void shown_changed();
 
 protected:
@@ -47,6 +52,8 @@ private:
     void set_up_filter();
     void typed(const QString& text);
     void open_chosen();
+    void look_at_chosen();
+    [[nodiscard]] bool key_in_view(const QKeyEvent& key);
     void show_outcome();
     void select(int row);
     [[nodiscard]] int chosen_family() const;

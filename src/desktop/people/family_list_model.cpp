@@ -1,7 +1,7 @@
 #include "desktop/people/family_list_model.h"
 
-#include "desktop/people/family_search.h"
 #include "desktop/people/status_words.h"
+#include "people/search_words.h"
 #include "people/sort_key.h"
 
 #include <QApplication>
@@ -51,7 +51,7 @@ void FamilyListModel::set_entries(std::vector<AddressBookEntry> entries)
     m_search.clear();
     m_search.reserve(m_entries.size());
     for (const auto& one : m_entries)
-        m_search.push_back(search_words(one.surname + u' ' + one.name + u' ' + one.suburb));
+        m_search.push_back(people::search_words(one.surname + u' ' + one.name + u' ' + one.suburb));
     put_in_order();
     filter(m_order);
     endResetModel();
@@ -59,7 +59,7 @@ void FamilyListModel::set_entries(std::vector<AddressBookEntry> entries)
 
 bool FamilyListModel::matches(int entry) const
 {
-    return has_all(m_search[std::size_t(entry)], m_words);
+    return people::has_all(m_search[std::size_t(entry)], m_words);
 }
 
 void FamilyListModel::filter(std::span<const int> candidates)
@@ -73,10 +73,10 @@ void FamilyListModel::filter(std::span<const int> candidates)
 
 bool FamilyListModel::narrow(const QString& typed)
 {
-    const QStringList words = wanted_words(typed);
+    const QStringList words = people::wanted_words(typed);
     if (words == m_words)
         return false;
-    const bool further = narrows(m_words, words);
+    const bool further = people::narrows(m_words, words);
     beginResetModel();
     m_words = words;
     filter(further ? m_shown : m_order);

@@ -10,9 +10,11 @@
 #include "desktop/shell/icons.h"
 #include "desktop/shell/link_button.h"
 #include "desktop/shell/look.h"
+#include "desktop/shell/note_bar.h"
 #include "desktop/shell/side_panel.h"
 #include "desktop/shell/table_text.h"
 #include "desktop/shell/value_form.h"
+#include "people/drafts.h"
 
 #include <QAction>
 #include <QEvent>
@@ -21,6 +23,7 @@
 #include <QScrollArea>
 
 #include <functional>
+#include <utility>
 
 namespace kindrel::desktop {
 
@@ -117,6 +120,7 @@ QWidget* MainMenu::make_list()
 {
     m_families = new FamilyListWidget(m_desk);
     connect(m_families, &FamilyListWidget::opened, this, &MainMenu::open);
+    connect(m_families, &FamilyListWidget::looked_at, this, &MainMenu::look_at);
     connect(m_families, &FamilyListWidget::shown_changed, this, [this] {
         m_totals->mark(m_families->list());
         set_status(m_families->count_words());
@@ -126,6 +130,9 @@ QWidget* MainMenu::make_list()
 
 void MainMenu::add_list_actions()
 {
+    auto* look = add_action(u"Card"_s, u"view-list-details"_s,
+                            u"Look at the chosen family without opening its file (Space in the list, Ctrl+Enter)"_s);
+    connect(look, &QAction::triggered, this, [this] { look_at(m_families->chosen_row()); });
     auto* print_list = add_action(u"Print"_s, u"document-print"_s, u"Print this list (Ctrl+P)"_s);
     connect(print_list, &QAction::triggered, this, &MainMenu::print);
     auto* save = add_action(u"Save as CSV"_s, u"document-save"_s, u"Save this list as comma-separated text"_s);
@@ -151,6 +158,7 @@ void MainMenu::load_if_changed()
 void MainMenu::entered()
 {
     load_if_changed();
+    offer_draft();
     m_families->focus_filter();
 }
 
@@ -167,7 +175,31 @@ void MainMenu::print()
 
 void MainMenu::open(int row)
 {
-    open_family_card(m_desk, m_families->model().surname_ids(), row);
+    const FamilyListModel& shown = m_families->model();
+    m_desk.navigation.open_family(shown.entry(row).Surname_ID, shown.surname_ids(),
+                                  people::family_list_name(m_families->list()));
+}
+
+void MainMenu::look_at(int row)
+{
+    if (row >= 0)
+        open_family_card(m_desk, m_families->model().surname_ids(), row);
+}
+
+void MainMenu::offer_draft()
+{
+    if (std::exchange(m_drafts_offered, true))
+        return;
+    const auto drafts = people::Drafts(m_desk.office).all();
+    if (drafts.empty())
+        return;
+    const people::Draft& newest = drafts.front();
+    const QString surname = newest.typed.family.surname.trimmed();
+    const auto day = core::Date::from(newest.kept.date()).shown(m_desk.office.day_order());
+    const QString whose = surname.isEmpty() ? u"a new family"_s : u"the %1 family"_s.arg(surname);
+    note().offer(
+        u"Work on %1 was not saved; it was kept on %2 at %3."_s.arg(whose, day, newest.kept.toString(u"HH:mm"_s)),
+        u"Open it"_s, [this, key = newest.stored.family.Surname_ID] { m_desk.navigation.open_draft(key); });
 }
 
 void MainMenu::changeEvent(QEvent* event)

@@ -35,10 +35,14 @@ private:
     void load();
     void load_if_changed();
     void open(int row);
+    void look_at(int row);
+    /// Unsaved work of an earlier run, once.
+    void offer_draft();
 
     Desk& m_desk;
     FamilyTotals* m_totals = nullptr;
     FamilyListWidget* m_families = nullptr;
+    bool m_drafts_offered = false;
     std::optional<qint64> m_change_mark; ///< Nothing until the first reading.
 };
 

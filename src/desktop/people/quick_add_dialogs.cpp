@@ -48,7 +48,7 @@ QuickAddDialog::QuickAddDialog(core::Office& office, SetupKind kind, const QStri
     column->addWidget(m_line);
     column->addWidget(buttons);
     resize(first_width, sizeHint().height());
-    m_line->focus_guilty_field();
+    m_line->focus_lacking_field();
 }
 
 void QuickAddDialog::accept()
@@ -61,7 +61,7 @@ void QuickAddDialog::accept()
     if (m_key)
         QDialog::accept();
     else
-        m_line->focus_guilty_field();
+        m_line->focus_field(people::faulty_field(m_kind, m_line->texts().value(0), m_line->texts().value(1)));
 }
 
 std::optional<int> ask_for_new_item(core::Office& office, SetupKind kind, const QStringList& texts, QWidget* parent)

@@ -53,6 +53,11 @@ bool SetupOperations::add(const QStringList& texts)
     return m_editor->add(m_kind, texts.value(0), texts.value(1));
 }
 
+int SetupOperations::faulty_field(const QStringList& texts) const
+{
+    return people::faulty_field(m_kind, texts.value(0), texts.value(1));
+}
+
 bool SetupOperations::rename(int index, const QStringList& texts)
 {
     return m_editor->rename(m_kind, index, texts.value(0), texts.value(1));

@@ -21,6 +21,7 @@ public:
     [[nodiscard]] QString count_line() const override { return m_editor->count_line(m_kind); }
 
     [[nodiscard]] bool add(const QStringList& texts) override;
+    [[nodiscard]] int faulty_field(const QStringList& texts) const override;
     [[nodiscard]] bool rename(int index, const QStringList& texts) override;
     [[nodiscard]] bool remove(int index) override { return m_editor->remove(m_kind, index); }
     [[nodiscard]] bool move_up(int index) override { return m_editor->move_up(m_kind, index); }

@@ -142,13 +142,15 @@ void SetupPage::show_lists()
 
 bool SetupPage::finish_typing()
 {
+    const int in_front = m_tabs->currentIndex();
     for (std::size_t tab = 0; tab < m_lists.size(); ++tab) {
-        if (!m_lists[tab]->typing() || m_lists[tab]->finish_typing())
+        if (!m_lists[tab]->typing())
             continue;
-        m_tabs->setCurrentIndex(int(tab)); // Where something typed was refused.
-        m_lists[tab]->focus_add_line();
-        return false;
+        m_tabs->setCurrentIndex(int(tab)); // What is refused is in sight, and the cursor stays with it.
+        if (!m_lists[tab]->finish_typing())
+            return false;
     }
+    m_tabs->setCurrentIndex(in_front);
     return true;
 }
 

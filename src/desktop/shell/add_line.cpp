@@ -74,14 +74,19 @@ void AddLine::keyPressEvent(QKeyEvent* event)
         QWidget::keyPressEvent(event);
 }
 
-void AddLine::focus_guilty_field()
+void AddLine::focus_field(int place)
 {
-    std::size_t guilty = 0;
-    while (guilty < m_fields.size() && !lacks(guilty))
-        ++guilty;
-    QLineEdit* field = m_fields[guilty < m_fields.size() ? guilty : 0];
+    QLineEdit* field = m_fields.at(std::size_t(place));
     field->setFocus();
     field->selectAll();
+}
+
+void AddLine::focus_lacking_field()
+{
+    std::size_t lacking = 0;
+    while (lacking < m_fields.size() && !lacks(lacking))
+        ++lacking;
+    focus_field(lacking < m_fields.size() ? int(lacking) : 0);
 }
 
 } // namespace kindrel::desktop

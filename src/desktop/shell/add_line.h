@@ -22,8 +22,10 @@ public:
     [[nodiscard]] bool is_empty() const;
     void set_texts(const QStringList& texts);
     void clear() { set_texts({}); }
-    /// The cursor goes to the first field that lacks something, else to the first, with its text selected.
-    void focus_guilty_field();
+    /// The cursor goes there, with the text selected.
+    void focus_field(int place);
+    /// To the first field that is empty, else to the first.
+    void focus_lacking_field();
     void add_button(QWidget* button);
 
 Q_SIGNALS:

@@ -16,8 +16,14 @@ public:
     virtual ~Navigation() = default;
     /// Brings the family list forward with the cursor in its filter.
     virtual void find_family() = 0;
-    /// `key` names a row of the table of areas.
+    /// `key` names a row of the table of areas. Happens after the caller has returned, for its page may have to go.
     virtual void open_area(const QString& key) = 0;
+    /// Opens a family in the editor, with the list to turn the pages in and its name. What is typed there is offered
+    /// for saving first. Happens after the caller has returned, as do the next two.
+    virtual void open_family(int surname_id, std::vector<int> among, const QString& among_name) = 0;
+    virtual void new_family() = 0;
+    /// Opens the unsaved work on a family; 0 is that on a new one.
+    virtual void open_draft(int surname_id) = 0;
     /// Closes the office and starts up again; happens after the caller has returned.
     virtual void load_church(int church) = 0;
 };

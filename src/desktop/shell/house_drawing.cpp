@@ -47,11 +47,64 @@ void draw_button(const QStyleOption& option, QPainter& painter, Ground ground)
     painter.restore();
 }
 
-void draw_header_section(const QStyleOption& option, QPainter& painter)
+void draw_tick_box(const QStyleOption& option, QPainter& painter)
+{
+    const bool enabled = option.state & QStyle::State_Enabled;
+    const bool filled = option.state & (QStyle::State_On | QStyle::State_NoChange);
+    const QColor edge = enabled ? edge_colour(shade_of(option.palette)) : option.palette.color(QPalette::Mid);
+    const qreal side = std::min(option.rect.width(), option.rect.height()) - 1;
+    QRectF box(0, 0, side, side);
+    box.moveCenter(QRectF(option.rect).center());
+    painter.save();
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setPen(filled && enabled ? option.palette.color(QPalette::Highlight) : edge);
+    painter.setBrush(option.palette.color(filled ? QPalette::Highlight : QPalette::Base));
+    painter.drawRoundedRect(box, 2, 2);
+    painter.setPen(QPen(option.palette.color(QPalette::HighlightedText), side / 7, Qt::SolidLine, Qt::RoundCap));
+    const auto at = [&](qreal x, qreal y) {
+        return box.topLeft() + QPointF(x, y) * side;
+    };
+    if (option.state & QStyle::State_On)
+        painter.drawPolyline(QPolygonF({at(0.22, 0.52), at(0.42, 0.72), at(0.78, 0.3)}));
+    else if (option.state & QStyle::State_NoChange)
+        painter.drawLine(at(0.25, 0.5), at(0.75, 0.5));
+    painter.restore();
+}
+
+void draw_field_edge(const QStyleOption& option, QPainter& painter)
+{
+    const bool focused = option.state & QStyle::State_HasFocus;
+    const bool enabled = option.state & QStyle::State_Enabled;
+    painter.save();
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.setBrush(Qt::NoBrush);
+    painter.setPen(focused   ? QPen(option.palette.color(QPalette::Highlight), 2)
+                   : enabled ? QPen(edge_colour(shade_of(option.palette)))
+                             : QPen(line_colour(shade_of(option.palette))));
+    const qreal inset = focused ? 1 : 0.5;
+    painter.drawRoundedRect(QRectF(option.rect).adjusted(inset, inset, -inset, -inset), 3, 3);
+    painter.restore();
+}
+
+void draw_frame(const QStyleOption& option, QPainter& painter)
+{
+    painter.setPen(edge_of(option, Ground::raised));
+    painter.setBrush(Qt::NoBrush);
+    painter.drawRect(option.rect.adjusted(0, 0, -1, -1));
+}
+
+void draw_header_ground(const QStyleOption& option, QPainter& painter)
 {
     painter.fillRect(option.rect, option.palette.color(QPalette::Window));
     painter.setPen(line_colour(shade_of(option.palette)));
     painter.drawLine(option.rect.bottomLeft(), option.rect.bottomRight());
+}
+
+void draw_header_section(const QStyleOptionHeader& option, QPainter& painter)
+{
+    draw_header_ground(option, painter);
+    if (option.position == QStyleOptionHeader::End || option.position == QStyleOptionHeader::OnlyOneSection)
+        return;
     painter.drawLine(option.rect.topRight() + QPoint(0, 5), option.rect.bottomRight() - QPoint(0, 5));
 }
 

@@ -51,6 +51,8 @@ int HouseStyle::pixelMetric(PixelMetric metric, const QStyleOption* option, cons
         return 0;
     case PM_FocusFrameHMargin: // What stands before the text of a row.
         return 6;
+    case PM_TabBarTabHSpace:
+        return space::margin;
     case PM_HeaderMargin:
         return 6;
     case PM_ScrollBarExtent:
@@ -66,6 +68,12 @@ int HouseStyle::styleHint(StyleHint hint, const QStyleOption* option, const QWid
     if (hint == SH_EtchDisabledText || hint == SH_DitherDisabledText)
         return 0;
     return QProxyStyle::styleHint(hint, option, widget, data);
+}
+
+QRect HouseStyle::subElementRect(SubElement element, const QStyleOption* option, const QWidget* widget) const
+{
+    const QRect place = QProxyStyle::subElementRect(element, option, widget);
+    return element == SE_LineEditContents ? place.adjusted(3, 0, -3, 0) : place;
 }
 
 QRect HouseStyle::subControlRect(ComplexControl control, const QStyleOptionComplex* option, SubControl part,
@@ -101,6 +109,12 @@ void HouseStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* opt
         draw_button(*option, *painter, button->features & QStyleOptionButton::Flat ? Ground::flat : Ground::raised);
     else if (element == PE_PanelButtonTool)
         draw_button(*option, *painter, Ground::flat);
+    else if (element == PE_IndicatorCheckBox)
+        draw_tick_box(*option, *painter);
+    else if (element == PE_FrameLineEdit)
+        draw_field_edge(*option, *painter);
+    else if (element == PE_Frame)
+        draw_frame(*option, *painter);
     else
         QProxyStyle::drawPrimitive(element, option, painter, widget);
 }
@@ -109,8 +123,11 @@ void HouseStyle::drawControl(ControlElement element, const QStyleOption* option,
                              const QWidget* widget) const
 {
     const auto* tab = qstyleoption_cast<const QStyleOptionTab*>(option);
-    if (element == CE_HeaderSection || element == CE_HeaderEmptyArea)
-        draw_header_section(*option, *painter);
+    const auto* heading = qstyleoption_cast<const QStyleOptionHeader*>(option);
+    if (element == CE_HeaderSection && heading)
+        draw_header_section(*heading, *painter);
+    else if (element == CE_HeaderEmptyArea)
+        draw_header_ground(*option, *painter);
     else if (element == CE_TabBarTabShape && tab)
         draw_tab(*tab, *painter);
     else

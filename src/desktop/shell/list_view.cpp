@@ -55,6 +55,8 @@ void make_row_list(QTableView& view)
     view.verticalHeader()->hide();
     view.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     view.horizontalHeader()->setHighlightSections(false);
+    view.horizontalHeader()->setTextElideMode(Qt::ElideRight);
+    view.horizontalHeader()->setMinimumSectionSize(2 * space::row);
     view.horizontalHeader()->setStretchLastSection(true);
     view.horizontalHeader()->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     new RowHeight(view);

@@ -2,7 +2,9 @@
 
 #include "desktop/shell/help.h"
 #include "desktop/shell/idle_watch.h"
+#include "desktop/shell/mode_words.h"
 #include "desktop/shell/page.h"
+#include "desktop/shell/page_stack.h"
 #include "desktop/shell/rail.h"
 #include "desktop/shell/view_menu.h"
 
@@ -11,8 +13,9 @@
 #include <QLabel>
 #include <QMenu>
 #include <QShortcut>
-#include <QStackedWidget>
 #include <QStatusBar>
+
+#include <algorithm>
 
 namespace kindrel::desktop {
 
@@ -24,26 +27,11 @@ constexpr int narrow_below = 900;
 constexpr QSize first_size{1024, 690};
 constexpr QSize least_size{720, 480};
 
-QString mode_words(const core::Office& office)
-{
-    switch (office.mode) {
-    case core::Mode::training:
-        return u"Training Mode"_s;
-    case core::Mode::booked_out:
-        return u"Remote Access Mode"_s;
-    case core::Mode::network:
-        return u"Network Mode"_s;
-    case core::Mode::normal:
-        break;
-    }
-    return u"This workstation"_s;
-}
-
 } // namespace
 
 MainWindow::MainWindow(Desk& desk, std::span<const AreaDefinition> areas, Look& look)
-    : m_desk(desk), m_areas(areas), m_look(look), m_rail(new Rail), m_stack(new QStackedWidget), m_mode(new QLabel),
-      m_count(new QLabel), m_pages(areas.size())
+    : m_desk(desk), m_areas(areas), m_look(look), m_rail(new Rail), m_stack(new PageStack(areas)), m_mode(new QLabel),
+      m_count(new QLabel)
 {
     setObjectName(u"main_window"_s);
     setWindowTitle(core::product.toString() + desk.office.caption_suffix);
@@ -87,11 +75,16 @@ void MainWindow::add_areas()
         }
     }
     connect(m_rail, &Rail::chosen, this, [this](int place) { open_place(std::size_t(place)); });
+    connect(m_stack, &PageStack::came_forward, this, [this](std::size_t place) {
+        m_rail->choose(int(place));
+        show_status();
+    });
+    connect(m_stack, &PageStack::closed, this, &MainWindow::show_marks);
 }
 
 void MainWindow::add_foot()
 {
-    auto* view = m_rail->add_foot(u"configure"_s, u"View"_s);
+    auto* view = m_rail->add_foot(u"contrast"_s, u"View"_s);
     view->setObjectName(u"view"_s);
     connect(view, &QAbstractButton::clicked, this, [this, view] {
         QMenu* menu = make_view_menu(m_look, m_desk.remembered, this);
@@ -119,6 +112,7 @@ void MainWindow::add_keys()
         connect(new QShortcut(keys, this), &QShortcut::activated, this, action);
     };
     key(Qt::CTRL | Qt::Key_K, [this] { m_desk.navigation.find_family(); });
+    key(QKeySequence::New, [this] { m_desk.navigation.new_family(); });
     key(QKeySequence::Find, [this] { page()->find(); });
     key(QKeySequence::Save, [this] { page()->save(); });
     key(QKeySequence::Print, [this] { page()->print(); });
@@ -128,50 +122,65 @@ void MainWindow::add_keys()
 
 Page* MainWindow::page() const
 {
-    return static_cast<Page*>(m_stack->currentWidget());
+    return m_stack->front();
+}
+
+std::size_t MainWindow::place_of(const QString& key) const
+{
+    const auto found =
+        std::ranges::find_if(m_areas, [&key](const auto& area) { return key == QLatin1StringView(area.key); });
+    return std::size_t(found - m_areas.begin());
 }
 
 void MainWindow::open_area(const QString& key)
 {
-    for (std::size_t place = 0; place < m_areas.size(); ++place)
-        if (key == QLatin1StringView(m_areas[place].key))
-            open_place(place);
+    if (const std::size_t place = place_of(key); place < m_areas.size())
+        open_place(place);
+}
+
+Page* MainWindow::page_of(const QString& key) const
+{
+    const std::size_t place = place_of(key);
+    return place < m_areas.size() ? m_stack->at(place) : nullptr;
+}
+
+void MainWindow::close_place(std::size_t place)
+{
+    if (place == m_stack->front_place())
+        open_place(0);
+    m_stack->close(place);
 }
 
 void MainWindow::open_place(std::size_t place)
 {
-    if (!granted(m_areas[place]) || !(m_pages[place] || make_page(place)))
+    if (!granted(m_areas[place]) || !(m_stack->at(place) || make_page(place)))
         return;
-    m_stack->setCurrentWidget(m_pages[place]);
-    m_rail->choose(int(place));
-    m_pages[place]->entered();
-    show_status();
+    m_stack->bring_forward(place);
+    page()->entered();
 }
 
 bool MainWindow::make_page(std::size_t place)
 {
     if (page())
-        m_rail->choose(int(place_of(page()))); // Until the area lets us in.
+        m_rail->choose(int(m_stack->front_place())); // Until the area lets us in.
+    if (!m_stack->make_way(place))
+        return false;
     Page* made = m_areas[place].make(m_desk);
     if (!made)
         return false;
-    m_pages[place] = made;
-    m_stack->addWidget(made);
+    m_stack->put(place, made);
     connect(made, &Page::status_changed, this, &MainWindow::show_status);
     connect(made, &Page::state_changed, this, &MainWindow::show_marks);
+    connect(
+        made, &Page::finished, this, [this, place] { close_place(place); }, Qt::QueuedConnection);
     show_marks();
     return true;
 }
 
-std::size_t MainWindow::place_of(const Page* page) const
-{
-    return std::size_t(std::find(m_pages.begin(), m_pages.end(), page) - m_pages.begin());
-}
-
 void MainWindow::show_marks()
 {
-    for (std::size_t place = 0; place < m_pages.size(); ++place) {
-        const Page* page = m_pages[place];
+    for (std::size_t place = 0; place < m_stack->places(); ++place) {
+        const Page* page = m_stack->at(place);
         const bool locked = page && page->holds_lock();
         m_rail->mark(int(place), {.altered = page && page->altered(), .locked = locked, .idle = locked && m_idle});
     }
@@ -185,20 +194,14 @@ void MainWindow::set_idle(bool idle)
 
 void MainWindow::close_page()
 {
-    const std::size_t place = place_of(page());
-    if (place == 0 || !page()->leave())
-        return;
-    Page* closing = page();
-    m_pages[place] = nullptr;
-    open_place(0);
-    closing->deleteLater();
-    m_stack->removeWidget(closing);
-    show_marks();
+    const std::size_t place = m_stack->front_place();
+    if (place != 0 && m_stack->leave(place))
+        close_place(place);
 }
 
 bool MainWindow::leave_all()
 {
-    return std::all_of(m_pages.begin(), m_pages.end(), [](Page* page) { return !page || page->leave(); });
+    return m_stack->leave_all();
 }
 
 void MainWindow::show_status()

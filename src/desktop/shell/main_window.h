@@ -6,14 +6,13 @@
 #include <QMainWindow>
 
 #include <span>
-#include <vector>
 
 class QLabel;
-class QStackedWidget;
 
 namespace kindrel::desktop {
 
 class Page;
+class PageStack;
 class Rail;
 
 /// The rail of areas and the pages they open. A page is made when its area is first chosen and stays parked until it
@@ -27,8 +26,10 @@ public:
     MainWindow(Desk& desk, std::span<const AreaDefinition> areas, Look& look);
 
     void open_area(const QString& key);
+    /// Null while the area is closed.
+    [[nodiscard]] Page* page_of(const QString& key) const;
     [[nodiscard]] Page* page() const;
-    /// Asks every page that is open; false when one of them stays.
+    /// Asks every page that is open, in front; false when one of them stays.
     [[nodiscard]] bool leave_all();
 
 Q_SIGNALS:
@@ -46,9 +47,11 @@ private:
     void add_status_bar();
     void add_keys();
     void open_place(std::size_t place);
-    /// False when the area does not let anybody in.
+    void close_place(std::size_t place);
+    /// As many as there are areas when there is none of this key.
+    [[nodiscard]] std::size_t place_of(const QString& key) const;
+    /// False when the area does not let anybody in, or when a page that had to leave first stays.
     [[nodiscard]] bool make_page(std::size_t place);
-    [[nodiscard]] std::size_t place_of(const Page* page) const;
     /// What the rail shows of the pages' states.
     void show_marks();
     void set_idle(bool idle);
@@ -61,10 +64,9 @@ private:
     std::span<const AreaDefinition> m_areas;
     Look& m_look;
     Rail* m_rail;
-    QStackedWidget* m_stack;
+    PageStack* m_stack;
     QLabel* m_mode;
     QLabel* m_count;
-    std::vector<Page*> m_pages; ///< Beside `m_areas`; null while an area is closed.
     bool m_idle = false;
 };
 

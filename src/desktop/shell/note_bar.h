@@ -2,6 +2,8 @@
 
 #include <QFrame>
 
+#include <functional>
+
 class QLabel;
 class QPushButton;
 
@@ -16,6 +18,8 @@ public:
     explicit NoteBar(QWidget* parent = nullptr);
 
     void say(const QString& text);
+    /// With a button that does what the note offers, after which the note is gone.
+    void offer(const QString& text, const QString& button, std::function<void()> act);
     void clear();
     [[nodiscard]] QString text() const;
 
@@ -23,8 +27,12 @@ protected:
     void paintEvent(QPaintEvent* event) override;
 
 private:
+    void take_offer();
+
     QLabel* m_text;
+    QPushButton* m_offer;
     QPushButton* m_close;
+    std::function<void()> m_act;
 };
 
 } // namespace kindrel::desktop

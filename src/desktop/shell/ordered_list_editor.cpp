@@ -122,7 +122,7 @@ void OrderedListEditor::focus_list()
 void OrderedListEditor::focus_add_line()
 {
     if (m_cells->finish())
-        m_add_line->focus_guilty_field();
+        m_add_line->focus_lacking_field();
 }
 
 bool OrderedListEditor::typing() const
@@ -147,13 +147,14 @@ bool OrderedListEditor::add()
 {
     if (!m_cells->finish())
         return false;
-    const bool added = m_list->add(m_add_line->texts());
-    if (added) {
-        drop_typing();
-        show_list(m_list->count() - 1);
+    if (!m_list->add(m_add_line->texts())) {
+        m_add_line->focus_field(m_list->faulty_field(m_add_line->texts()));
+        return false;
     }
-    m_add_line->focus_guilty_field();
-    return added;
+    drop_typing();
+    show_list(m_list->count() - 1);
+    m_add_line->focus_field(0);
+    return true;
 }
 
 void OrderedListEditor::rename()

@@ -37,6 +37,8 @@ public:
 
     /// At the end of the list. `texts` are one for each field, here and in rename().
     [[nodiscard]] virtual bool add(const QStringList& texts) = 0;
+    /// The place of the text for which add() refused; 0 when it is none in particular.
+    [[nodiscard]] virtual int faulty_field(const QStringList&) const { return 0; }
     [[nodiscard]] virtual bool rename(int index, const QStringList& texts) = 0;
     [[nodiscard]] virtual bool remove(int index) = 0;
     [[nodiscard]] virtual bool move_up(int index) = 0;

@@ -1,6 +1,7 @@
 #include "desktop/shell/page.h"
 
 #include "desktop/shell/chip.h"
+#include "desktop/shell/elided_label.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/note_bar.h"
@@ -19,11 +20,10 @@ constexpr int header_height = 32;
 }
 
 Page::Page(const QString& title, QWidget* parent)
-    : QWidget(parent), m_title(new QLabel(title)), m_chip(new Chip), m_note(new NoteBar), m_header(new QHBoxLayout),
-      m_column(new QVBoxLayout(this))
+    : QWidget(parent), m_title(new ElidedLabel(title)), m_chip(new Chip), m_note(new NoteBar),
+      m_header(new QHBoxLayout), m_column(new QVBoxLayout(this))
 {
     dress(*m_title, TextSize::title);
-    m_title->setTextFormat(Qt::PlainText);
     m_header->setContentsMargins(space::group, space::field, space::margin, space::field);
     m_header->setSpacing(space::margin);
     m_header->addWidget(m_title);

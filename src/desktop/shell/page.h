@@ -48,6 +48,8 @@ Q_SIGNALS:
     void status_changed();
     /// What altered() or holds_lock() answers.
     void state_changed();
+    /// Nothing is left to do on the page: it is to be closed.
+    void finished();
 
 protected:
     /// A button at the right of the header.

@@ -9,14 +9,14 @@ namespace {
 /// The colours of one shade, by what they are for.
 struct Colours
 {
-    QRgb base, window, raised, text, quiet, faint, selection, link, line, hover;
+    QRgb base, window, raised, text, quiet, faint, selection, link, line, hover, edge;
 };
 
 constexpr std::array shades{
     Colours{0xffffffff, 0xfff3f5f7, 0xffeceff2, 0xff1f2328, 0xff5f6670, 0xff9aa1a9, 0xff1f5fa8, 0xff1f5fa8, 0xffd3d8de,
-            0xffe2e7ed},
+            0xffe2e7ed, 0xff868d95},
     Colours{0xff1e2226, 0xff24292e, 0xff2a2f35, 0xffe6e9ec, 0xffa0a7af, 0xff6e757d, 0xff2f6db5, 0xff7db7f0, 0xff3b424a,
-            0xff343a41},
+            0xff343a41, 0xff737b84},
 };
 
 const Colours& colours(Shade shade)
@@ -110,6 +110,11 @@ QColor quiet_colour(Shade shade)
 QColor line_colour(Shade shade)
 {
     return colours(shade).line;
+}
+
+QColor edge_colour(Shade shade)
+{
+    return colours(shade).edge;
 }
 
 QColor hover_colour(Shade shade)

@@ -21,6 +21,8 @@ enum class State { plain, deceased, archive, prospect, privacy, contact, booked_
 [[nodiscard]] QColor quiet_colour(Shade shade);
 /// Lines between areas of a page.
 [[nodiscard]] QColor line_colour(Shade shade);
+/// Around what is filled in or ticked: 3:1 and better against every background of its shade.
+[[nodiscard]] QColor edge_colour(Shade shade);
 /// Behind what the mouse is over.
 [[nodiscard]] QColor hover_colour(Shade shade);
 

@@ -31,25 +31,28 @@ int rounds(const QPrinter& printer)
 
 } // namespace
 
+bool print_on(QPrinter& printer, const PrintJob& job, core::Dialogue& dialogue, core::Progress& progress)
+{
+    printer.setDocName(job.title);
+    try {
+        for (int round = 0; round < rounds(printer); ++round)
+            if (!pages::draw_pages(job.spool, printer, chosen_range(printer, job), &progress))
+                return false;
+        return true;
+    } catch (const core::FileError& error) {
+        dialogue.show({error.text()});
+        return false;
+    }
+}
+
 bool QtPrinting::print(const PrintJob& job, QWidget& parent)
 {
     QPrinter printer(QPrinter::HighResolution);
-    printer.setDocName(job.title);
     QPrintDialog question(&printer, &parent);
     question.setOptions(QAbstractPrintDialog::PrintPageRange | QAbstractPrintDialog::PrintCurrentPage |
                         QAbstractPrintDialog::PrintCollateCopies | QAbstractPrintDialog::PrintToFile);
     question.setMinMax(1, job.spool.page_count());
-    if (question.exec() != QDialog::Accepted)
-        return false;
-    try {
-        for (int round = 0; round < rounds(printer); ++round)
-            if (!pages::draw_pages(job.spool, printer, chosen_range(printer, job), &m_progress))
-                return false;
-        return true;
-    } catch (const core::FileError& error) {
-        m_dialogue.show({error.text()});
-        return false;
-    }
+    return question.exec() == QDialog::Accepted && print_on(printer, job, m_dialogue, m_progress);
 }
 
 } // namespace kindrel::desktop

@@ -4,6 +4,7 @@
 #include "core/progress.h"
 #include "pages/spool.h"
 
+class QPrinter;
 class QWidget;
 
 namespace kindrel::desktop {
@@ -15,6 +16,9 @@ struct PrintJob
     QString title;
     int current_page = 1;
 };
+
+/// Prints the pages and copies that the printer is set to. False when cancelled or, after saying why, when it failed.
+[[nodiscard]] bool print_on(QPrinter& printer, const PrintJob& job, core::Dialogue& dialogue, core::Progress& progress);
 
 /// The way to a printer; tests put their own in its place.
 class Printing

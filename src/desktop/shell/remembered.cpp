@@ -60,8 +60,11 @@ protected:
 private:
     void share_width()
     {
-        for (int column = 0; column + 1 < int(m_shares.size()); ++column)
+        const int last = int(m_shares.size()) - 1;
+        for (int column = 0; column < last; ++column)
             m_header.resizeSection(column, m_header.width() * m_shares[std::size_t(column)] / 100);
+        // The header itself stretches the last column but does not shrink it below the size it began with.
+        m_header.resizeSection(last, m_header.width() - m_header.sectionPosition(last));
     }
 
     /// Columns that share the width never need one.

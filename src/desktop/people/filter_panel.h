@@ -1,0 +1,57 @@
+#pragma once
+
+#include "desktop/people/filter_part.h"
+
+class QLabel;
+class QListWidget;
+class QStackedWidget;
+class QTimer;
+
+namespace kindrel::desktop {
+
+class SavedFilterBar;
+
+/// A filter to be built: the kinds of criteria at the left, what each offers beside them, and below the filter in plain
+/// English with the number of people whom it finds. Nothing is read before the first reload().
+class FilterPanel : public QWidget
+{
+    Q_OBJECT
+
+public:
+    explicit FilterPanel(Desk& desk, QWidget* parent = nullptr);
+
+    [[nodiscard]] const people::Filter& filter() const { return m_filter; }
+    void set_filter(people::Filter filter);
+    /// Reads lists and saved filters again; the filter stays.
+    void reload();
+    void focus_kinds();
+    /// The cursor goes to the choice of a file status.
+    void ask_for_families();
+    /// Counts at once, without waiting for a pause in typing.
+    void count_now();
+
+Q_SIGNALS:
+    void changed();
+
+private:
+    void add_parts();
+    void add_part(FilterPart* part);
+    [[nodiscard]] QListWidget* make_kinds();
+    [[nodiscard]] QWidget* make_outcome();
+    [[nodiscard]] FilterPart& part(int row) const;
+    void show_part(int row);
+    void show_uses();
+    void take_change();
+    void show_outcome(const QString& count, const QString& sentence, const QStringList& faults);
+
+    Desk& m_desk;
+    people::Filter m_filter;
+    SavedFilterBar* m_saved;
+    QListWidget* m_kinds;
+    QStackedWidget* m_parts;
+    QLabel *m_count, *m_sentence, *m_faults;
+    QTimer* m_pause;
+    bool m_read = false; ///< There was a first reload().
+};
+
+} // namespace kindrel::desktop

@@ -1,0 +1,164 @@
+#include "desktop/people/layout_steps.h"
+
+#include "core/entry.h"
+#include "desktop/shell/look.h"
+#include "desktop/shell/value_form.h"
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QGridLayout>
+#include <QLineEdit>
+
+#include <array>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+using output::HeadParts;
+
+namespace {
+
+constexpr int longest_title = 80;
+const QString paper_key = u"tagging/paper"_s;
+const QString text_key = u"tagging/text_percent"_s;
+
+struct PartRow
+{
+    bool HeadParts::*on;
+    const char* name;
+    const char* text;
+};
+
+constexpr std::array part_rows{
+    PartRow{&HeadParts::date, "title_date", "The &date"},
+    PartRow{&HeadParts::filters, "title_filters", "The f&ilters in use"},
+    PartRow{&HeadParts::church, "title_church", "The &church's name"},
+    PartRow{&HeadParts::logo, "title_logo", "The &logo"},
+};
+
+struct TextRow
+{
+    int percent;
+    const char* text;
+};
+
+constexpr std::array text_rows{TextRow{85, "Small"}, TextRow{100, "As the report has it"}, TextRow{120, "Large"},
+                               TextRow{140, "Very large"}};
+
+} // namespace
+
+HiddenPanel::HiddenPanel(Desk& desk, TaggingSheet& sheet)
+    : StepPanel(sheet, u"Hidden"_s), m_desk(desk), m_print(new QCheckBox(u"Print &unlisted details too"_s))
+{
+    m_print->setObjectName(u"hidden_details"_s);
+    connect(m_print, &QCheckBox::clicked, this, &HiddenPanel::turn);
+    auto* column = make_step_column(*this, u"Hidden details"_s);
+    column->addWidget(m_print);
+    add_step_words(*column,
+                   u"What is marked as unlisted is left out of every report. For the office's own eyes it can be "
+                   "printed; every page then says so at its foot."_s);
+    column->addStretch(1);
+}
+
+void HiddenPanel::focus_first()
+{
+    m_print->setFocus(Qt::OtherFocusReason);
+}
+
+void HiddenPanel::turn(bool on)
+{
+    const bool granted = on && core::permitted(m_desk.office, core::Area::security);
+    m_print->setChecked(granted);
+    sheet().options.hidden_details = granted;
+    sheet().plan.hidden_details = granted;
+    Q_EMIT changed();
+}
+
+TitlePanel::TitlePanel(Desk& desk, TaggingSheet& sheet)
+    : StepPanel(sheet, u"Title"_s), m_desk(desk), m_title(new QLineEdit)
+{
+    m_title->setObjectName(u"report_title"_s);
+    m_title->setAccessibleName(u"Title of the report"_s);
+    m_title->setPlaceholderText(u"The report's own title"_s);
+    m_title->setMaxLength(longest_title);
+    connect(m_title, &QLineEdit::textChanged, this, &TitlePanel::take);
+    auto* column = make_step_column(*this, u"Title"_s);
+    column->addWidget(m_title);
+    column->addWidget(make_heading(u"In the head of every page"_s));
+    const auto church = HeadParts::of(desk.office.settings);
+    for (const auto& row : part_rows) {
+        auto* part = new QCheckBox(QString::fromLatin1(row.text));
+        part->setObjectName(QString::fromLatin1(row.name));
+        part->setChecked(church.*row.on);
+        connect(part, &QCheckBox::toggled, this, &TitlePanel::take);
+        column->addWidget(part);
+        m_parts.push_back(part);
+    }
+    column->addStretch(1);
+}
+
+void TitlePanel::focus_first()
+{
+    m_title->setFocus(Qt::OtherFocusReason);
+}
+
+bool TitlePanel::is_set() const
+{
+    return !sheet().options.title.isEmpty() || sheet().options.head;
+}
+
+void TitlePanel::take()
+{
+    auto& options = sheet().options;
+    options.title = m_title->text().trimmed();
+    HeadParts parts;
+    for (std::size_t row = 0; row < part_rows.size(); ++row)
+        parts.*part_rows[row].on = m_parts[row]->isChecked();
+    options.head = parts == HeadParts::of(m_desk.office.settings) ? std::nullopt : std::optional(parts);
+    Q_EMIT changed();
+}
+
+FormatPanel::FormatPanel(Desk& desk, TaggingSheet& sheet)
+    : StepPanel(sheet, u"Format"_s), m_desk(desk), m_paper(new QComboBox), m_text(new QComboBox)
+{
+    m_paper->setObjectName(u"paper"_s);
+    m_paper->addItems({u"A4"_s, u"Letter"_s});
+    m_paper->setCurrentIndex(desk.remembered.value(paper_key, 0).toInt() == 1 ? 1 : 0);
+    m_text->setObjectName(u"text_size"_s);
+    for (const auto& row : text_rows)
+        m_text->addItem(QString::fromLatin1(row.text), row.percent);
+    m_text->setCurrentIndex(std::max(0, m_text->findData(desk.remembered.value(text_key, 100).toInt())));
+    auto* column = make_step_column(*this, u"Format"_s);
+    auto* rows = new QGridLayout;
+    rows->setSpacing(space::field);
+    rows->setColumnStretch(1, 1);
+    column->addLayout(rows);
+    add_step_row(*rows, u"P&aper"_s, m_paper);
+    add_step_row(*rows, u"Te&xt"_s, m_text);
+    column->addStretch(1);
+    take();
+    for (QComboBox* choice : {m_paper, m_text})
+        connect(choice, &QComboBox::currentIndexChanged, this, &FormatPanel::take);
+}
+
+void FormatPanel::focus_first()
+{
+    m_paper->setFocus(Qt::OtherFocusReason);
+}
+
+bool FormatPanel::is_set() const
+{
+    return sheet().options.paper != pages::Paper::a4 || sheet().options.text_percent != 100;
+}
+
+void FormatPanel::take()
+{
+    auto& options = sheet().options;
+    options.paper = pages::Paper(m_paper->currentIndex());
+    options.text_percent = m_text->currentData().toInt();
+    m_desk.remembered.keep(paper_key, m_paper->currentIndex());
+    m_desk.remembered.keep(text_key, options.text_percent);
+    Q_EMIT changed();
+}
+
+} // namespace kindrel::desktop

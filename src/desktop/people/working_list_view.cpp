@@ -1,0 +1,141 @@
+#include "desktop/people/working_list_view.h"
+
+#include "core/entry.h"
+#include "desktop/output/list_report.h"
+#include "desktop/people/working_people.h"
+#include "desktop/shell/look.h"
+#include "desktop/shell/note_bar.h"
+#include "desktop/shell/table_text.h"
+
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QLocale>
+#include <QPushButton>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+const QString list_title = u"People of the list"_s;
+
+} // namespace
+
+WorkingListView::WorkingListView(Desk& desk, TaggingSheet& sheet, NoteBar& note)
+    : m_desk(desk), m_sheet(sheet), m_note(note), m_state(new QLabel),
+      m_as_filtered(new QPushButton(u"As f&iltered"_s)), m_people(new WorkingPeople(desk))
+{
+    m_state->setObjectName(u"state"_s);
+    m_state->setTextFormat(Qt::PlainText);
+    m_state->setWordWrap(true);
+    m_state->setTextInteractionFlags(Qt::TextSelectableByMouse);
+    m_as_filtered->setObjectName(u"as_filtered"_s);
+    m_as_filtered->setToolTip(u"Forget who was added and struck by hand"_s);
+    connect(m_as_filtered, &QPushButton::clicked, this, &WorkingListView::drop_changes_by_hand);
+    connect(m_people, &WorkingPeople::added, this, &WorkingListView::add);
+    connect(m_people, &WorkingPeople::struck, this, &WorkingListView::strike);
+    connect(m_people, &WorkingPeople::opened, this,
+            [this](int family) { m_desk.navigation.open_family(family, list().families(), list_title); });
+    auto* above = new QHBoxLayout;
+    above->addWidget(m_state, 1);
+    above->addWidget(m_as_filtered, 0, Qt::AlignTop);
+    auto* column = new QVBoxLayout(this);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(space::field);
+    column->addLayout(above);
+    column->addWidget(m_people, 1);
+}
+
+QString people_words(qsizetype people)
+{
+    return people == 1 ? u"1 person"_s : u"%1 people"_s.arg(QLocale().toString(people));
+}
+
+QString WorkingListView::count_words() const
+{
+    return people_words(std::ssize(m_made.people));
+}
+
+void WorkingListView::focus_line()
+{
+    m_people->focus_line();
+}
+
+bool WorkingListView::can_make() const
+{
+    const auto& plan = m_sheet.plan;
+    const bool birth_dates = plan.sort.by != people::SortBy::birth_date || m_desk.office.may(core::Area::birth_dates);
+    return plan.filter.families && birth_dates && !people::sort_refusal(plan.sort);
+}
+
+void WorkingListView::make()
+{
+    if (!can_make())
+        return;
+    const auto& plan = m_sheet.plan;
+    m_made = people::make_list(m_desk.office, plan);
+    m_people->show_people(m_made.people);
+    m_state->setText(u"%1: %2"_s.arg(count_words(), m_made.list.criteria));
+    m_as_filtered->setVisible(!plan.added.empty() || !plan.struck.empty());
+    Q_EMIT made();
+}
+
+void WorkingListView::change_by_hand(const QString& words, const std::function<void()>& change)
+{
+    const auto before = m_sheet.plan;
+    change();
+    make();
+    m_note.offer(words, u"Undo"_s, [this, added = before.added, struck = before.struck] {
+        m_sheet.plan.added = added;
+        m_sheet.plan.struck = struck;
+        make();
+    });
+}
+
+void WorkingListView::add(const people::ListedPerson& person)
+{
+    const auto& there = m_made.list.members;
+    if (std::ranges::find(there, person.member.person_id, &people::Member::person_id) != there.end())
+        return m_note.say(u"%1 %2 is on the list already."_s.arg(person.name, person.surname));
+    change_by_hand(u"%1 %2 was added to the list."_s.arg(person.name, person.surname),
+                   [&] { people::add_by_hand(m_sheet.plan, person.member); });
+}
+
+void WorkingListView::strike(const std::vector<int>& people)
+{
+    change_by_hand(u"%1 struck from the list."_s.arg(people_words(std::ssize(people))), [&] {
+        for (const int person : people)
+            people::strike_by_hand(m_sheet.plan, person);
+    });
+}
+
+void WorkingListView::drop_changes_by_hand()
+{
+    change_by_hand(u"The list is as it was filtered."_s, [this] {
+        m_sheet.plan.added.clear();
+        m_sheet.plan.struck.clear();
+    });
+    m_people->focus_list();
+}
+
+bool WorkingListView::has_people() const
+{
+    if (m_made.people.empty())
+        m_desk.office.dialogue.show({u"No people found for creating a report"_s});
+    return !m_made.people.empty();
+}
+
+void WorkingListView::print()
+{
+    if (has_people())
+        print_list(m_desk, list_title, m_people->model());
+}
+
+void WorkingListView::save()
+{
+    if (core::permitted(m_desk.office, core::Area::export_text) && has_people())
+        save_as_csv(m_people->model(), list_title, m_desk.office.dialogue);
+}
+
+} // namespace kindrel::desktop

@@ -1,0 +1,84 @@
+#include "desktop/shell/date_field.h"
+
+#include "desktop/shell/typed_date.h"
+
+#include <QKeyEvent>
+#include <QScopedValueRollback>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+
+DateField::DateField(core::Office& office, QWidget* parent) : QLineEdit(parent), m_office(office)
+{
+    const bool month_first = office.day_order() == core::DayOrder::month_first;
+    setPlaceholderText(month_first ? u"MM/DD/YYYY"_s : u"DD/MM/YYYY"_s);
+    setToolTip(u"XXXX for a year that is not known, t for today, +7 for a week from today"_s);
+    connect(this, &QLineEdit::editingFinished, this, &DateField::finish);
+}
+
+void DateField::show_date(std::optional<core::Date> date)
+{
+    m_date = date;
+    const QString words = date ? date->shown(m_office.day_order()) : QString();
+    if (!isModified() && text() != words)
+        setText(words);
+}
+
+bool DateField::finish()
+{
+    if (!isModified() || m_telling)
+        return !m_telling;
+    const QString typed = text().trimmed();
+    const auto date = typed_date(m_office, typed);
+    if (!typed.isEmpty() && !date) {
+        const QScopedValueRollback telling(m_telling, true);
+        m_office.dialogue.show(core::bad_date_message(m_office.day_order()));
+        // After the click or key that led out of the field.
+        QMetaObject::invokeMethod(
+            this,
+            [this] {
+                setFocus();
+                selectAll();
+            },
+            Qt::QueuedConnection);
+        return false;
+    }
+    setModified(false);
+    const bool changed = date != m_date;
+    show_date(date);
+    if (changed)
+        Q_EMIT entered(date);
+    return true;
+}
+
+void DateField::give_up()
+{
+    setModified(false);
+    show_date(m_date);
+    selectAll();
+}
+
+bool DateField::event(QEvent* event)
+{
+    if (!isModified() && asks_for_undo(*event)) {
+        event->ignore();
+        return false;
+    }
+    return QLineEdit::event(event);
+}
+
+void DateField::keyPressEvent(QKeyEvent* event)
+{
+    if (event->key() == Qt::Key_Escape && isModified())
+        give_up();
+    else
+        QLineEdit::keyPressEvent(event);
+}
+
+bool asks_for_undo(const QEvent& event)
+{
+    return event.type() == QEvent::ShortcutOverride && static_cast<const QKeyEvent&>(event).matches(QKeySequence::Undo);
+}
+
+} // namespace kindrel::desktop

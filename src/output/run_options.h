@@ -1,0 +1,40 @@
+#pragma once
+
+#include "core/settings.h"
+#include "pages/page_setup.h"
+
+#include <optional>
+
+namespace kindrel::output {
+
+/// What stands in the head of every page beside the title.
+struct HeadParts
+{
+    bool date = false;
+    bool filters = false;
+    bool church = false;
+    bool logo = false;
+
+    [[nodiscard]] static HeadParts of(const core::Settings& settings)
+    {
+        return {settings.title_date, settings.title_filters, settings.title_church, settings.title_logo};
+    }
+    friend bool operator==(const HeadParts&, const HeadParts&) = default;
+};
+
+/// How one run of a report differs from what the report and the church have set.
+struct RunOptions
+{
+    pages::Paper paper = pages::Paper::a4;
+    int text_percent = 100;             ///< Of the layout's own text size.
+    QString title = {};                 ///< Empty: the report's own.
+    std::optional<HeadParts> head = {}; ///< Unset: as the church has it.
+    bool hidden_details = false;        ///< Prints what is kept hidden too; needs the right to the security setup.
+
+    friend bool operator==(const RunOptions&, const RunOptions&) = default;
+};
+
+/// Stands at the foot of every page that may hold hidden details.
+inline constexpr QStringView hidden_details_note = u"Holds unlisted details: for the office alone";
+
+} // namespace kindrel::output

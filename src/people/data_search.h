@@ -1,0 +1,29 @@
+#pragma once
+
+#include "core/office.h"
+#include "people/data_parts.h"
+#include "people/records.h"
+#include "people/working_list.h"
+
+namespace kindrel::people {
+
+/// Somebody with an entry in a part of the record; a family is listed by the person at its head.
+struct DataEntry
+{
+    Member member;
+    QString surname = {};
+    QString name = {};                         ///< As listed; empty for a family without people.
+    FileStatus Condition = FileStatus::active; ///< Of the family's file.
+    QString value = {};                        ///< Several are parted by "; ".
+    bool hidden = false;                       ///< The value is unlisted: nothing for paper or files.
+};
+
+/// In order of surname, family and place in it. Hidden entries are found like all others. Nullopt after saying which
+/// right is missing. One statement.
+[[nodiscard]] std::optional<std::vector<DataEntry>> people_with(core::Office& office, const DataPart& part);
+/// What the list of a part is called: "People with an entry in Birth Date".
+[[nodiscard]] QString heading_of(const DataPart& part);
+/// The people found, each once.
+[[nodiscard]] WorkingList working_list(const DataPart& part, const std::vector<DataEntry>& entries);
+
+} // namespace kindrel::people

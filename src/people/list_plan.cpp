@@ -1,0 +1,139 @@
+#include "people/list_plan.h"
+
+#include "people/filter_search.h"
+#include "people/sort_key.h"
+
+#include <QSet>
+
+#include <algorithm>
+
+namespace kindrel::people {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+FilterDay day_of(const core::Office& office)
+{
+    return {office.clock.today(), office.day_order()};
+}
+
+QString span_words(const QString& what, const QString& first, const QString& last)
+{
+    if (first.isEmpty() && last.isEmpty())
+        return {};
+    if (last.isEmpty())
+        return u"%1 from %2"_s.arg(what, first);
+    return first.isEmpty() ? u"%1 up to %2"_s.arg(what, last) : u"%1 from %2 to %3"_s.arg(what, first, last);
+}
+
+QString number_words(const std::optional<int>& number)
+{
+    return number ? QString::number(*number) : QString();
+}
+
+QString hand_words(const ListPlan& plan)
+{
+    QStringList parts;
+    if (!plan.added.empty())
+        parts += u"%1 added"_s.arg(plan.added.size());
+    if (!plan.struck.empty())
+        parts += u"%1 struck"_s.arg(plan.struck.size());
+    return parts.isEmpty() ? QString() : parts.join(u" and "_s) + u" by hand"_s;
+}
+
+/// The people of `members` who are not in the list, in their order.
+WorkingList lacking(const std::vector<Member>& list, const std::vector<Member>& members)
+{
+    QSet<int> there;
+    for (const auto& member : list)
+        there.insert(member.person_id);
+    WorkingList found;
+    std::ranges::copy_if(members, std::back_inserter(found.members),
+                         [&](const Member& member) { return !there.contains(member.person_id); });
+    return found;
+}
+
+std::vector<Member> members_of(const std::vector<ListedPerson>& people)
+{
+    std::vector<Member> members;
+    members.reserve(people.size());
+    std::ranges::transform(people, std::back_inserter(members), &ListedPerson::member);
+    return members;
+}
+
+WorkingList in_order(core::Office& office, const ListPlan& plan)
+{
+    auto list = find_people(*office.session, plan.filter, day_of(office));
+    if (plan.added.empty() && plan.sort == SortOrder{})
+        return list; // As it was found.
+    const auto more = lacking(list.members, plan.added);
+    list.members.insert(list.members.end(), more.members.begin(), more.members.end());
+    return sorted(*office.session, list, plan.sort, office.clock.today());
+}
+
+} // namespace
+
+QString range_words(const ListRange& range)
+{
+    QStringList parts{span_words(u"surnames"_s, range.first_letter, range.last_letter),
+                      span_words(u"places"_s, number_words(range.first), number_words(range.last))};
+    parts.removeAll(QString());
+    return parts.join(u", "_s);
+}
+
+std::vector<ListedPerson> within(const ListRange& range, std::vector<ListedPerson> people)
+{
+    const QString first = sort_key(range.first_letter), last = sort_key(range.last_letter);
+    std::erase_if(people, [&](const ListedPerson& person) {
+        return person.sort_key < first || (!last.isEmpty() && person.sort_key.left(last.size()) > last);
+    });
+    const auto size = static_cast<int>(people.size());
+    const int begin = std::clamp(range.first.value_or(1) - 1, 0, size);
+    const int end = std::clamp(range.last.value_or(size), begin, size);
+    people.erase(people.begin() + end, people.end());
+    people.erase(people.begin(), people.begin() + begin);
+    return people;
+}
+
+MadeList make_list(core::Office& office, const ListPlan& plan)
+{
+    auto& session = *office.session;
+    const bool preferred = office.settings.use_preferred_names;
+    const auto found = having(session, in_order(office, plan), plan.needs, plan.hidden_details);
+    const QSet<int> struck(plan.struck.begin(), plan.struck.end());
+    MadeList made;
+    made.people = listed_people(session, found, preferred);
+    std::erase_if(made.people, [&](const ListedPerson& person) { return struck.contains(person.member.person_id); });
+    made.people = within(plan.range, std::move(made.people));
+    const auto left_out = lacking(members_of(made.people), plan.added);
+    if (!left_out.members.empty())
+        std::ranges::move(listed_people(session, left_out, preferred), std::back_inserter(made.people));
+    made.list = {members_of(made.people), sentence_of(office, plan)};
+    return made;
+}
+
+QString sentence_of(core::Office& office, const ListPlan& plan)
+{
+    QStringList parts{sentence(*office.session, plan.filter, day_of(office)),
+                      sort_sentence(plan.sort, office.day_order()), needs_words(plan.needs), range_words(plan.range),
+                      hand_words(plan)};
+    parts.removeAll(QString());
+    return parts.join(u"; "_s);
+}
+
+void add_by_hand(ListPlan& plan, const Member& member)
+{
+    std::erase(plan.struck, member.person_id);
+    if (std::ranges::find(plan.added, member.person_id, &Member::person_id) == plan.added.end())
+        plan.added.push_back(member);
+}
+
+void strike_by_hand(ListPlan& plan, int person_id)
+{
+    std::erase_if(plan.added, [&](const Member& member) { return member.person_id == person_id; });
+    if (std::ranges::find(plan.struck, person_id) == plan.struck.end())
+        plan.struck.push_back(person_id);
+}
+
+} // namespace kindrel::people

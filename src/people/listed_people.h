@@ -1,0 +1,42 @@
+#pragma once
+
+#include "people/working_list.h"
+
+namespace kindrel::people {
+
+/// A line of a people list.
+struct ListedPerson
+{
+    Member member;
+    QString name; ///< As the church lists people, with the markers.
+    QString surname;
+    QString sort_key; ///< Of the family.
+    bool deceased = false, archived = false, privacy = false, prospect = false, contact = false;
+    bool booked_out = false; ///< The family is away.
+};
+
+/// The people of the list in its order; who is no longer in the register is passed over. One statement. Throws
+/// core::DatabaseError, as all here do.
+[[nodiscard]] std::vector<ListedPerson> listed_people(core::Session& session, const WorkingList& list,
+                                                      bool use_preferred_names);
+/// Everybody in the register, family by family.
+[[nodiscard]] std::vector<ListedPerson> everybody(core::Session& session, bool use_preferred_names);
+
+/// What a person must have that a report can print: of the family or of the person's own.
+struct Needs
+{
+    bool address = false;
+    bool phone = false;
+    bool email = false;
+    bool birth_date = false;
+
+    [[nodiscard]] bool any() const { return address || phone || email || birth_date; }
+    friend bool operator==(const Needs&, const Needs&) = default;
+};
+
+/// Those of the list who have it all. What is kept hidden does not count unless `hidden_too`. One statement.
+[[nodiscard]] WorkingList having(core::Session& session, const WorkingList& list, const Needs& needs, bool hidden_too);
+/// "with an address and a phone number"; empty without needs.
+[[nodiscard]] QString needs_words(const Needs& needs);
+
+} // namespace kindrel::people

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "core/office.h"
+#include "people/filter.h"
+
+namespace kindrel::people {
+
+struct SavedFilter
+{
+    int filter_id = 0;
+    QString name;
+
+    friend bool operator==(const SavedFilter&, const SavedFilter&) = default;
+};
+
+/// By name. Throws core::DatabaseError, as all here do.
+[[nodiscard]] std::vector<SavedFilter> saved_filters(core::Session& session);
+
+/// Keeps the filter under a name; asks before it replaces the one that bears it already. The key, or nullopt after
+/// saying why nothing was saved.
+[[nodiscard]] std::optional<int> save_filter(core::Office& office, const QString& name, const Filter& filter);
+/// With the texts that its items have now. Nullopt, after saying why, when it is gone or cannot be understood.
+[[nodiscard]] std::optional<Filter> load_filter(core::Office& office, int filter_id);
+[[nodiscard]] bool rename_filter(core::Office& office, int filter_id, const QString& name);
+/// Asks first.
+[[nodiscard]] bool remove_filter(core::Office& office, const SavedFilter& filter);
+
+} // namespace kindrel::people

@@ -1,0 +1,398 @@
+#include "people/tagging.h"
+
+#include "core/entry.h"
+#include "core/open_church.h"
+#include "people/group_history.h"
+#include "people/link_tables.h"
+
+#include <algorithm>
+#include <array>
+
+namespace kindrel::people {
+
+using namespace Qt::StringLiterals;
+using core::to_value;
+using core::Value;
+
+namespace {
+
+struct Rule
+{
+    TagKind kind;
+    const char16_t* words;
+    const char* section; ///< Of `tbl_record_access`.
+    std::vector<LinkRow> Person::*rows;
+};
+
+constexpr std::array rules{
+    Rule{TagKind::status, u" Status ", "status", &Person::status},
+    Rule{TagKind::group, u" Group ", "groups", &Person::groups},
+    Rule{TagKind::ministry, u" Ministry ", "ministry", &Person::ministries},
+    Rule{TagKind::date, u" Date Tag", "date", &Person::dates},
+    Rule{TagKind::flexi, u" Flexi Tag", "flexi", &Person::flexi},
+};
+
+const Rule& rule_of(TagKind kind)
+{
+    return *std::ranges::find(rules, kind, &Rule::kind);
+}
+
+const LinkTable& table_of(TagKind kind)
+{
+    const auto links = person_links();
+    return std::ranges::find(links, rule_of(kind).rows, &PersonLink::rows)->table;
+}
+
+/// Name and value side by side: what the kind stores of a row beside its key.
+struct Content
+{
+    const char* name;
+    Value value;
+};
+
+std::vector<Content> content_of(const LinkTable& table, const LinkRow& row)
+{
+    const std::array all{Content{table.date, to_value(row.date)}, Content{table.field, to_value(row.field)},
+                         Content{table.tagged, to_value(row.tagged)}};
+    std::vector<Content> found;
+    std::ranges::copy_if(all, std::back_inserter(found), [](const Content& each) { return each.name != nullptr; });
+    return found;
+}
+
+LinkRow row_of(const TagItem& item)
+{
+    LinkRow row;
+    row.item = item.item;
+    row.type = item.kind == TagKind::ministry ? static_cast<int>(item.ministry) : 0;
+    if (item.kind == TagKind::date)
+        row.date = item.date;
+    if (item.kind == TagKind::flexi)
+        row.field = item.field;
+    row.tagged = item.tagged && (item.kind == TagKind::date || item.kind == TagKind::flexi);
+    return row;
+}
+
+QString named(const char* name)
+{
+    return QString::fromLatin1(name);
+}
+
+/// A statement over the link rows of the item; the values of the row's key come first.
+struct Keyed
+{
+    QString where;
+    std::vector<Value> values;
+};
+
+Keyed key_of(const LinkTable& table, const LinkRow& row, const QString& alias = {})
+{
+    Keyed key{u"%1[%2]=?"_s.arg(alias, named(table.item)), {to_value(row.item)}};
+    if (table.type) {
+        key.where += u" AND %1[%2]=?"_s.arg(alias, named(table.type));
+        key.values.push_back(to_value(row.type));
+    }
+    return key;
+}
+
+/// A person of the list who is still in the register, with the row that carries the item.
+struct Candidate
+{
+    int person_id = 0;
+    bool away = false;
+    bool closed = false;
+    std::optional<LinkRow> carried;
+    int position = 0;
+};
+
+QString column_or_null(const char* name)
+{
+    return name ? u"l.[%1]"_s.arg(named(name)) : u"NULL"_s;
+}
+
+std::vector<Candidate> candidates(core::Office& office, const WorkingList& list, const TagItem& item)
+{
+    core::Session& session = *office.session;
+    lend(session, list);
+    const LinkTable& table = table_of(item.kind);
+    const LinkRow row = row_of(item);
+    const Keyed key = key_of(table, row, u"l."_s);
+    const auto text =
+        u"SELECT w.[person_id],f.[booked_out],f.[active_in_book],a.[%1],l.[%2],%3,%4,%5,%6 FROM [work_people] w "
+        "INNER JOIN [tbl_people] p ON p.[person_id]=w.[person_id] "
+        "INNER JOIN [tbl_surname] f ON f.[Surname_ID]=p.[Surname_ID] "
+        "LEFT JOIN [tbl_record_access] a ON a.[surname_id]=f.[Surname_ID] "
+        "LEFT JOIN [%7] l ON l.[person_id]=w.[person_id] AND %8 ORDER BY w.[place];"_s.arg(
+            named(rule_of(item.kind).section), named(table.item), column_or_null(table.date),
+            column_or_null(table.field), column_or_null(table.tagged), column_or_null(table.position),
+            named(table.table), key.where);
+    auto rows = session.select_with(text, key.values);
+    std::vector<Candidate> found;
+    for (const core::Row& each : rows) {
+        Candidate& person = found.emplace_back();
+        person.person_id = each.integer(core::Column{0});
+        const bool booked_out = each.flag(core::Column{1});
+        person.away = office.mode == core::Mode::booked_out ? !each.flag(core::Column{2}) : booked_out;
+        person.closed = !each.is_null(core::Column{3}) && !each.flag(core::Column{3});
+        if (each.is_null(core::Column{4}))
+            continue;
+        LinkRow& carried = person.carried.emplace(row);
+        carried.date = each.date(core::Column{5});
+        carried.field = each.text(core::Column{6});
+        carried.tagged = each.flag(core::Column{7});
+        person.position = each.integer(core::Column{8});
+    }
+    return found;
+}
+
+/// Who gets a row, whose row gets other content, whose goes.
+BulkChange plan(core::Office& office, const WorkingList& list, const TagItem& item, TagAct act)
+{
+    BulkChange change{.act = act, .item = item, .day = office.clock.today(), .count = {}, .added = {}, .before = {}};
+    const LinkRow wanted = row_of(item);
+    for (const auto& person : candidates(office, list, item)) {
+        const bool gives = act == TagAct::give && (!person.carried || *person.carried != wanted);
+        const bool takes = act == TagAct::take && person.carried;
+        if (person.away)
+            ++change.count.booked_out;
+        else if (person.closed)
+            ++change.count.closed;
+        else if (!gives && !takes)
+            ++change.count.as_it_was;
+        else {
+            ++change.count.changed;
+            if (person.carried)
+                change.before.push_back({person.person_id, *person.carried, person.position});
+            else
+                change.added.push_back(person.person_id);
+        }
+    }
+    return change;
+}
+
+std::vector<int> people_of(const std::vector<BulkChange::Row>& rows)
+{
+    std::vector<int> people;
+    std::ranges::transform(rows, std::back_inserter(people), &BulkChange::Row::person_id);
+    return people;
+}
+
+constexpr auto among_lent = u" AND [person_id] IN (SELECT [person_id] FROM [work_tagged])";
+
+void lend_people(core::Session& session, const std::vector<int>& people)
+{
+    std::vector<std::vector<Value>> rows;
+    for (const int person : people)
+        rows.push_back({to_value(person)});
+    session.fill_temporary(u"work_tagged"_s, {u"person_id"_s}, rows);
+}
+
+/// The place behind what each of the lent people carries; nothing for a kind without places.
+std::vector<std::pair<int, int>> last_places(core::Session& session, const LinkTable& table)
+{
+    std::vector<std::pair<int, int>> places;
+    if (!table.position)
+        return places;
+    auto rows = session.select(u"SELECT [person_id],MAX([%1]) FROM [%2] WHERE 1=1%3 GROUP BY [person_id] "
+                               "ORDER BY [person_id];"_s.arg(named(table.position), named(table.table), among_lent));
+    for (const core::Row& row : rows)
+        places.emplace_back(row.integer(core::Column{0}), row.integer(core::Column{1}));
+    return places;
+}
+
+void insert_rows(core::Session& session, const LinkTable& table, const std::vector<BulkChange::Row>& added)
+{
+    QStringList fields{u"person_id"_s, named(table.item)};
+    if (table.type)
+        fields += named(table.type);
+    if (table.position)
+        fields += named(table.position);
+    for (const auto& content : content_of(table, {}))
+        fields += named(content.name);
+    std::vector<std::vector<Value>> rows;
+    for (const auto& [person, link, position] : added) {
+        auto& row = rows.emplace_back(std::vector<Value>{to_value(person), to_value(link.item)});
+        if (table.type)
+            row.push_back(to_value(link.type));
+        if (table.position)
+            row.push_back(to_value(position));
+        for (auto& content : content_of(table, link))
+            row.push_back(std::move(content.value));
+    }
+    session.insert(named(table.table), fields, rows);
+}
+
+/// At the end of what each person carries.
+void add_rows(core::Session& session, const LinkTable& table, const LinkRow& row, const std::vector<int>& people)
+{
+    lend_people(session, people);
+    const auto places = last_places(session, table);
+    std::vector<BulkChange::Row> rows;
+    for (const int person : people) {
+        const auto last = std::ranges::lower_bound(places, person, {}, &std::pair<int, int>::first);
+        const bool carries = last != places.end() && last->first == person;
+        rows.push_back({person, row, carries ? last->second + 1 : 1});
+    }
+    insert_rows(session, table, rows);
+}
+
+void delete_rows(core::Session& session, const LinkTable& table, const LinkRow& row, const std::vector<int>& people)
+{
+    lend_people(session, people);
+    const Keyed key = key_of(table, row);
+    session.execute_with(u"DELETE FROM [%1] WHERE %2%3;"_s.arg(named(table.table), key.where, among_lent), key.values);
+}
+
+std::vector<Membership> memberships(const std::vector<int>& people, int group)
+{
+    std::vector<Membership> all;
+    for (const int person : people)
+        all.push_back({person, group});
+    return all;
+}
+
+void carry_out(core::Session& session, const BulkChange& change)
+{
+    const LinkTable& table = table_of(change.item.kind);
+    const LinkRow row = row_of(change.item);
+    const auto had = people_of(change.before);
+    if (change.item.kind == TagKind::group) {
+        const bool giving = change.act == TagAct::give;
+        write_group_history(session, giving ? memberships(change.added, row.item) : std::vector<Membership>{},
+                            giving ? std::vector<Membership>{} : memberships(had, row.item), change.day);
+    }
+    if (!had.empty())
+        delete_rows(session, table, row, had);
+    if (change.act == TagAct::take)
+        return;
+    auto rewritten = change.before;
+    std::ranges::for_each(rewritten, [&](auto& each) { each.row = row; });
+    insert_rows(session, table, rewritten);
+    add_rows(session, table, row, change.added);
+}
+
+bool refuse(const core::Office& office, const QString& text)
+{
+    office.dialogue.show({text});
+    return false;
+}
+
+bool may_tag(core::Office& office, const std::optional<WorkingList>& list, const TagItem& item, TagAct act)
+{
+    if (!core::permitted(office, core::Area::tagging) || !core::network_guard(office))
+        return false;
+    if (office.may(core::Area::read_only_family_data))
+        return refuse(office, u"Unable to tag people as you only have read only access within family files"_s);
+    if (!list)
+        return refuse(office, u"Unable to process the tagging function until you first select people to tag"_s);
+    if (item.item == 0) {
+        const auto begin =
+            act == TagAct::give ? u"Unable to tag the people with a "_s : u"Unable to remove the people from the "_s;
+        return refuse(office,
+                      begin + QString::fromUtf16(rule_of(item.kind).words) + u" until you choose one from the list"_s);
+    }
+    if (list->members.empty())
+        return refuse(office,
+                      act == TagAct::give ? u"No people exist for tagging"_s : u"No people exist for un-tagging"_s);
+    return true;
+}
+
+QString counted(int people, const QString& one, const QString& many)
+{
+    return people == 1 ? one : many.arg(people);
+}
+
+/// The people whose rows are as the change left them.
+std::vector<int> untouched(core::Office& office, const BulkChange& change, const std::vector<int>& people)
+{
+    WorkingList list;
+    for (const int person : people)
+        list.members.push_back({person, 0});
+    std::optional<LinkRow> left;
+    if (change.act == TagAct::give)
+        left = row_of(change.item);
+    std::vector<int> found;
+    for (const auto& person : candidates(office, list, change.item)) {
+        if (person.carried == left)
+            found.push_back(person.person_id);
+    }
+    std::ranges::sort(found);
+    return found;
+}
+
+std::vector<int> among(const std::vector<int>& people, const std::vector<int>& sorted)
+{
+    std::vector<int> found;
+    std::ranges::copy_if(people, std::back_inserter(found),
+                         [&](int person) { return std::ranges::binary_search(sorted, person); });
+    return found;
+}
+
+} // namespace
+
+QString TagCount::words() const
+{
+    QStringList parts{counted(changed, u"1 person changes"_s, u"%1 people change"_s)};
+    if (as_it_was > 0)
+        parts += counted(as_it_was, u"1 stays as it is"_s, u"%1 stay as they are"_s);
+    if (booked_out > 0)
+        parts += u"%1 in booked out families skipped"_s.arg(booked_out);
+    if (closed > 0)
+        parts += u"%1 in closed family files skipped"_s.arg(closed);
+    return parts.join(u", "_s);
+}
+
+TagCount count_tagging(core::Office& office, const WorkingList& list, const TagItem& item, TagAct act)
+{
+    return plan(office, list, item, act).count;
+}
+
+std::optional<BulkChange> tag(core::Office& office, const std::optional<WorkingList>& list, const TagItem& item,
+                              TagAct act)
+{
+    if (!may_tag(office, list, item, act))
+        return std::nullopt;
+    core::Transaction transaction(*office.session);
+    const auto change = plan(office, *list, item, act);
+    carry_out(*office.session, change);
+    transaction.commit();
+    if (change.count.people() == 0) {
+        office.dialogue.show({u"No people have been found for tagging"_s});
+        return std::nullopt;
+    }
+    office.dialogue.show(
+        core::information(u"The tagging operation has successfully been completed"_s, change.count.words()));
+    return change;
+}
+
+int undo_tagging(core::Office& office, const BulkChange& change)
+{
+    core::Session& session = *office.session;
+    const LinkTable& table = table_of(change.item.kind);
+    const LinkRow row = row_of(change.item);
+    auto had = people_of(change.before);
+    auto all = had;
+    all.insert(all.end(), change.added.begin(), change.added.end());
+
+    core::Transaction transaction(session);
+    const auto as_left = untouched(office, change, all);
+    had = among(had, as_left);
+    const auto added = among(change.added, as_left);
+    if (change.act == TagAct::give) {
+        delete_rows(session, table, row, added);
+        delete_rows(session, table, row, had);
+    }
+    std::vector<BulkChange::Row> restored;
+    std::ranges::copy_if(change.before, std::back_inserter(restored), [&](const BulkChange::Row& each) {
+        return std::ranges::binary_search(as_left, each.person_id);
+    });
+    insert_rows(session, table, restored);
+    if (change.item.kind == TagKind::group) {
+        const bool giving = change.act == TagAct::give;
+        take_back_group_history(session, memberships(giving ? added : had, row.item),
+                                giving ? HistoryAct::joining : HistoryAct::leaving, change.day);
+    }
+    transaction.commit();
+    return static_cast<int>(all.size() - as_left.size());
+}
+
+} // namespace kindrel::people

@@ -1,0 +1,84 @@
+#include "output_fixture.h"
+
+namespace kindrel::test {
+
+using namespace Qt::StringLiterals;
+using output::HeadParts;
+
+namespace {
+
+class RunOptionsTest : public ReportTest
+{
+protected:
+    RunOptionsTest() { list.criteria = u"Active Families"_s; }
+    [[nodiscard]] double size_of(const QString& text)
+    {
+        pages::PageSpool spool;
+        EXPECT_TRUE(run(spool));
+        for (const auto& item : spool.page(1).items) {
+            const auto* found = std::get_if<pages::TextItem>(&item);
+            if (found && found->text.contains(text))
+                return found->style.size;
+        }
+        ADD_FAILURE() << text.toStdString();
+        return 0;
+    }
+};
+
+const QString unlisted_note = u"Holds unlisted details: for the office alone"_s;
+
+} // namespace
+
+TEST_F(RunOptionsTest, TheRunsOwnTitleAndHeadGoBeforeThoseOfReportAndChurch)
+{
+    add({family(u"Abel"_s, {u"Niels"_s})});
+    list.criteria = u"Active Families"_s;
+    office.settings.title_date = true;
+    EXPECT_TRUE(texts().contains(u"Report Date - 15/05/2024"_s));
+
+    options.title = u"Camp in May"_s;
+    options.head = HeadParts{.filters = true, .church = true};
+
+    const auto now = texts();
+    EXPECT_TRUE(now.contains(u"Camp in May"_s));
+    EXPECT_FALSE(now.contains(u"Church Directory"_s));
+    EXPECT_TRUE(now.contains(u"Filters in Use = Active Families"_s));
+    EXPECT_TRUE(now.contains(u"St Aidan's"_s));
+    EXPECT_FALSE(now.contains(u"Report Date - 15/05/2024"_s));
+}
+
+TEST_F(RunOptionsTest, TextGrowsAndShrinksWithItsPercentage)
+{
+    add({family(u"Abel"_s, {u"Niels"_s})});
+    const double usual = size_of(u"Niels"_s);
+    options.text_percent = 120;
+    EXPECT_NEAR(size_of(u"Niels"_s), usual * 1.2, 0.01);
+}
+
+TEST_F(RunOptionsTest, HiddenDetailsArePrintedOnRequestWithANoteOnThePage)
+{
+    auto hidden = full_family(true);
+    const QString street = hidden.address.res_street;
+    add({hidden});
+    EXPECT_FALSE(pdf_text().contains(street));
+    EXPECT_FALSE(pdf_text().contains(unlisted_note));
+
+    options.hidden_details = true;
+
+    EXPECT_TRUE(pdf_text().contains(street));
+    EXPECT_TRUE(pdf_text().contains(unlisted_note));
+}
+
+TEST_F(RunOptionsTest, HiddenDetailsNeedTheirRight)
+{
+    add({full_family(true)});
+    options.hidden_details = true;
+    office.rights.set(core::Area::security, false);
+    dialogue.expect_box(u"Your password does not give access to \"Security\""_s);
+    pages::PageSpool spool;
+
+    EXPECT_FALSE(run(spool));
+    EXPECT_EQ(spool.page_count(), 0);
+}
+
+} // namespace kindrel::test
