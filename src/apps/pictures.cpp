@@ -61,6 +61,20 @@ void take_cards(desktop::Desk& desk, Camera& camera)
     }
 }
 
+void take_editor(desktop::Running& running, Camera& camera)
+{
+    const auto book = people::read_address_book(*running.desk()->office.session, people::FamilyList::all, false);
+    if (book.empty())
+        return;
+    running.open_family(book.front().Surname_ID, {}, {});
+    QApplication::processEvents();
+    auto* tabs = running.window()->findChild<QTabWidget*>(u"editor_tabs"_s);
+    for (int tab = 0; tabs && tab < tabs->count(); ++tab) {
+        tabs->setCurrentIndex(tab);
+        camera.take(*running.window(), u"editor-%1"_s.arg(tab + 1));
+    }
+}
+
 void open_area(desktop::Running& running, const QString& key)
 {
     running.open_area(key);
@@ -144,6 +158,7 @@ int take_pictures(desktop::Running& running, desktop::Look& look, const QString&
     running.window()->resize(smallest_screen);
     camera.take(*running.window(), u"main-menu"_s);
     take_cards(*running.desk(), camera);
+    take_editor(running, camera);
     take_reports(running, camera);
     take_setup_areas(running, camera);
     take_dialogs(running.desk()->office, camera);

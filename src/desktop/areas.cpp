@@ -7,6 +7,7 @@
 #include "desktop/people/filters_page.h"
 #include "desktop/people/fusion_page.h"
 #include "desktop/people/main_menu.h"
+#include "desktop/people/search_page.h"
 #include "desktop/people/setup_page.h"
 #include "desktop/people/tagging_page.h"
 
@@ -32,6 +33,7 @@ Page* enter(Desk& desk)
 constexpr std::array areas{
     AreaDefinition{"main_menu", "Main Menu", "go-home", std::nullopt, Parked::stay, make<MainMenu>},
     AreaDefinition{"editor", "Family Editor", "user-identity", std::nullopt, Parked::setups_leave, enter<EditorPage>},
+    AreaDefinition{"search", "Search", "edit-find", core::Area::search_for_family, Parked::stay, enter<SearchPage>},
     AreaDefinition{"filters", "Filters", "view-filter", core::Area::search_for_family, Parked::stay, make<FiltersPage>},
     AreaDefinition{"tagging", "Tagging", "tag", core::Area::tagging, Parked::setups_leave, enter<TaggingPage>},
     AreaDefinition{"reports", "Reports", "office-report", core::Area::report_outputs, Parked::stay,

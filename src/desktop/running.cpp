@@ -3,6 +3,7 @@
 #include "desktop/areas.h"
 #include "desktop/church_choice.h"
 #include "desktop/people/editor_page.h"
+#include "desktop/people/speed_find.h"
 #include "desktop/shell/main_window.h"
 #include "desktop/shell/page.h"
 
@@ -58,9 +59,10 @@ void Running::close()
 
 void Running::find_family()
 {
-    m_window->open_area(u"main_menu"_s);
     bring_forward(*m_window);
-    m_window->page()->find();
+    if (!m_speed_find)
+        m_speed_find = new SpeedFindWindow(*m_desk, *m_window);
+    m_speed_find->ask();
 }
 
 void Running::open_area(const QString& key)

@@ -5,12 +5,14 @@
 #include "desktop/shell/look.h"
 
 #include <QObject>
+#include <QPointer>
 
 namespace kindrel::desktop {
 
 class EditorPage;
 class MainWindow;
 class QtDialogue;
+class SpeedFindWindow;
 
 /// What the running program was given to work with.
 struct Surroundings
@@ -61,6 +63,7 @@ private:
     std::unique_ptr<Windows> m_windows;
     std::unique_ptr<Desk> m_desk;
     std::unique_ptr<MainWindow> m_window;
+    QPointer<SpeedFindWindow> m_speed_find; ///< The main window's; null until it is first wanted.
 };
 
 } // namespace kindrel::desktop

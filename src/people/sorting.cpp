@@ -192,7 +192,8 @@ QString sort_sentence(const SortOrder& order, core::DayOrder day_order)
     const QString what = order.item_text.isEmpty() ? sort_label(order.by) : order.item_text;
     const QString by = order.by == SortBy::family ? QString() : u"by "_s + what;
     const QString search = is_by_date(order.by) ? search_in_words(order, day_order) : QString();
-    const QString type = order.type == FamilyType::all_people ? QString() : family_type(order.type).label.toString() + u" only"_s;
+    const QString type =
+        order.type == FamilyType::all_people ? QString() : family_type(order.type).label.toString() + u" only"_s;
     return by + search + (by.isEmpty() || type.isEmpty() ? QString() : u", "_s) + type;
 }
 

@@ -305,6 +305,7 @@ TEST_F(EditorPageTest, AFamilyHeldElsewhereIsToldAndNoEditorStaysOpen)
         u"INSERT INTO [tbl_locked_family_files] ([surname_id]) VALUES (%1);"_s.arg(stored[0].family.Surname_ID));
     place.dialogue.expect_box(u"Unable to enter this family file another user is currently editing the family file."_s);
     open(u"nais"_s);
+    settle();
     EXPECT_FALSE(is_open());
     EXPECT_FALSE(window().page_of(u"editor"_s));
 }

@@ -1,0 +1,311 @@
+#include "desktop/desktop_fixture.h"
+#include "desktop/people/filter_panel.h"
+#include "desktop/shell/page.h"
+#include "support/families.h"
+
+#include <QAbstractButton>
+#include <QComboBox>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QStackedWidget>
+#include <QTableView>
+
+namespace kindrel::test {
+
+using namespace Qt::StringLiterals;
+using people::FilterItem;
+
+namespace {
+
+const QString active_people = u"Active Families; people who are active, or of no state"_s;
+
+people::LinkRow carried(int item, const QString& field = {})
+{
+    people::LinkRow row;
+    row.item = item;
+    row.field = field;
+    return row;
+}
+
+/// Ann is in group 1 and plays piano, Ben is in groups 1 and 2, Cleo in none; Dora of another family is a contact.
+std::vector<people::FamilyFile> congregation()
+{
+    auto naismith = family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s, u"Cleo"_s});
+    naismith.people[0].groups = {carried(1)};
+    naismith.people[0].flexi = {carried(2, u"Piano"_s)};
+    naismith.people[1].groups = {carried(1), carried(2)};
+    naismith.people[1].birthdate = core::Date{1970, 3, 31};
+    naismith.people[2].school_year = -1;
+    naismith.residential = people::Suburb{1, people::SuburbType::residential, {}, u"suburb 1"_s, u"3000"_s};
+    auto okafor = family(u"Okafor"_s, {u"Dora"_s});
+    okafor.people[0].contact = true;
+    okafor.people[0].birthdate = core::Date{core::Date::unknown_year, 3, 1};
+    return {naismith, okafor};
+}
+
+class FilterPanelTest : public DesktopTest
+{
+protected:
+    FilterPanelTest()
+    {
+        begin(congregation());
+        open();
+    }
+
+    void open()
+    {
+        running->open_area(u"filters"_s);
+        settle();
+    }
+    [[nodiscard]] desktop::FilterPanel& panel() { return child<desktop::FilterPanel>(window(), u"filter_panel"_s); }
+    /// What is to be read after a pause in typing.
+    [[nodiscard]] QString text(const QString& name)
+    {
+        panel().count_now();
+        return child<QLabel>(panel(), name).text();
+    }
+    /// From the kinds at the left into what the kind offers, by the first letters of its caption.
+    void choose_kind(const QString& caption)
+    {
+        auto& kinds = child<QListWidget>(panel(), u"kinds"_s);
+        kinds.setFocus();
+        while (!kinds.currentItem()->text().startsWith(caption) && kinds.currentRow() + 1 < kinds.count())
+            press(window(), Qt::Key_Down);
+        press(window(), Qt::Key_Return);
+    }
+    [[nodiscard]] QString focus() { return window().focusWidget()->objectName(); }
+    /// What stands behind an item of the kind in front.
+    [[nodiscard]] QString use(int row)
+    {
+        auto* part = child<QStackedWidget>(panel(), {}).currentWidget();
+        const auto* model = child<QTableView>(*part, u"items"_s).model();
+        return model->index(row, 1).data().toString();
+    }
+    void press_button(const QString& name)
+    {
+        child<QAbstractButton>(window(), name).setFocus();
+        press(window(), Qt::Key_Space);
+    }
+    void save_as(const QString& name)
+    {
+        place.dialogue.expect_text(u"Please enter a name for this filter"_s, name);
+        press_button(u"save_filter"_s);
+    }
+    [[nodiscard]] QComboBox& saved() { return child<QComboBox>(panel(), u"saved_filters"_s); }
+};
+
+} // namespace
+
+TEST_F(FilterPanelTest, ActiveFamiliesAndTheirActivePeopleStandThereFromTheStart)
+{
+    EXPECT_EQ(text(u"sentence"_s), active_people);
+    EXPECT_EQ(text(u"count"_s), u"3 people are found"_s);
+}
+
+TEST_F(FilterPanelTest, AnItemIsFoundByItsLettersIncludedExcludedAndLeftOutByKeys)
+{
+    choose_kind(u"Groups"_s);
+    type(window(), u"GROUP 1"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(use(0), u"include"_s);
+    EXPECT_EQ(text(u"sentence"_s), active_people + u"; in the group group 1"_s);
+    EXPECT_EQ(text(u"count"_s), u"2 people are found"_s);
+
+    press(window(), Qt::Key_Down);
+    EXPECT_EQ(focus(), u"items"_s);
+    press(window(), Qt::Key_Space);
+    EXPECT_EQ(use(0), u"exclude"_s);
+    EXPECT_EQ(text(u"sentence"_s), active_people + u"; in a group other than group 1, or in none"_s);
+    EXPECT_EQ(text(u"count"_s), u"2 people are found"_s);
+
+    press(window(), Qt::Key_Space);
+    EXPECT_EQ(use(0), QString());
+    EXPECT_EQ(text(u"count"_s), u"3 people are found"_s);
+}
+
+TEST_F(FilterPanelTest, PlusAndMinusTurnAnItemAtOnce)
+{
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Minus);
+    EXPECT_EQ(use(0), u"exclude"_s);
+    press(window(), Qt::Key_Plus);
+    EXPECT_EQ(use(0), u"include"_s);
+    press(window(), Qt::Key_Plus);
+    EXPECT_EQ(panel().filter().items, std::vector<FilterItem>());
+}
+
+TEST_F(FilterPanelTest, TheKindsTellWhereSomethingIsAskedFor)
+{
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(child<QListWidget>(panel(), u"kinds"_s).currentItem()->text(), u"Groups (1)"_s);
+}
+
+TEST_F(FilterPanelTest, AChoiceBesideAnItemIncludesIt)
+{
+    choose_kind(u"Flexi"_s);
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Down);
+    auto* part = child<QStackedWidget>(panel(), {}).currentWidget();
+    auto& value = child<QComboBox>(*part, u"value"_s);
+    EXPECT_EQ(value.itemText(value.count() - 1), u"Piano"_s);
+    value.setFocus();
+    press(window(), Qt::Key_End);
+    value.lineEdit()->selectAll();
+    type(window(), u"Piano"_s);
+    EXPECT_EQ(use(1), u"include, = Piano"_s);
+    EXPECT_EQ(text(u"count"_s), u"1 person is found"_s);
+}
+
+TEST_F(FilterPanelTest, AnOpenRangeGoesAsFarAsItsGreyFigures)
+{
+    choose_kind(u"Surnames"_s);
+    child<QLineEdit>(panel(), u"year_to"_s).setFocus();
+    type(window(), u"3"_s);
+    EXPECT_EQ(panel().filter().school_years, (people::SchoolYears{-2, 3}));
+    EXPECT_EQ(text(u"count"_s), u"1 person is found"_s);
+    press(window(), Qt::Key_Backspace);
+    EXPECT_FALSE(panel().filter().school_years);
+
+    child<QLineEdit>(panel(), u"surname_from"_s).setFocus();
+    type(window(), u"o"_s);
+    EXPECT_EQ(text(u"count"_s), u"Nobody is found"_s);
+    EXPECT_EQ(text(u"faults"_s), u"What leaves nobody: with the family's surname from o"_s);
+}
+
+TEST_F(FilterPanelTest, AnAnniversaryIsAddedByKeysAndTakenOutAgain)
+{
+    choose_kind(u"File Status"_s);
+    press_button(u"contact"_s);
+    choose_kind(u"Birth"_s);
+    EXPECT_EQ(focus(), u"date_source"_s);
+    child<QComboBox>(panel(), u"date_span"_s).setFocus();
+    press(window(), Qt::Key_Down);
+    child<QLineEdit>(panel(), u"date_from"_s).setFocus();
+    type(window(), u"01/03/2000"_s);
+    place.dialogue.expect_box(u"Please enter both dates of the range"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(focus(), u"date_to"_s);
+    type(window(), u"31/03/2000"_s);
+    press(window(), Qt::Key_Return);
+
+    auto& dates = child<QListWidget>(panel(), u"dates"_s);
+    EXPECT_EQ(dates.item(0)->text(), u"born between 1 March and 31 March of any year"_s);
+    EXPECT_EQ(text(u"count"_s), u"2 people are found"_s);
+    dates.setFocus();
+    press(window(), Qt::Key_Delete);
+    EXPECT_EQ(text(u"count"_s), u"4 people are found"_s);
+}
+
+TEST_F(FilterPanelTest, WithoutAFileStatusNobodyIsShownAndTheCursorGoesToIt)
+{
+    choose_kind(u"File Status"_s);
+    press(window(), Qt::Key_Home);
+    choose_kind(u"Groups"_s);
+    const QString refusal =
+        u"You need to apply a File Status filter before continuing, for example choose 'Active Families'"_s;
+    EXPECT_EQ(text(u"sentence"_s), refusal);
+    place.dialogue.expect_box(refusal);
+    press(window(), Qt::Key_Return, Qt::ControlModifier);
+    EXPECT_EQ(focus(), u"file_status"_s);
+}
+
+TEST_F(FilterPanelTest, ASavedFilterIsRecalledAfterTheNextStart)
+{
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    save_as(u" Choir "_s);
+    EXPECT_EQ(saved().currentText(), u"Choir"_s);
+    const auto kept = panel().filter();
+
+    begin_again();
+    open();
+    EXPECT_EQ(saved().currentText(), u"(not saved)"_s);
+    saved().setFocus();
+    press(window(), Qt::Key_Down);
+    EXPECT_EQ(panel().filter(), kept);
+    EXPECT_EQ(text(u"count"_s), u"2 people are found"_s);
+}
+
+TEST_F(FilterPanelTest, WhatIsNotSavedWaitsWhileASavedFilterIsLookedAt)
+{
+    save_as(u"Everybody"_s);
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    const auto built = panel().filter();
+    EXPECT_EQ(saved().currentText(), u"(not saved)"_s);
+    saved().setFocus();
+    press(window(), Qt::Key_Down);
+    EXPECT_NE(panel().filter(), built);
+    press(window(), Qt::Key_Up);
+    EXPECT_EQ(panel().filter(), built);
+}
+
+TEST_F(FilterPanelTest, ASavedFilterIsRenamedAndRemoved)
+{
+    for (const auto& button : {u"rename_filter"_s, u"remove_filter"_s}) {
+        place.dialogue.expect_box(u"Please choose a saved filter first"_s);
+        press_button(button);
+    }
+    save_as(u"Everybody"_s);
+    place.dialogue.expect_text(u"Please enter another name for this filter"_s, u"All"_s);
+    press_button(u"rename_filter"_s);
+    EXPECT_EQ(saved().currentText(), u"All"_s);
+    place.dialogue.expect_confirm(u"Are you sure that you wish to delete the filter 'All'?"_s, core::Answer::yes);
+    press_button(u"remove_filter"_s);
+    EXPECT_EQ(saved().count(), 1);
+}
+
+TEST_F(FilterPanelTest, ALostItemIsTold)
+{
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    place.in_database(u"DELETE FROM [tbl_group_setup] WHERE [group_id]=1;"_s);
+    EXPECT_TRUE(text(u"faults"_s).contains(u"The group 'group 1' no longer exists"_s));
+}
+
+TEST_F(FilterPanelTest, TheFoundPeopleAreListedWithMarkersNarrowedAndOpened)
+{
+    choose_kind(u"File Status"_s);
+    press_button(u"contact"_s);
+    press(window(), Qt::Key_Return, Qt::ControlModifier);
+    const auto* list = child<QTableView>(window(), u"people"_s).model();
+    const auto row = [&](int at) {
+        return QStringList{list->index(at, 0).data().toString(), list->index(at, 1).data().toString(),
+                           list->index(at, 2).data().toString()};
+    };
+    EXPECT_EQ(list->rowCount(), 4);
+    EXPECT_EQ(row(0), QStringList({u"Ann"_s, u"Naismith"_s, u"suburb 1"_s}));
+    EXPECT_EQ(row(3), QStringList({u"Dora (Contact)"_s, u"Okafor"_s, QString()}));
+    EXPECT_EQ(window().page()->status(), u"4 people"_s);
+
+    type(window(), u"oka dor"_s);
+    EXPECT_EQ(window().page()->status(), u"1 of 4 people"_s);
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(window().page()->objectName(), u"Editor"_s);
+}
+
+TEST_F(FilterPanelTest, EscapeLeadsFromThePeopleBackToTheFilter)
+{
+    press(window(), Qt::Key_Return, Qt::ControlModifier);
+    EXPECT_EQ(focus(), u"find_person"_s);
+    press(window(), Qt::Key_Escape);
+    EXPECT_EQ(focus(), u"kinds"_s);
+}
+
+TEST_F(FilterPanelTest, AFusionBringsItsSwitchesAlong)
+{
+    place.in_database(u"INSERT INTO [Tbl_fusion_group] ([fusion_id],[fusion_group],[fusion_status],[position]) "
+                      "VALUES (7,'Visitors','000010',1);"_s);
+    choose_kind(u"Fusion"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(panel().filter().fusions, std::vector<int>{7});
+    EXPECT_EQ(text(u"sentence"_s),
+              u"Active Families; people who are contacts, or of no state; of the fusion Visitors"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(panel().filter().fusions, std::vector<int>());
+}
+
+} // namespace kindrel::test

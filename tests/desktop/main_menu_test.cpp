@@ -161,20 +161,6 @@ TEST_F(MainMenuTest, WithoutTheRightToFindFamiliesNoneAreListed)
     EXPECT_TRUE(visible_texts(other).contains(u"Your password does not open the list of families"_s));
 }
 
-TEST_F(MainMenuTest, FindFamilyComesBackToTheFilterFromAnyWindow)
-{
-    begin(some_families());
-    press(window(), Qt::Key_Return, Qt::ControlModifier);
-    auto* card = desk().windows.all<desktop::FamilyCard>().at(0);
-    running->open_area(u"reports"_s);
-    settle();
-
-    press(*card, Qt::Key_K, Qt::ControlModifier);
-
-    EXPECT_EQ(window().page()->objectName(), u"main_menu"_s);
-    EXPECT_EQ(window().focusWidget(), &child<QLineEdit>(window(), u"filter"_s));
-}
-
 TEST_F(MainMenuTest, TheColumnsFillTheListAndNoMore)
 {
     begin(some_families());

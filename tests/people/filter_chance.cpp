@@ -177,6 +177,8 @@ Filter Chance::filter(int fusions)
         if (percent(40)) {
             added.item = 1 + below(items);
             added.exclude = percent(50);
+            if (added.kind == FilterKind::flexi && percent(50))
+                added.value = percent(50) ? std::nullopt : std::optional(one_of(values).toString());
             made.items.push_back(added);
         }
     }

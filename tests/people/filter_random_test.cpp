@@ -13,7 +13,7 @@ using namespace people;
 
 namespace {
 
-constexpr int families = 150, fusions = 12, filters = 2500;
+constexpr int families = 150, fusions = 12, filters = 1500;
 const QDate today(2024, 5, 15);
 
 class RandomFilterTest : public EngineTest

@@ -208,6 +208,9 @@ TEST_P(FilterTest, StatesMarksAndValuesNarrowAnItem)
         filter.items = {item};
         EXPECT_EQ(found(filter), names) << sentence(session(), filter, {today}).toStdString();
     }
+    auto other_than_vegan = everybody();
+    other_than_vegan.items = {with(Marks::any, {}), with(Marks::any, u"Vegan"_s, true)};
+    EXPECT_EQ(found(other_than_vegan), u"Void"_s) << "An empty value is another value.";
     EXPECT_EQ(flexi_values(session(), 1), QStringList{u"Vegan"_s});
 }
 

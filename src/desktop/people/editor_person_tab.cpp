@@ -29,6 +29,7 @@ using Line = FormLine<Person>;
 namespace {
 
 constexpr int short_width = 112;
+constexpr int least_type_length = 14;
 constexpr int greatest_school_year = 99;
 
 constexpr std::array further_names{
@@ -85,7 +86,7 @@ EditorForm* EditorPersonTab::make_names()
     if (people::Disclosure::of(bench().desk.office).birth_dates)
         add_birth_date(*form);
     add_school_year(*form);
-    form->add_row({}, make_person_flags(bench(), *form));
+    form->add_wide(make_person_flags(bench(), *form));
     m_forms.push_back(form);
     return form;
 }
@@ -94,7 +95,7 @@ EditorForm* EditorPersonTab::make_reach()
 {
     auto* form = new EditorForm(bench(), u"Contact"_s, &RecordAccess::Details);
     form->add_lines<Person>(reach);
-    form->add_row({}, make_business_switch(bench(), *form));
+    form->add_wide(make_business_switch(bench(), *form));
     if (people::Disclosure::of(bench().desk.office).pins)
         add_pin(*form);
     m_forms.push_back(form);
@@ -117,6 +118,8 @@ void EditorPersonTab::add_family_type(EditorForm& form)
 {
     m_type = new QComboBox;
     m_type->setObjectName(u"Marital"_s);
+    m_type->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon); // Its words are long.
+    m_type->setMinimumContentsLength(least_type_length);
     for (int code = 1; code <= people::marital::codes; ++code)
         m_type->addItem(type_words(code));
     const auto link = field_link(bench(), "Marital", &Person::Marital);

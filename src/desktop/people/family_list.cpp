@@ -40,8 +40,9 @@ bool is_enter(const QKeyEvent& key)
 } // namespace
 
 FamilyListWidget::FamilyListWidget(Desk& desk, QWidget* parent)
-    : QWidget(parent), m_desk(desk), m_model(new FamilyListModel(this)), m_selector(new QComboBox),
-      m_filter(new QLineEdit), m_view(new QTableView), m_stack(new QStackedWidget), m_empty(new EmptyPanel)
+    : QWidget(parent), m_desk(desk), m_model(new FamilyListModel(this)), m_top(new QHBoxLayout),
+      m_selector(new QComboBox), m_filter(new QLineEdit), m_view(new QTableView), m_stack(new QStackedWidget),
+      m_empty(new EmptyPanel)
 {
     for (int list = 0; list < people::family_list_count; ++list)
         m_selector->addItem(people::family_list_name(people::FamilyList(list)));
@@ -54,14 +55,13 @@ FamilyListWidget::FamilyListWidget(Desk& desk, QWidget* parent)
     m_stack->addWidget(m_view);
     m_stack->addWidget(m_empty);
 
-    auto* top = new QHBoxLayout;
-    top->setSpacing(space::field);
-    top->addWidget(m_filter, 1);
-    top->addWidget(m_selector);
+    m_top->setSpacing(space::field);
+    m_top->addWidget(m_filter, 1);
+    m_top->addWidget(m_selector);
     auto* column = new QVBoxLayout(this);
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(space::field);
-    column->addLayout(top);
+    column->addLayout(m_top);
     column->addWidget(m_stack, 1);
 }
 
@@ -109,10 +109,33 @@ void FamilyListWidget::reload()
 {
     const int family = chosen_family();
     auto& office = m_desk.office;
+    const auto group = m_family_group == 0 ? std::nullopt : std::optional(m_family_group);
     if (may_list())
-        m_model->set_entries(people::read_address_book(*office.session, list(), office.settings.use_preferred_names));
+        m_model->set_entries(
+            people::read_address_book(*office.session, list(), office.settings.use_preferred_names, group));
     select(std::max(0, m_model->row_of(family)));
     show_outcome();
+}
+
+void FamilyListWidget::narrow_to_group(int family_group_id)
+{
+    m_family_group = family_group_id;
+    reload();
+}
+
+void FamilyListWidget::replace_filter(QWidget* beside)
+{
+    m_filter->hide();
+    m_top->addWidget(beside);
+    m_top->addStretch(1);
+}
+
+bool FamilyListWidget::choose_family(int surname_id)
+{
+    const int row = m_model->row_of(surname_id);
+    if (row >= 0)
+        select(row);
+    return row >= 0;
 }
 
 bool FamilyListWidget::may_list() const

@@ -6,6 +6,7 @@
 #include <QWidget>
 
 class QComboBox;
+class QHBoxLayout;
 class QKeyEvent;
 class QLineEdit;
 class QStackedWidget;
@@ -26,9 +27,15 @@ public:
 
     void choose(people::FamilyList list);
     [[nodiscard]] people::FamilyList list() const;
+    /// Only families of this group; 0: whatever group.
+    void narrow_to_group(int family_group_id);
     /// Reads the list again, keeping words and chosen family.
     void reload();
     void focus_filter();
+    /// The page has another way to find families; the selector stands at the left, with `beside` next to it.
+    void replace_filter(QWidget* beside);
+    /// False when the family is not in the list.
+    bool choose_family(int surname_id);
     [[nodiscard]] FamilyListModel& model() { return *m_model; }
     [[nodiscard]] QTableView& view() { return *m_view; }
     /// Its place in the list; -1 when none is.
@@ -60,6 +67,8 @@ private:
 
     Desk& m_desk;
     FamilyListModel* m_model;
+    int m_family_group = 0;
+    QHBoxLayout* m_top;
     QComboBox* m_selector;
     QLineEdit* m_filter;
     QTableView* m_view;

@@ -85,6 +85,11 @@ void FilterChoiceList::set_items(std::vector<people::FilterItem> items)
     select(before ? std::max(m_model->row_of(*before), 0) : 0);
 }
 
+void FilterChoiceList::forget_typed()
+{
+    m_line->clear();
+}
+
 const people::FilterItem* FilterChoiceList::chosen() const
 {
     const int row = m_table->currentIndex().row();

@@ -26,6 +26,7 @@ public:
 
     /// The chosen item and the typed words stay.
     void set_items(std::vector<people::FilterItem> items);
+    void forget_typed();
     void refresh() { m_model->refresh(); }
     /// Null when none is chosen.
     [[nodiscard]] const people::FilterItem* chosen() const;

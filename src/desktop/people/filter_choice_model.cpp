@@ -80,7 +80,8 @@ void FilterChoiceModel::refresh()
 int FilterChoiceModel::row_of(const FilterItem& item) const
 {
     const auto is_it = [&](std::size_t place) {
-        return m_items[place].item == item.item && m_items[place].ministry == item.ministry;
+        const FilterItem& here = m_items[place];
+        return here.kind == item.kind && here.item == item.item && here.ministry == item.ministry;
     };
     const auto found = std::ranges::find_if(m_shown, is_it);
     return found == m_shown.end() ? -1 : int(found - m_shown.begin());

@@ -5,6 +5,7 @@
 #include "desktop/shell/look.h"
 #include "desktop/shell/side_panel.h"
 #include "desktop/shell/value_form.h"
+#include "people/disclosed.h"
 #include "people/filter_words.h"
 
 #include <QComboBox>
@@ -79,7 +80,7 @@ FilterDates::FilterDates(Desk& desk, people::Filter& filter)
 void FilterDates::fill_sources()
 {
     for (const auto& [source, caption] : sources)
-        if (source != DateSource::birth_date || desk().office.may(core::Area::birth_dates))
+        if (source != DateSource::birth_date || people::Disclosure::of(desk().office).birth_dates)
             m_source->addItem(QString::fromLatin1(caption), int(source));
 }
 
@@ -89,7 +90,7 @@ QVBoxLayout* FilterDates::make_list()
     m_list->setAccessibleName(u"Dates of the filter"_s);
     m_list->setWordWrap(true);
     m_list->installEventFilter(this);
-    auto* drop = new QPushButton(icon(u"edit-delete"_s), u"&Remove"_s);
+    auto* drop = new QPushButton(icon(u"edit-delete"_s), u"Remo&ve"_s);
     drop->setObjectName(u"remove_date"_s);
     drop->setToolTip(u"Take the chosen date out of the filter (Delete)"_s);
     connect(drop, &QPushButton::clicked, this, &FilterDates::remove);
@@ -113,7 +114,7 @@ QVBoxLayout* FilterDates::make_form()
     add_row(*m_form, u"Fr&om"_s, m_ends[0].field, u"date_from"_s);
     add_row(*m_form, u"&To"_s, m_ends[1].field, u"date_to"_s);
     add_row(*m_form, u"&In"_s, m_month, u"date_month"_s);
-    auto* button = new QPushButton(icon(u"list-add"_s), u"A&dd"_s);
+    auto* button = new QPushButton(icon(u"list-add"_s), u"&Add"_s);
     button->setObjectName(u"add_date"_s);
     connect(button, &QPushButton::clicked, this, &FilterDates::add);
     auto* column = new QVBoxLayout;

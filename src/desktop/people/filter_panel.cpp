@@ -8,6 +8,7 @@
 #include "desktop/shell/look.h"
 #include "desktop/shell/side_panel.h"
 
+#include <QEvent>
 #include <QGridLayout>
 #include <QLabel>
 #include <QListWidget>
@@ -79,6 +80,7 @@ FilterPanel::FilterPanel(Desk& desk, QWidget* parent)
     grid->addWidget(m_parts, 1, 1);
     grid->addWidget(make_outcome(), 2, 0, 1, 2);
     m_kinds->setCurrentRow(0);
+    colour_faults();
 }
 
 QListWidget* FilterPanel::make_kinds()
@@ -89,9 +91,11 @@ QListWidget* FilterPanel::make_kinds()
     keep_width(*kinds, kinds_width);
     connect(kinds, &QListWidget::currentRowChanged, this, &FilterPanel::show_part);
     // Enter in the list leads to what it shows.
-    auto* enter = new QShortcut(Qt::Key_Return, kinds);
-    enter->setContext(Qt::WidgetShortcut);
-    connect(enter, &QShortcut::activated, this, [this] { part(m_kinds->currentRow()).focus_first(); });
+    for (const auto key : {Qt::Key_Return, Qt::Key_Enter}) {
+        auto* enter = new QShortcut(key, kinds);
+        enter->setContext(Qt::WidgetShortcut);
+        connect(enter, &QShortcut::activated, this, [this] { part(m_kinds->currentRow()).focus_first(); });
+    }
     return kinds;
 }
 
@@ -210,6 +214,20 @@ void FilterPanel::count_now()
         faults.prepend(u"What leaves nobody: %1"_s.arg(*emptying));
     const QString words = count == 1 ? u"1 person is found"_s : u"%1 people are found"_s.arg(QLocale().toString(count));
     show_outcome(count == 0 ? u"Nobody is found"_s : words, people::sentence(session, m_filter, day), faults);
+}
+
+void FilterPanel::colour_faults()
+{
+    QPalette own;
+    own.setColor(QPalette::WindowText, state_colour(State::error, shade_of(palette())));
+    m_faults->setPalette(own);
+}
+
+void FilterPanel::changeEvent(QEvent* event)
+{
+    QWidget::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange)
+        colour_faults();
 }
 
 void FilterPanel::show_outcome(const QString& count, const QString& sentence, const QStringList& faults)

@@ -33,6 +33,9 @@ public:
 Q_SIGNALS:
     void changed();
 
+protected:
+    void changeEvent(QEvent* event) override;
+
 private:
     void add_parts();
     void add_part(FilterPart* part);
@@ -42,6 +45,7 @@ private:
     void show_part(int row);
     void show_uses();
     void take_change();
+    void colour_faults();
     void show_outcome(const QString& count, const QString& sentence, const QStringList& faults);
 
     Desk& m_desk;

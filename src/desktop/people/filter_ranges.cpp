@@ -3,6 +3,7 @@
 #include "desktop/shell/date_field.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
+#include "people/disclosed.h"
 
 #include <QCheckBox>
 #include <QComboBox>
@@ -53,6 +54,8 @@ FilterRanges::FilterRanges(Desk& desk, people::Filter& filter)
         m_day = day;
         take_typed();
     });
+    for (QWidget* field : std::initializer_list<QWidget*>{m_ages.from, m_ages.to, m_on})
+        field->setEnabled(people::Disclosure::of(desk.office).birth_dates);
     auto* on = new QHBoxLayout;
     on->addWidget(new QLabel(u"on"_s));
     on->addWidget(m_on);
@@ -152,7 +155,7 @@ void FilterRanges::focus_first()
 FilterFamilyType::FilterFamilyType(Desk& desk, people::Filter& filter)
     : FilterPart(desk, filter, u"Family Type, Address"_s), m_type(new QComboBox),
       m_suburb_known(new QCheckBox(u"Only families whose residential &suburb is known"_s)),
-      m_own_postcode(new QCheckBox(u"Only families with a &postcode that differs from their suburb's"_s))
+      m_own_postcode(new QCheckBox(u"Only families with a p&ostcode that differs from their suburb's"_s))
 {
     m_type->setObjectName(u"family_type"_s);
     m_type->setAccessibleName(u"Family type"_s);

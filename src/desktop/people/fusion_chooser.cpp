@@ -58,6 +58,7 @@ FusionChooser::FusionChooser(core::Office& office, Remembered& remembered,
       m_value_caption(new QLabel(u"Value"_s))
 {
     fill_kinds();
+    setFocusProxy(m_list);
     m_marked->setObjectName(u"marked"_s);
     m_value->setObjectName(u"value"_s);
     m_value->setAccessibleName(u"Value of the flexi field"_s);
@@ -88,7 +89,11 @@ void FusionChooser::fill_kinds()
     m_kinds->setAccessibleName(u"Kind of the items"_s);
     for (const auto& row : people::filter_kinds())
         m_kinds->addItem(row.caption.toString());
-    connect(m_kinds, &QComboBox::currentIndexChanged, this, &FusionChooser::reload);
+    connect(m_kinds, &QComboBox::currentIndexChanged, this, [this] {
+        m_list->forget_typed();
+        m_marked->setChecked(false);
+        reload();
+    });
     const auto turn = [this](int key, int by) {
         auto* shortcut = new QShortcut(Qt::CTRL | Qt::Key(key), this);
         shortcut->setContext(Qt::WidgetWithChildrenShortcut);
@@ -133,7 +138,6 @@ const people::FilterKindRow& FusionChooser::kind() const
 void FusionChooser::reload()
 {
     m_list->set_items(m_setup->choices(kind().kind));
-    m_marked->setChecked(false);
     m_marked->setVisible(kind().has_marks());
     m_value->setVisible(kind().has_value());
     m_value_caption->setVisible(kind().has_value());

@@ -1,6 +1,6 @@
 #include "desktop/people/fusion_entries.h"
 
-#include "desktop/shell/command_side.h"
+#include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
 
@@ -8,8 +8,11 @@
 #include <QKeyEvent>
 #include <QLabel>
 #include <QListWidget>
+#include <QPushButton>
+#include <QShortcut>
 
 #include <algorithm>
+#include <array>
 
 namespace kindrel::desktop {
 
@@ -25,33 +28,49 @@ FusionEntries::FusionEntries(const std::unique_ptr<people::FusionSetup>& setup, 
     m_list->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     m_list->installEventFilter(this);
     connect(m_list, &QListWidget::itemDoubleClicked, this, &FusionEntries::step_mode);
-    auto* side = new CommandSide;
-    add_commands(*side);
     auto* grid = new QGridLayout(this);
     grid->setContentsMargins(0, 0, 0, 0);
-    grid->setHorizontalSpacing(space::field);
+    grid->setHorizontalSpacing(space::field / 2);
     grid->setVerticalSpacing(space::field);
-    grid->addWidget(make_heading(u"Entries"_s), 0, 0);
-    grid->addWidget(m_list, 1, 0);
-    grid->addWidget(side, 1, 1);
-    grid->setColumnStretch(0, 1);
+    grid->addWidget(make_heading(u"Entries"_s), 0, 0, 1, 2);
+    grid->addWidget(m_list, 1, 0, 1, 2);
     grid->setRowStretch(1, 1);
+    add_commands(*grid);
 }
 
-void FusionEntries::add_commands(CommandSide& side)
+void FusionEntries::add_commands(QGridLayout& grid)
 {
-    const auto add = [&](const CommandSide::Command& command, void (FusionEntries::*run)(), QWidget& reach,
-                         Qt::ShortcutContext context) {
-        side.add(command, reach, context, [this, run] { (this->*run)(); });
+    struct Command
+    {
+        const char *name, *text, *icon, *tip;
+        QKeySequence key;
+        void (FusionEntries::*run)();
     };
-    add({"move_up", "Move &up", "go-up", Qt::ALT | Qt::Key_Up}, &FusionEntries::move_up, *this,
-        Qt::WidgetWithChildrenShortcut);
-    add({"move_down", "Move &down", "go-down", Qt::ALT | Qt::Key_Down}, &FusionEntries::move_down, *this,
-        Qt::WidgetWithChildrenShortcut);
-    side.start_group();
-    add({"step_mode", "&Change", "view-refresh"}, &FusionEntries::step_mode, *this, Qt::WidgetWithChildrenShortcut);
-    add({"remove_entry", "&Remove", "edit-delete", Qt::Key_Delete}, &FusionEntries::remove, *m_list,
-        Qt::WidgetShortcut);
+    const std::array commands{
+        Command{"move_up", "Move &up", "go-up", "Alt+Up", Qt::ALT | Qt::Key_Up, &FusionEntries::move_up},
+        Command{"step_mode",
+                "&Change",
+                "view-refresh",
+                "The next of the four ways to join (Space)",
+                {},
+                &FusionEntries::step_mode},
+        Command{"move_down", "Move &down", "go-down", "Alt+Down", Qt::ALT | Qt::Key_Down, &FusionEntries::move_down},
+        Command{"remove_entry", "&Remove", "edit-delete", "Delete", Qt::Key_Delete, &FusionEntries::remove},
+    };
+    const int first_row = grid.rowCount();
+    for (int place = 0; const Command& command : commands) {
+        auto* button = new QPushButton(icon(QString::fromLatin1(command.icon)), QString::fromLatin1(command.text));
+        button->setObjectName(QString::fromLatin1(command.name));
+        button->setToolTip(QString::fromLatin1(command.tip));
+        connect(button, &QPushButton::clicked, this, command.run);
+        grid.addWidget(button, first_row + place / 2, place % 2);
+        ++place;
+        if (command.key.isEmpty())
+            continue;
+        auto* key = new QShortcut(command.key, m_list);
+        key->setContext(Qt::WidgetShortcut);
+        connect(key, &QShortcut::activated, this, command.run);
+    }
 }
 
 void FusionEntries::show_fusion(int fusion, int entry)

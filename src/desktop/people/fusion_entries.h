@@ -6,11 +6,10 @@
 
 #include <memory>
 
+class QGridLayout;
 class QListWidget;
 
 namespace kindrel::desktop {
-
-class CommandSide;
 
 /// The entries of the chosen fusion in their order, each with the way it joins. Space steps through the four ways.
 class FusionEntries : public QWidget
@@ -32,7 +31,7 @@ protected:
     bool eventFilter(QObject* target, QEvent* event) override;
 
 private:
-    void add_commands(CommandSide& side);
+    void add_commands(QGridLayout& grid);
     void show_row(const people::FusionEntry& entry);
     void step_mode();
     void remove();

@@ -23,10 +23,8 @@ PinField::PinField(EditorBench& bench)
     keep_width(*m_pin, pin_width);
     connect(m_pin, &QLineEdit::textEdited, this,
             [change = m_link.change](const QString& typed) { change(people::tidy_pin(typed)); });
-    auto* row = new QHBoxLayout(this);
-    row->setContentsMargins(0, 0, 0, 0);
+    auto* row = new QHBoxLayout;
     row->setSpacing(space::field);
-    row->addWidget(m_pin);
     const auto add = [&](const QString& name, const QString& text, auto act) {
         auto* button = new QPushButton(text);
         button->setObjectName(name);
@@ -37,6 +35,11 @@ PinField::PinField(EditorBench& bench)
     add(u"check_pin"_s, u"Check"_s,
         [this] { people::check_pin(m_bench.desk.office, m_bench.editor.file(), m_bench.person()); });
     row->addStretch(1);
+    auto* column = new QVBoxLayout(this);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(space::field / 2);
+    column->addWidget(m_pin);
+    column->addLayout(row);
     setFocusProxy(m_pin);
 }
 

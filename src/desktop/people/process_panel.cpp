@@ -7,6 +7,7 @@
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
 
+#include <QLabel>
 #include <QPushButton>
 #include <QTabWidget>
 #include <QVBoxLayout>

@@ -44,10 +44,10 @@ TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
     m_pause->setInterval(typing_pause);
     connect(m_pause, &QTimer::timeout, this, &TaggingPage::make_list);
     connect(m_bar, &StepBar::wanted, this, &TaggingPage::go_to);
-    connect(m_people, &WorkingPeople::added, this, &TaggingPage::add);
-    connect(m_people, &WorkingPeople::struck, this, &TaggingPage::strike);
-    connect(m_people, &WorkingPeople::opened, this,
-            [this](int family) { m_desk.navigation.open_family(family, m_list->list().families(), list_title); });
+    connect(m_list, &WorkingListView::made, this, [this] {
+        m_process->set_list(m_list->list());
+        set_status(m_list->count_words());
+    });
     add_panels();
     m_views->addWidget(m_filter);
     m_views->addWidget(make_bench());
@@ -83,6 +83,7 @@ void TaggingPage::add_panels()
 QWidget* TaggingPage::make_bench()
 {
     auto* bench = new QWidget;
+    bench->setObjectName(u"bench"_s);
     auto* parts = new QHBoxLayout(bench);
     parts->setContentsMargins(0, 0, 0, 0);
     parts->setSpacing(space::group);

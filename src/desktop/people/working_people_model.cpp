@@ -3,6 +3,7 @@
 #include "desktop/shell/palette.h"
 
 #include <QApplication>
+#include <QFont>
 
 #include <array>
 

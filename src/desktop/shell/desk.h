@@ -14,7 +14,7 @@ class Navigation
 {
 public:
     virtual ~Navigation() = default;
-    /// Brings the family list forward with the cursor in its filter.
+    /// Opens speed find over the main window.
     virtual void find_family() = 0;
     /// `key` names a row of the table of areas. Happens after the caller has returned, for its page may have to go.
     virtual void open_area(const QString& key) = 0;

@@ -1,0 +1,217 @@
+#include "desktop/desktop_fixture.h"
+#include "desktop/output/preview_window.h"
+#include "desktop/people/editor_page.h"
+#include "desktop/people/family_card.h"
+#include "desktop/shell/page.h"
+#include "support/families.h"
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPushButton>
+#include <QTabWidget>
+#include <QTableView>
+
+namespace kindrel::test {
+
+using namespace Qt::StringLiterals;
+using people::FileStatus;
+
+namespace {
+
+constexpr auto none_found = u"Unable to find any families matching the search criteria entered";
+
+people::FamilyFile smith()
+{
+    auto file = family(u"Smith"_s, {u"Zora"_s});
+    file.people[0].preferred_name = u"Nan"_s;
+    file.people[0].Title = u"Dr"_s;
+    file.people[0].Title_hidden = true;
+    file.family_groups.resize(1);
+    file.family_groups[0].item = 2;
+    return file;
+}
+
+people::FamilyFile naismith()
+{
+    auto file = family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s});
+    file.people[0].Title = u"Ms"_s;
+    return file;
+}
+
+class SearchPageTest : public DesktopTest
+{
+protected:
+    void open_search()
+    {
+        auto archived = family(u"Old"_s, {u"Olga"_s});
+        archived.family.Condition = FileStatus::archive;
+        begin({smith(), naismith(), family(u"Adder"_s, {u"Una"_s}), archived});
+        running->open_area(u"search"_s);
+        settle();
+    }
+    void open_data_search()
+    {
+        open_search();
+        press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+    }
+    [[nodiscard]] QWidget& page() { return *static_cast<QWidget*>(window().page()); }
+    [[nodiscard]] QTableView& list() { return child<QTableView>(page(), u"families"_s); }
+    [[nodiscard]] QTableView& entries() { return child<QTableView>(page(), u"entries"_s); }
+    [[nodiscard]] QString button() { return child<QPushButton>(page(), u"search"_s).text(); }
+    [[nodiscard]] QString label(const QString& name) { return child<QLabel>(page(), name).text(); }
+    [[nodiscard]] QString chosen() { return list().currentIndex().siblingAtColumn(0).data().toString(); }
+    [[nodiscard]] static QStringList shown(const QTableView& view, int column = 0)
+    {
+        QStringList texts;
+        for (int row = 0; row < view.model()->rowCount(); ++row)
+            texts += view.model()->index(row, column).data().toString();
+        return texts;
+    }
+    void choose_part(const QString& name)
+    {
+        auto& parts = child<QListWidget>(page(), u"parts"_s);
+        parts.setCurrentItem(parts.findItems(name, Qt::MatchExactly).at(0));
+        press(window(), Qt::Key_Return);
+    }
+};
+
+} // namespace
+
+TEST_F(SearchPageTest, EnterGoesFromOneFamilyWithTheTextToTheNextAndTellsTheEnd)
+{
+    open_search();
+    EXPECT_EQ(label(u"count"_s), u"Total Amount of Families Found = 3"_s);
+    type(window(), u"SMI"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(chosen(), u"Naismith"_s);
+    EXPECT_EQ(button(), u"&Search Next"_s);
+    EXPECT_EQ(label(u"found_in"_s), u"Found in Surname"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(chosen(), u"Smith"_s);
+
+    place.dialogue.expect_box(QString::fromUtf16(none_found));
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(button(), u"&Search"_s);
+    EXPECT_EQ(chosen(), u"Smith"_s);
+}
+
+TEST_F(SearchPageTest, APreferredNameIsFoundAmongTheNamesAlone)
+{
+    open_search();
+    type(window(), u"nan"_s);
+    place.dialogue.expect_box(QString::fromUtf16(none_found));
+    press(window(), Qt::Key_Return);
+    press(window(), Qt::Key_Tab);
+    ASSERT_TRUE(child<QCheckBox>(page(), u"names_only"_s).hasFocus());
+    press(window(), Qt::Key_Space);
+    press(window(), Qt::Key_Tab);
+    press(window(), Qt::Key_Space);
+    EXPECT_EQ(chosen(), u"Smith"_s);
+}
+
+TEST_F(SearchPageTest, AnotherTextStartsTheSearchAnew)
+{
+    open_search();
+    type(window(), u"s"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(button(), u"&Search Next"_s);
+    type(window(), u"m"_s);
+    EXPECT_EQ(button(), u"&Search"_s);
+    EXPECT_EQ(label(u"found_in"_s), QString());
+}
+
+TEST_F(SearchPageTest, DownAndEnterOpenTheFoundFamilyInTheEditor)
+{
+    open_search();
+    type(window(), u"smi"_s);
+    press(window(), Qt::Key_Return);
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Return);
+    settle();
+    ASSERT_TRUE(qobject_cast<desktop::EditorPage*>(window().page()));
+    EXPECT_TRUE(window().page()->title().contains(u"Naismith"_s)) << window().page()->title().toStdString();
+}
+
+TEST_F(SearchPageTest, SelectorAndFamilyGroupNarrowTheListAndItsCount)
+{
+    open_search();
+    child<QComboBox>(page(), u"family_group"_s).setFocus();
+    press(window(), Qt::Key_Down);
+    EXPECT_EQ(shown(list()), QStringList()) << "Nobody is in the first group.";
+    press(window(), Qt::Key_Down);
+    EXPECT_EQ(shown(list()), QStringList{u"Smith"_s});
+    EXPECT_EQ(label(u"count"_s), u"Total Amount of Families Found = 1"_s);
+
+    auto& lists = child<QComboBox>(page(), u"family_list"_s);
+    lists.setFocus();
+    QTest::keyClicks(&lists, u"Archive"_s);
+    settle();
+    EXPECT_EQ(label(u"count"_s), u"Total Amount of Families Found = 0"_s);
+}
+
+TEST_F(SearchPageTest, AnEmptyListAnswersThatNothingCanBeOpenedOrSearched)
+{
+    begin();
+    running->open_area(u"search"_s);
+    settle();
+    place.dialogue.expect_box(u"Unable to do a search as no families exist"_s);
+    type(window(), u"smi"_s);
+    press(window(), Qt::Key_Return);
+    place.dialogue.expect_box(u"No families exist for opening"_s);
+    for (QAction* action : window().page()->actions())
+        if (action->text() == u"Open")
+            action->trigger();
+}
+
+TEST_F(SearchPageTest, EnterOnAPartListsThoseWhoHaveAnEntryInIt)
+{
+    open_data_search();
+    choose_part(u"Title"_s);
+    EXPECT_EQ(shown(entries()), (QStringList{u"Naismith"_s, u"Smith"_s}));
+    EXPECT_EQ(shown(entries(), 2), (QStringList{u"Ms"_s, u"Dr (hidden)"_s}));
+    EXPECT_EQ(label(u"data_count"_s), u"People with an entry in Title: 2 people"_s);
+    EXPECT_EQ(window().page()->status(), u"2 people"_s);
+
+    press(window(), Qt::Key_Tab);
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Space);
+    const auto cards = desk().windows.all<desktop::FamilyCard>();
+    ASSERT_EQ(cards.size(), 1U);
+    EXPECT_EQ(cards[0]->surname_id(), stored[0].family.Surname_ID);
+}
+
+TEST_F(SearchPageTest, APartWithoutItsRightIsRefusedAndListsNobody)
+{
+    open_data_search();
+    choose_part(u"Title"_s);
+    desk().office.rights.set(core::Area::birth_dates, false);
+    place.dialogue.expect_box(u"Your password does not give access to \"Birth Dates Access\""_s);
+    choose_part(u"Birth Date"_s);
+    EXPECT_EQ(entries().model()->rowCount(), 0);
+    EXPECT_EQ(label(u"data_count"_s), QString());
+}
+
+TEST_F(SearchPageTest, HiddenEntriesGoNeitherToPaperNorIntoFiles)
+{
+    open_data_search();
+    choose_part(u"Title"_s);
+    const QString file = place.data.drive() + u"titles.csv"_s;
+    place.dialogue.expect_file(u"Save this list"_s, file);
+    for (QAction* action : window().page()->actions())
+        if (action->text() == u"Save as CSV")
+            action->trigger();
+    const QByteArray saved = DataFolder::read(file);
+    EXPECT_TRUE(saved.contains("Naismith,Ann,Ms,")) << saved.toStdString();
+    EXPECT_TRUE(saved.contains("Smith,Zora,hidden,")) << saved.toStdString();
+
+    press(window(), Qt::Key_P, Qt::ControlModifier);
+    const auto previews = desk().windows.all<desktop::PreviewWindow>();
+    ASSERT_EQ(previews.size(), 1U);
+    const QStringList texts = pages::texts_of(previews[0]->document().page(1), 1);
+    EXPECT_TRUE(texts.contains(u"Ms"_s));
+    EXPECT_FALSE(texts.join(u' ').contains(u"Dr"_s));
+}
+
+} // namespace kindrel::test

@@ -1,0 +1,296 @@
+#include "desktop/desktop_fixture.h"
+#include "desktop/output/preview_window.h"
+#include "desktop/shell/note_bar.h"
+#include "desktop/shell/page.h"
+#include "pages/find.h"
+#include "people/filter.h"
+#include "support/families.h"
+
+#include <QComboBox>
+#include <QLineEdit>
+#include <QListWidget>
+#include <QPushButton>
+#include <QTableView>
+
+namespace kindrel::test {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int birth_date = 4; ///< Its row among the orders.
+const QString done = u"The tagging operation has successfully been completed"_s;
+
+people::FamilyFile born(people::FamilyFile file, std::vector<core::Date> dates)
+{
+    for (std::size_t person = 0; person < dates.size(); ++person)
+        file.people[person].birthdate = dates[person];
+    return file;
+}
+
+/// Brown: Di; Naismith: Ann and Ben; Smith, booked out: Cy.
+class TaggingPageTest : public DesktopTest
+{
+protected:
+    TaggingPageTest()
+    {
+        begin({born(family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s}), {{1990, 3, 20}, {1988, 7, 1}}),
+               born(family(u"Smith"_s, {u"Cy"_s}), {{1970, 3, 4}}), family(u"Brown"_s, {u"Di"_s})});
+        place.in_database(u"UPDATE [tbl_surname] SET [booked_out]=-1 WHERE [surname]='Smith';"_s);
+        running->open_area(u"tagging"_s);
+        settle();
+    }
+    [[nodiscard]] desktop::Page& page() { return *window().page(); }
+    /// What stands beneath the steps, once the filter is done.
+    [[nodiscard]] QWidget& bench() { return child<QWidget>(page(), u"bench"_s); }
+    [[nodiscard]] QString open_step()
+    {
+        for (const auto* button : page().findChildren<QPushButton*>())
+            if (button->isChecked())
+                return button->objectName();
+        return {};
+    }
+    void push(const QString& button)
+    {
+        child<QPushButton>(page(), button).setFocus();
+        press(window(), Qt::Key_Space);
+    }
+    [[nodiscard]] QStringList listed()
+    {
+        QStringList names;
+        const auto* model = child<QTableView>(bench(), u"working_people"_s).model();
+        for (int row = 0; row < model->rowCount(); ++row)
+            names += model->index(row, 0).data().toString();
+        return names;
+    }
+    [[nodiscard]] QString text(const QString& label) { return child<QLabel>(bench(), label).text(); }
+    void choose(const QString& list, int row)
+    {
+        child<QWidget>(bench(), list).setFocus();
+        press(window(), Qt::Key_Home);
+        for (int step = 0; step < row; ++step)
+            press(window(), Qt::Key_Down);
+    }
+    /// The kind's second item stands chosen in the bulk change afterwards.
+    void choose_second(int kind, const QString& item)
+    {
+        press(window(), Qt::Key_Return, Qt::ControlModifier);
+        press(window(), Qt::Key_B, Qt::AltModifier);
+        choose(u"kind"_s, kind);
+        press(window(), Qt::Key_Tab);
+        type(window(), item);
+        settle();
+    }
+    [[nodiscard]] int rows(const QString& table)
+    {
+        auto found = desk().office.session->select(u"SELECT COUNT(*) FROM [%1];"_s.arg(table));
+        return found.first()->integer(core::Column{0});
+    }
+    [[nodiscard]] bool preview_holds(const QString& words)
+    {
+        const auto& spool = desk().windows.all<desktop::PreviewWindow>().back()->document();
+        for (int page = 1; page <= spool.page_count(); ++page)
+            if (!pages::find(spool.page(page), words).empty())
+                return true;
+        return false;
+    }
+};
+
+} // namespace
+
+TEST_F(TaggingPageTest, TheStepsFollowEachOtherAndTheListTellsHowItCameAbout)
+{
+    QStringList steps;
+    for (int step = 0; step < 8; ++step) {
+        steps += open_step();
+        press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+    }
+    EXPECT_EQ(steps, QStringList({u"filter"_s, u"sort"_s, u"hidden"_s, u"range"_s, u"title"_s, u"format"_s,
+                                  u"suppress"_s, u"process"_s}));
+    EXPECT_EQ(listed(), QStringList({u"Di"_s, u"Ann"_s, u"Ben"_s, u"Cy"_s}));
+    EXPECT_TRUE(text(u"state"_s).startsWith(u"4 people: ")) << text(u"state"_s).toStdString();
+    EXPECT_EQ(page().status(), u"4 people"_s);
+}
+
+TEST_F(TaggingPageTest, WithoutAFileStatusTheFilterStepStaysOpen)
+{
+    child<QComboBox>(page(), u"file_status"_s).setFocus();
+    press(window(), Qt::Key_Home);
+    place.dialogue.expect_box(people::no_families_chosen.toString());
+    press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+    EXPECT_EQ(open_step(), u"filter"_s);
+    EXPECT_EQ(window().focusWidget()->objectName(), u"file_status"_s);
+}
+
+TEST_F(TaggingPageTest, TheSortStepOrdersAndNarrowsTheList)
+{
+    push(u"sort"_s);
+    EXPECT_EQ(text(u"based_on"_s), u"Based on Today's date being 15/05/2024"_s);
+    choose(u"orders"_s, birth_date);
+    push(u"process"_s);
+    EXPECT_EQ(listed(), QStringList({u"Cy"_s, u"Ann"_s, u"Ben"_s, u"Di"_s}));
+
+    push(u"sort"_s);
+    choose(u"search"_s, 1);
+    choose(u"month"_s, 3);
+    push(u"process"_s);
+    EXPECT_EQ(listed(), QStringList({u"Cy"_s, u"Ann"_s}));
+    EXPECT_TRUE(text(u"state"_s).contains(u"by Birth Date in March")) << text(u"state"_s).toStdString();
+
+    push(u"sort"_s);
+    choose(u"family_type"_s, 1);
+    push(u"process"_s);
+    EXPECT_EQ(listed(), QStringList({u"Cy"_s}));
+}
+
+TEST_F(TaggingPageTest, ASearchWithoutItsValueKeepsTheSortStepOpen)
+{
+    struct Case
+    {
+        int search;
+        QString box, lacking;
+    };
+    push(u"sort"_s);
+    choose(u"orders"_s, birth_date);
+    for (const auto& [search, box, lacking] :
+         {Case{1, u"Please select a month for the date search"_s, u"month"_s},
+          Case{2, u"Please enter the ages you wish to conduct the date search for"_s, u"age_from"_s},
+          Case{3, u"Please enter the dates you wish to conduct the date search for"_s, u"date_from"_s}}) {
+        choose(u"search"_s, search);
+        if (search == 1)
+            choose(u"month"_s, 0);
+        place.dialogue.expect_box(box);
+        press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+        EXPECT_EQ(open_step(), u"sort"_s);
+        EXPECT_EQ(window().focusWidget()->objectName(), lacking);
+    }
+}
+
+TEST_F(TaggingPageTest, PeopleAreStruckAndAddedByHandAndThatIsTakenBack)
+{
+    push(u"sort"_s);
+    child<QTableView>(bench(), u"working_people"_s).setFocus();
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Down, Qt::ShiftModifier);
+    press(window(), Qt::Key_Delete);
+    EXPECT_EQ(listed(), QStringList({u"Di"_s, u"Cy"_s}));
+    EXPECT_EQ(page().note().text(), u"2 people struck from the list."_s);
+
+    press(window(), Qt::Key_Insert);
+    type(window(), u"nai b"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(listed(), QStringList({u"Di"_s, u"Ben"_s, u"Cy"_s}));
+    EXPECT_TRUE(text(u"state"_s).endsWith(u"1 added and 1 struck by hand")) << text(u"state"_s).toStdString();
+    push(u"offer"_s);
+    EXPECT_EQ(listed(), QStringList({u"Di"_s, u"Cy"_s}));
+    push(u"as_filtered"_s);
+    EXPECT_EQ(listed().size(), 4);
+}
+
+TEST_F(TaggingPageTest, ABulkChangeTellsWhatItWouldDoDoesItAndIsTakenBack)
+{
+    choose_second(1, u"group 2"_s);
+    EXPECT_EQ(text(u"count_tag_all"_s), u"3 people change, 1 in booked out families skipped"_s);
+    EXPECT_EQ(rows(u"tbl_group"_s), 0);
+
+    place.dialogue.expect_box(done, u"3 people change, 1 in booked out families skipped"_s);
+    push(u"btn_tag_all"_s);
+    EXPECT_EQ(rows(u"tbl_group"_s), 3);
+    EXPECT_EQ(text(u"count_untag"_s), u"3 people change, 1 in booked out families skipped"_s);
+    press(window(), Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(rows(u"tbl_group"_s), 0);
+    EXPECT_EQ(page().note().text(), u"The change was taken back."_s);
+
+    place.dialogue.expect_box(done);
+    push(u"btn_tag_all"_s);
+    place.dialogue.expect_box(done);
+    push(u"btn_untag"_s);
+    EXPECT_EQ(rows(u"tbl_group"_s), 0);
+    push(u"offer"_s);
+    EXPECT_EQ(rows(u"tbl_group"_s), 3);
+}
+
+TEST_F(TaggingPageTest, ABulkChangeAsksForItsItem)
+{
+    const QStringList kinds{u" Status "_s, u" Group "_s, u" Ministry "_s, u" Date Tag"_s, u" Flexi Tag"_s};
+    for (int kind = 0; kind < kinds.size(); ++kind) {
+        choose_second(kind, {});
+        const QString end = kinds[kind] + u" until you choose one from the list"_s;
+        place.dialogue.expect_box(u"Unable to tag the people with a "_s + end);
+        push(u"btn_tag_all"_s);
+        place.dialogue.expect_box(u"Unable to remove the people from the "_s + end);
+        push(u"btn_untag"_s);
+    }
+}
+
+TEST_F(TaggingPageTest, MinistryDateAndFlexiFieldAreGivenWithWhatStandsBesideThem)
+{
+    const auto give = [this] {
+        place.dialogue.expect_box(done);
+        push(u"btn_tag_all"_s);
+    };
+    choose_second(2, u"ministry 2"_s);
+    choose(u"ministry_state"_s, 1);
+    give();
+    choose_second(3, u"2"_s);
+    push(u"process"_s);
+    child<QLineEdit>(bench(), u"date"_s).setFocus();
+    child<QLineEdit>(bench(), u"date"_s).selectAll();
+    type(window(), u"01/02/2024"_s);
+    give();
+    choose_second(4, u"2"_s);
+    child<QLineEdit>(bench(), u"flexi"_s).setFocus();
+    type(window(), u"blue"_s);
+    child<QAbstractButton>(bench(), u"mark"_s).setFocus();
+    press(window(), Qt::Key_Space);
+    give();
+
+    auto found = desk().office.session->select(
+        u"SELECT m.[ministry_type],d.[in_date],f.[flexi_field],f.[flexi_tagged] FROM [tbl_ministry] m "
+        "JOIN [tbl_individual_date] d ON d.[person_id]=m.[person_id] "
+        "JOIN [tbl_flexi] f ON f.[person_id]=m.[person_id];"_s);
+    const core::Row* row = found.first();
+    ASSERT_TRUE(row);
+    EXPECT_EQ(row->integer(core::Column{0}), 2);
+    EXPECT_EQ(row->text(core::Column{1}), u"2024-02-01");
+    EXPECT_EQ(row->text(core::Column{2}), u"blue");
+    EXPECT_TRUE(row->flag(core::Column{3}));
+}
+
+TEST_F(TaggingPageTest, AReportIsMadeOfTheListAsTheStepsSay)
+{
+    push(u"range"_s);
+    type(window(), u"N"_s);
+    press(window(), Qt::Key_Tab);
+    type(window(), u"N"_s);
+    push(u"title"_s);
+    type(window(), u"Camp in May"_s);
+    push(u"process"_s);
+    EXPECT_EQ(listed(), QStringList({u"Ann"_s, u"Ben"_s}));
+    press(window(), Qt::Key_Return);
+    EXPECT_TRUE(preview_holds(u"Naismith"_s));
+    EXPECT_TRUE(preview_holds(u"Camp in May"_s));
+    EXPECT_FALSE(preview_holds(u"Church Directory"_s));
+    EXPECT_FALSE(preview_holds(u"Brown"_s));
+}
+
+TEST_F(TaggingPageTest, UnlistedDetailsAreNotPrintedWithoutTheRight)
+{
+    desk().office.rights.set(core::Area::security, false);
+    push(u"hidden"_s);
+    place.dialogue.expect_box(u"Your password does not give access to \"Security\""_s);
+    press(window(), Qt::Key_Space);
+    EXPECT_FALSE(child<QAbstractButton>(bench(), u"hidden_details"_s).isChecked());
+}
+
+TEST_F(TaggingPageTest, EveryStepFitsTheSmallestWindow)
+{
+    window().resize(1024, 768);
+    for (int step = 0; step < 8; ++step) {
+        settle();
+        EXPECT_EQ(window().size(), QSize(1024, 768)) << open_step().toStdString();
+        press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+    }
+}
+
+} // namespace kindrel::test
