@@ -30,13 +30,15 @@ struct Option
 struct Arguments
 {
     QStringList positional;
-    QHash<QString, QString> options; ///< A switch that was given has an empty value.
+    QHash<QString, QStringList> options; ///< Each with its values in order; a switch that was given has an empty one.
 
     [[nodiscard]] bool has(const QString& option) const { return options.contains(option); }
     [[nodiscard]] QString value(const QString& option, const QString& fallback = {}) const
     {
-        return options.value(option, fallback);
+        return has(option) ? values(option).last() : fallback;
     }
+    /// Of an option that may be given again and again.
+    [[nodiscard]] QStringList values(const QString& option) const { return options.value(option); }
     /// Nullopt when it is not given or is no whole number.
     [[nodiscard]] std::optional<int> number(const QString& option) const;
 };
@@ -75,6 +77,7 @@ struct Command
 [[nodiscard]] Status run_totals(Context& context);
 [[nodiscard]] Status run_families(Context& context);
 [[nodiscard]] Status run_family(Context& context);
+[[nodiscard]] Status run_people(Context& context);
 [[nodiscard]] Status run_reports(Context& context);
 [[nodiscard]] Status run_report(Context& context);
 

@@ -33,7 +33,7 @@ void take(Arguments& arguments, const QCommandLineParser& parser, std::span<cons
     for (const auto& option : options) {
         const auto name = QString::fromLatin1(option.name);
         if (parser.isSet(name))
-            arguments.options.insert(name, option.value ? parser.value(name) : QString());
+            arguments.options.insert(name, option.value ? parser.values(name) : QStringList{QString()});
     }
 }
 

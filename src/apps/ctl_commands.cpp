@@ -18,6 +18,26 @@ constexpr std::array families_options{
            "all, active, privacy, active-privacy, prospect, archive, booked-in or booked-out (default all)"},
     json,
 };
+constexpr std::array people_options{
+    Option{"list", "NAME", "the families' list by its name on the screen (default \"Active Families\")"},
+    Option{"people", "STATES", "active, privacy, prospect, archived, contact, deceased (default active)"},
+    Option{"status", "NAME", "who has the status; this and the next may be given again for another one"},
+    Option{"not-status", "NAME", "who has not"},
+    Option{"group", "NAME", "who is in the group"},
+    Option{"not-group", "NAME", "who is not"},
+    Option{"ministry", "NAME", "who is in the ministry, active or potential"},
+    Option{"family-group", "NAME", "whose family is in the family group"},
+    Option{"occupation", "NAME", "who has the occupation"},
+    Option{"suburb", "NAME", "whose family lives there"},
+    Option{"age", "A-B", "who is that old today"},
+    Option{"born", "MONTH|D/M-D/M", "whose birthday is in the month, or between the days of any year"},
+    Option{"surname", "A-M", "families from one letter to another"},
+    Option{"sort", "ORDER",
+           "family, individual, suburb, postcode, birth-date, visitation, family-events, or the name of a date "
+           "(default family)"},
+    Option{"fields", "A,B,C", "what to list; \"help\" names them (default surname,name,res_street,suburb,phone)"},
+    Option{"format", "FORMAT", "text, csv or json (default text)"},
+};
 constexpr std::array report_options{
     Option{"pdf", "FILE", "the file to write; one that is there is replaced once the report is complete"},
     Option{"paper", "SIZE", "a4 or letter (default a4)"},
@@ -49,6 +69,10 @@ constexpr std::array command_table{
             "Shows what is stored about the family with this key (see \"families\") and about its people.\n"
             "What is unlisted, or what your rights do not cover, is left out.",
             Needs::church, core::Area::search_for_family, 1, list_options, run_family},
+    Command{"people", "[CRITERIA] [--sort ORDER] [--fields A,B,C] [--format FORMAT]", "list chosen people",
+            "Lists the people whom all criteria choose, with the fields asked for.\n"
+            "What is unlisted, or what your rights do not cover, is left out.",
+            Needs::church, core::Area::export_text, 0, people_options, run_people},
     Command{"reports",
             "[--json]",
             "list the reports",

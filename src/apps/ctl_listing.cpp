@@ -20,6 +20,13 @@ QString shown(const QJsonValue& value)
     return value.isDouble() ? QString::number(value.toInteger()) : value.toString();
 }
 
+/// As a cell of comma-separated values.
+QString quoted(QString text)
+{
+    const bool needed = std::ranges::any_of(text, [](QChar c) { return u",\"\r\n"_s.contains(c); });
+    return needed ? u'"' + text.replace(u'"', u"\"\""_s) + u'"' : text;
+}
+
 void print_line(QTextStream& out, const QStringList& cells, const std::vector<qsizetype>& widths)
 {
     QString line;
@@ -32,10 +39,35 @@ void print_line(QTextStream& out, const QStringList& cells, const std::vector<qs
 
 } // namespace
 
-void Listing::print(QTextStream& out, bool json) const
+void Listing::print(QTextStream& out, Format format) const
 {
-    json ? print_json(out) : print_text(out);
+    switch (format) {
+    case Format::text:
+        print_text(out);
+        break;
+    case Format::csv:
+        print_csv(out);
+        break;
+    case Format::json:
+        print_json(out);
+        break;
+    }
     out.flush();
+}
+
+/// The names stand in the first line; lines end in CR LF.
+void Listing::print_csv(QTextStream& out) const
+{
+    QStringList names;
+    for (const auto& column : m_columns)
+        names += quoted(column.name);
+    out << names.join(u',') << "\r\n";
+    for (const auto& row : m_rows) {
+        QStringList cells;
+        for (const auto& value : row)
+            cells += quoted(shown(value));
+        out << cells.join(u',') << "\r\n";
+    }
 }
 
 void Listing::print_json(QTextStream& out) const

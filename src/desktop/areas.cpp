@@ -32,18 +32,18 @@ Page* enter(Desk& desk)
 
 constexpr std::array areas{
     AreaDefinition{"main_menu", "Main Menu", "go-home", std::nullopt, Parked::stay, make<MainMenu>},
-    AreaDefinition{"editor", "Family Editor", "user-identity", std::nullopt, Parked::setups_leave, enter<EditorPage>},
-    AreaDefinition{"search", "Search", "edit-find", core::Area::search_for_family, Parked::stay, enter<SearchPage>},
-    AreaDefinition{"filters", "Filters", "view-filter", core::Area::search_for_family, Parked::stay, make<FiltersPage>},
-    AreaDefinition{"tagging", "Tagging", "tag", core::Area::tagging, Parked::setups_leave, enter<TaggingPage>},
-    AreaDefinition{"reports", "Reports", "office-report", core::Area::report_outputs, Parked::stay,
-                   make<CataloguePage>},
-    AreaDefinition{"setup", "Setup", "settings-configure", core::Area::family_file_setup, Parked::leave_first,
+    AreaDefinition{"editor", "Family Editor", "user-identity", core::AreaId::family_editor, Parked::setups_leave,
+                   enter<EditorPage>},
+    AreaDefinition{"search", "Search", "edit-find", core::AreaId::search, Parked::stay, enter<SearchPage>},
+    AreaDefinition{"filters", "Filters", "view-filter", core::AreaId::search, Parked::stay, make<FiltersPage>},
+    AreaDefinition{"tagging", "Tagging", "tag", core::AreaId::tagging, Parked::setups_leave, enter<TaggingPage>},
+    AreaDefinition{"reports", "Reports", "office-report", core::AreaId::reports, Parked::stay, make<CataloguePage>},
+    AreaDefinition{"setup", "Setup", "settings-configure", core::AreaId::family_setup, Parked::leave_first,
                    enter<SetupPage>},
-    AreaDefinition{"fusions", "Fusions", "merge", core::Area::filter_fusion_setup, Parked::stay, enter<FusionPage>},
-    AreaDefinition{"security", "Security", "object-locked", core::Area::security, Parked::leave_first,
+    AreaDefinition{"fusions", "Fusions", "merge", core::AreaId::fusions, Parked::stay, enter<FusionPage>},
+    AreaDefinition{"security", "Security", "object-locked", core::AreaId::security, Parked::leave_first,
                    enter<SecurityPage>},
-    AreaDefinition{"network", "Network", "network-workgroup", core::Area::network_setup, Parked::leave_first,
+    AreaDefinition{"network", "Network", "network-workgroup", core::AreaId::network_setup, Parked::leave_first,
                    enter<NetworkPage>},
 };
 

@@ -65,22 +65,8 @@ QString listed(const Person& person)
         text += u" (%1)"_s.arg(person.preferred_name);
     if (!person.other_surname.isEmpty() && !person.surname_hidden)
         text += u' ' + person.other_surname;
-    return text + markers(person, Markers::shortened);
-}
-
-/// A number is found from any of its groups of digits on, with and without the blanks between them.
-QString phone_words(const QString& phone)
-{
-    QString words;
-    QString from_here;
-    for (qsizetype place = phone.size() - 1; place >= 0; --place) {
-        if (!phone[place].isDigit())
-            continue;
-        from_here.prepend(phone[place]);
-        if (place == 0 || !phone[place - 1].isDigit())
-            words += u' ' + from_here;
-    }
-    return words;
+    const QString flags = markers(person, Markers::shortened);
+    return flags.isEmpty() ? text : text + u' ' + flags;
 }
 
 void take(std::vector<const SpeedFindLine*>& hits, const std::vector<SpeedFindLine>& from, const QBitArray& wanted,
@@ -116,10 +102,10 @@ void SpeedFind::read()
 {
     m_lines.clear();
     m_searched.clear();
+    m_numbers = {};
     read_families();
     read_people();
     index();
-    m_searched.clear();
 }
 
 void SpeedFind::read_families()
@@ -142,9 +128,9 @@ void SpeedFind::read_families()
         const QString mobile = cells.text();
         searched.surname = search_words(line.surname);
         searched.others = line.suburb;
-        searched.others += phone_words(line.phone);
+        m_numbers.add(int(m_lines.size()) - 1, line.phone);
         if (!cells.flag())
-            searched.others += phone_words(mobile);
+            m_numbers.add(int(m_lines.size()) - 1, mobile);
     }
 }
 
@@ -163,25 +149,35 @@ void SpeedFind::read_people()
         const Person person = person_of(cells);
         QString& names = m_lines[*place].people;
         names += (names.isEmpty() ? u""_s : u", "_s) + listed(person);
-        QString& searched = m_searched[*place].others;
+        auto& searched = m_searched[*place];
         for (const QString& word : {person.Name, person.preferred_name, person.other_surname, person.middle_name})
             if (!word.isEmpty())
-                searched += u' ' + word;
+                searched.others += u' ' + word;
         if (!person.mobile_hidden)
-            searched += phone_words(person.mobile_phone);
+            m_numbers.add(int(*place), person.mobile_phone);
     }
 }
 
 void SpeedFind::index()
 {
     m_words = {};
-    m_surnames = {};
-    for (std::size_t place = 0; place < m_lines.size(); ++place) {
-        m_surnames.add(int(place), m_searched[place].surname);
-        m_words.add(int(place), m_searched[place].surname + search_words(m_searched[place].others));
+    for (int place = 0; auto& searched : m_searched) {
+        m_words.add(place++, searched.surname + search_words(searched.others));
+        searched.others.clear();
     }
-    m_surnames.finish(int(m_lines.size()));
     m_words.finish(int(m_lines.size()));
+    m_numbers.finish();
+}
+
+QBitArray SpeedFind::with(const QString& wanted) const
+{
+    QBitArray found = m_words.with(wanted);
+    QStringView word = QStringView(wanted).trimmed();
+    if (word.startsWith(u'+'))
+        word = word.sliced(1);
+    if (!word.isEmpty() && std::ranges::all_of(word, [](QChar c) { return c.isDigit(); }))
+        m_numbers.mark(word, found);
+    return found;
 }
 
 SpeedFindHits SpeedFind::find(const QString& typed, int most) const
@@ -189,8 +185,14 @@ SpeedFindHits SpeedFind::find(const QString& typed, int most) const
     const QStringList wanted = wanted_words(typed);
     if (wanted.isEmpty())
         return {};
-    const QBitArray all = m_words.with_all(wanted);
-    const QBitArray by_surname = m_surnames.with_any(wanted) & all;
+    QBitArray all(qsizetype(m_lines.size()), true);
+    for (const QString& word : wanted)
+        all &= with(word);
+    QBitArray by_surname(all.size());
+    for (qsizetype place = 0; place < all.size(); ++place)
+        by_surname.setBit(place, all.testBit(place) && std::ranges::any_of(wanted, [&](const QString& word) {
+                                     return m_searched[std::size_t(place)].surname.contains(word);
+                                 }));
     SpeedFindHits hits{{}, int(all.count(true))};
     take(hits.lines, m_lines, by_surname, most);
     take(hits.lines, m_lines, all & ~by_surname, most);

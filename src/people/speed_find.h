@@ -11,7 +11,7 @@ struct SpeedFindLine
 {
     int surname_id = 0;
     QString surname;
-    QString people; ///< "Ann (Nan), Ben Brown, Carl(Dec)".
+    QString people; ///< "Ann (Nan), Ben Brown, Carl (Dec)".
     QString suburb;
     QString phone;
     FileStatus Condition = FileStatus::active;
@@ -46,16 +46,20 @@ private:
     void read_people();
     void index();
 
+    /// The words by which a family is sought.
     struct Searched
     {
         QString surname, others;
     };
 
+    [[nodiscard]] QBitArray with(const QString& wanted) const;
+
     core::Office& m_office;
     std::optional<qint64> m_change_mark; ///< Nothing before the first reading.
     std::vector<SpeedFindLine> m_lines;  ///< By surname.
     std::vector<Searched> m_searched;    ///< Beside `m_lines`.
-    WordIndex m_words, m_surnames;
+    WordIndex m_words;
+    NumberIndex m_numbers;
 };
 
 } // namespace kindrel::people

@@ -2,9 +2,8 @@
 
 #include <QBitArray>
 #include <QHash>
-#include <QStringList>
+#include <QString>
 
-#include <span>
 #include <vector>
 
 namespace kindrel::people {
@@ -19,8 +18,8 @@ public:
     /// Puts the words in order; asking begins after this.
     void finish(int places);
 
-    [[nodiscard]] QBitArray with_all(const QStringList& wanted) const;
-    [[nodiscard]] QBitArray with_any(const QStringList& wanted) const;
+    /// A bit for each place. `wanted` is one of wanted_words().
+    [[nodiscard]] QBitArray with(QStringView wanted) const;
 
 private:
     struct Word
@@ -29,11 +28,31 @@ private:
         std::vector<int> places;
     };
 
-    [[nodiscard]] QBitArray with(QStringView wanted) const;
-
     QHash<QString, std::vector<int>> m_added;
     std::vector<Word> m_words; ///< In order.
     int m_places = 0;
+};
+
+/// Which of many things hold a phone number with given digits, from any of its groups of digits on and whatever stands
+/// between them. Only the first sixteen digits count.
+class NumberIndex
+{
+public:
+    void add(int place, QStringView number);
+    /// Puts the numbers in order; asking begins after this.
+    void finish();
+
+    /// Sets the bits of those places; the others stay.
+    void mark(QStringView digits, QBitArray& found) const;
+
+private:
+    struct Number
+    {
+        quint64 digits = 0; ///< From the left, four bits each; 0 where there are no more.
+        int place = 0;
+    };
+
+    std::vector<Number> m_numbers;
 };
 
 } // namespace kindrel::people

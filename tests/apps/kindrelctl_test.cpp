@@ -1,130 +1,8 @@
-#include "core/security_setup.h"
-#include "support/data_folder.h"
-
-#include <QDir>
-#include <QFile>
-#include <QJsonArray>
-#include <QJsonDocument>
-#include <QJsonObject>
-#include <QProcess>
-#include <QRegularExpression>
-#include <QSet>
-#include <QTemporaryDir>
-
-#include <gtest/gtest.h>
-
-#include <algorithm>
-#include <csignal>
-
-#include <sys/resource.h>
+#include "apps/kindrelctl_fixture.h"
 
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
-
-namespace {
-
-/// How a run of the program ended.
-struct Ended
-{
-    int status = -1;
-    QByteArray out, err;
-};
-
-std::ostream& operator<<(std::ostream& stream, const Ended& ended)
-{
-    return stream << "status " << ended.status << "\n" << ended.out.toStdString() << "\n" << ended.err.toStdString();
-}
-
-enum class DiskSpace { plenty, scarce };
-
-/// Room for a few pages, not for the PDF with its fonts.
-void refuse_large_files()
-{
-    constexpr rlim_t most_bytes = 8 * 1024;
-    const rlimit limit{most_bytes, most_bytes};
-    setrlimit(RLIMIT_FSIZE, &limit);
-    signal(SIGXFSZ, SIG_IGN);
-}
-
-/// The real program on a data drive of its own.
-class KindrelctlTest : public testing::Test
-{
-protected:
-    [[nodiscard]] Ended run(const QStringList& words, DiskSpace space = DiskSpace::plenty)
-    {
-        QProcess program;
-        if (space == DiskSpace::scarce)
-            program.setChildProcessModifier(refuse_large_files);
-        program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrelctl"_s,
-                      QStringList{u"--data-drive"_s, drive.path()} + words);
-        program.closeWriteChannel();
-        if (!program.waitForFinished(120'000) || program.exitStatus() != QProcess::NormalExit)
-            return {-1, {}, program.errorString().toUtf8()};
-        return {program.exitCode(), program.readAllStandardOutput(), program.readAllStandardError()};
-    }
-    /// Lays down the data folder and fills church 1.
-    void make_church(int families)
-    {
-        const auto installed = run({u"install"_s});
-        ASSERT_EQ(installed.status, 0) << installed;
-        const auto made = run({u"make-church"_s, u"--families"_s, QString::number(families), u"--seed"_s, u"7"_s});
-        ASSERT_EQ(made.status, 0) << made;
-    }
-    /// The password "finder" may look for families, "keeper" may set up passwords.
-    void switch_security_on()
-    {
-        FakeWorkstation workstation;
-        workstation.drive = drive.path();
-        ScriptedDialogue dialogue;
-        FixedClock clock;
-        core::SilentProgress progress;
-        const auto office = core::start_up({core::Purpose::command_line}, workstation, dialogue, clock, progress);
-        ASSERT_TRUE(office);
-        auto setup = core::SecuritySetup::open(*office);
-        ASSERT_TRUE(setup);
-        setup->switch_on(true);
-        ASSERT_TRUE(setup->set_area(setup->add(u"finder"_s).value(), core::Area::search_for_family, true));
-        ASSERT_TRUE(setup->set_area(setup->add(u"keeper"_s).value(), core::Area::security, true));
-        dialogue.expect_box(u"Security will become operational the next time a user enters Kindrel"_s);
-        ASSERT_TRUE(setup->leave());
-    }
-    [[nodiscard]] QJsonArray list(const QStringList& words)
-    {
-        const auto ended = run(words + QStringList{u"--json"_s});
-        EXPECT_EQ(ended.status, 0) << ended;
-        const auto document = QJsonDocument::fromJson(ended.out);
-        EXPECT_TRUE(document.isArray()) << ended;
-        return document.array();
-    }
-    /// A file that holds the password.
-    [[nodiscard]] QString password_file(const QByteArray& password)
-    {
-        const auto file = drive.filePath(u"password"_s);
-        QFile written(file);
-        EXPECT_TRUE(written.open(QFile::WriteOnly) && written.write(password + '\n') > 0);
-        return file;
-    }
-    /// Those that the help names.
-    [[nodiscard]] QStringList commands()
-    {
-        static const QRegularExpression named(u"^  ([a-z][a-z-]+) "_s, QRegularExpression::MultilineOption);
-        QStringList words;
-        for (const auto& match : named.globalMatch(QString::fromUtf8(run({u"--help"_s}).out)))
-            words += match.captured(1);
-        return words;
-    }
-    [[nodiscard]] QString pdf() const { return drive.filePath(u"report.pdf"_s); }
-    [[nodiscard]] static QByteArray content(const QString& file)
-    {
-        QFile opened(file);
-        return opened.open(QFile::ReadOnly) ? opened.readAll() : QByteArray();
-    }
-
-    QTemporaryDir drive;
-};
-
-} // namespace
 
 TEST_F(KindrelctlTest, AMadeChurchIsCountedListedAndShown)
 {
@@ -253,6 +131,8 @@ TEST_F(KindrelctlTest, WhatCannotBeFoundIsRefusedWithAMessageOnStandardError)
     const std::vector<std::pair<QStringList, QByteArray>> cases{
         {{u"family"_s, u"4711"_s}, "There is no family with the key 4711."},
         {{u"report"_s, u"k9999"_s, u"--pdf"_s, pdf()}, "There is no report \"k9999\""},
+        {{u"people"_s, u"--group"_s, u"Fliers"_s}, "There is no group \"Fliers\"."},
+        {{u"people"_s, u"--sort"_s, u"height"_s}, "There is no order and no date \"height\"."},
     };
     for (const auto& [words, message] : cases) {
         const auto ended = run(words);
@@ -300,6 +180,7 @@ TEST_F(KindrelctlTest, EveryCommandOnAChurchAsksForItsRight)
         {{u"totals"_s}, "\"Search for Family\""},
         {{u"families"_s}, "\"Search for Family\""},
         {{u"family"_s, u"1"_s}, "\"Search for Family\""},
+        {{u"people"_s}, "\"Export\""},
         {{u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}, "\"Report Outputs\""},
     };
     QStringList asked{u"install"_s, u"reports"_s}; // They open no church.
@@ -342,6 +223,13 @@ TEST_F(KindrelctlTest, WrongUsageIsToldApartFromRefusal)
         {u"make-church"_s, u"--families"_s, u"0"_s},
         {u"report"_s, u"k10"_s},
         {u"report"_s, u"k10"_s, u"--pdf"_s, pdf(), u"--paper"_s, u"a5"_s},
+        {u"people"_s, u"--list"_s, u"Sleeping Families"_s},
+        {u"people"_s, u"--people"_s, u"active,asleep"_s},
+        {u"people"_s, u"--age"_s, u"old"_s},
+        {u"people"_s, u"--born"_s, u"31/2-1/3"_s},
+        {u"people"_s, u"--surname"_s, u"A-B-C"_s},
+        {u"people"_s, u"--fields"_s, u"name,shoe"_s},
+        {u"people"_s, u"--format"_s, u"xml"_s},
     };
     for (const auto& words : cases) {
         const auto ended = run(words);

@@ -1,9 +1,12 @@
 #include "desktop/desktop_fixture.h"
 #include "desktop/people/filter_panel.h"
+#include "desktop/people/found_people_model.h"
 #include "desktop/shell/page.h"
+#include "people/saved_filters.h"
 #include "support/families.h"
 
 #include <QAbstractButton>
+#include <QAction>
 #include <QComboBox>
 #include <QLineEdit>
 #include <QListWidget>
@@ -142,7 +145,17 @@ TEST_F(FilterPanelTest, TheKindsTellWhereSomethingIsAskedFor)
     EXPECT_EQ(child<QListWidget>(panel(), u"kinds"_s).currentItem()->text(), u"Groups (1)"_s);
 }
 
-TEST_F(FilterPanelTest, AChoiceBesideAnItemIncludesIt)
+TEST_F(FilterPanelTest, AStateChosenBesideAMinistryIncludesItInThatState)
+{
+    choose_kind(u"Ministry"_s);
+    auto* part = child<QStackedWidget>(panel(), {}).currentWidget();
+    child<QComboBox>(*part, u"ministry_state"_s).setFocus();
+    press(window(), Qt::Key_Down);
+    EXPECT_EQ(use(0), u"include, active only"_s);
+    EXPECT_EQ(text(u"sentence"_s), active_people + u"; in the ministry ministry 1 (active)"_s);
+}
+
+TEST_F(FilterPanelTest, AValueTypedBesideAFlexiFieldIncludesIt)
 {
     choose_kind(u"Flexi"_s);
     press(window(), Qt::Key_Down);
@@ -196,6 +209,69 @@ TEST_F(FilterPanelTest, AnAnniversaryIsAddedByKeysAndTakenOutAgain)
     dates.setFocus();
     press(window(), Qt::Key_Delete);
     EXPECT_EQ(text(u"count"_s), u"4 people are found"_s);
+}
+
+TEST_F(FilterPanelTest, AMonthOfOneKindOfFamilyDateIsAdded)
+{
+    place.in_database(u"INSERT INTO [tbl_family_date] ([Surname_id],[family_date_id],[family_date]) "
+                      "VALUES (1,2,'1990-11-30');"_s);
+    choose_kind(u"Birth"_s);
+    const auto choose = [&](const QString& box, const QString& wanted) {
+        auto& choices = child<QComboBox>(panel(), box);
+        choices.setFocus();
+        while (choices.currentText() != wanted && choices.currentIndex() + 1 < choices.count())
+            press(window(), Qt::Key_Down);
+    };
+    choose(u"date_source"_s, u"Date of the family"_s);
+    choose(u"date_item"_s, u"date_description 2"_s);
+    choose(u"date_span"_s, u"Month of any year"_s);
+    choose(u"date_month"_s, u"November"_s);
+    press_button(u"add_date"_s);
+    EXPECT_EQ(child<QListWidget>(panel(), u"dates"_s).item(0)->text(),
+              u"of a family with the date date_description 2 in November"_s);
+    EXPECT_EQ(text(u"count"_s), u"3 people are found"_s);
+}
+
+TEST_F(FilterPanelTest, ARecalledFilterStandsInItsFields)
+{
+    people::Filter kept = panel().filter();
+    kept.families = people::FamilyList::prospect;
+    kept.states = {.active = false, .deceased = true};
+    kept.surnames = people::SurnameRange{u"B"_s, u"K"_s, true};
+    kept.ages = people::Ages{18, 65, core::Date{2020, 2, 29}};
+    kept.family_type = people::FamilyType::single_parent;
+    kept.suburb_known = true;
+    ASSERT_TRUE(people::save_filter(desk().office, u"Kept"_s, kept));
+    panel().reload();
+    saved().setFocus();
+    press(window(), Qt::Key_Down);
+    for (const auto& kind : {u"File Status"_s, u"Surnames"_s, u"Family Type"_s})
+        choose_kind(kind);
+
+    EXPECT_EQ(child<QComboBox>(panel(), u"file_status"_s).currentText(), u"Prospect Families"_s);
+    EXPECT_FALSE(child<QAbstractButton>(panel(), u"active"_s).isChecked());
+    EXPECT_TRUE(child<QAbstractButton>(panel(), u"decease"_s).isChecked());
+    for (const auto& [field, shown] :
+         std::initializer_list<std::pair<QString, QString>>{{u"surname_from"_s, u"B"_s},
+                                                            {u"surname_to"_s, u"K"_s},
+                                                            {u"year_from"_s, {}},
+                                                            {u"age_from"_s, u"18"_s},
+                                                            {u"age_to"_s, u"65"_s},
+                                                            {u"age_on"_s, u"29/02/2020"_s}})
+        EXPECT_EQ(child<QLineEdit>(panel(), field).text(), shown);
+    EXPECT_TRUE(child<QAbstractButton>(panel(), u"own_surname"_s).isChecked());
+    EXPECT_EQ(child<QComboBox>(panel(), u"family_type"_s).currentText(), u"Single Parent"_s);
+    EXPECT_TRUE(child<QAbstractButton>(panel(), u"suburb_known"_s).isChecked());
+    EXPECT_EQ(panel().filter(), kept);
+}
+
+TEST_F(FilterPanelTest, ClearStartsAgainAndTheListsShowIt)
+{
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    press_button(u"clear_filter"_s);
+    EXPECT_EQ(use(0), QString());
+    EXPECT_EQ(text(u"sentence"_s), active_people);
 }
 
 TEST_F(FilterPanelTest, WithoutAFileStatusNobodyIsShownAndTheCursorGoesToIt)
@@ -285,6 +361,53 @@ TEST_F(FilterPanelTest, TheFoundPeopleAreListedWithMarkersNarrowedAndOpened)
     press(window(), Qt::Key_Down);
     press(window(), Qt::Key_Return);
     EXPECT_EQ(window().page()->objectName(), u"Editor"_s);
+}
+
+TEST_F(FilterPanelTest, ThePeopleFoundAreSavedAsCommaSeparatedText)
+{
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    const QString file = place.data.drive() + u"people.csv"_s;
+    place.dialogue.expect_file(u"Save this list"_s, file);
+    for (QAction* action : window().page()->actions())
+        if (action->text() == u"Save as CSV")
+            action->trigger();
+    EXPECT_EQ(DataFolder::read(file), "\xEF\xBB\xBFName,Family,Suburb\r\nAnn,Naismith,suburb 1\r\n"
+                                      "Ben,Naismith,suburb 1\r\n");
+}
+
+TEST_F(FilterPanelTest, WithoutTheRightToBirthDatesNobodyIsFoundByThem)
+{
+    press(window(), Qt::Key_W, Qt::ControlModifier);
+    desk().office.rights.set(core::Area::birth_dates, false);
+    open();
+    EXPECT_FALSE(child<QLineEdit>(panel(), u"age_from"_s).isEnabled());
+    EXPECT_EQ(child<QComboBox>(panel(), u"date_source"_s).findText(u"Birth date"_s), -1);
+}
+
+TEST_F(FilterPanelTest, PeopleAreFoundInTheListWithoutMindingAccents)
+{
+    desktop::FoundPeopleModel list;
+    list.set_people({{.name = u"Zo\u00eb (Contact)"_s, .family = u"\u017b\u00f3\u0142\u0107"_s},
+                     {.name = u"Stan"_s, .family = u"Okafor"_s, .suburb = u"Z\u00fcrich"_s}});
+    for (const auto& [typed, found] : std::initializer_list<std::pair<QString, int>>{
+             {u"zoe"_s, 1}, {u"z"_s, 2}, {u"CONTACT"_s, 1}, {u"oka zur"_s, 1}, {u"kafor"_s, 0}, {{}, 2}}) {
+        list.narrow(typed);
+        EXPECT_EQ(list.rowCount(), found) << typed.toStdString();
+    }
+}
+
+TEST_F(FilterPanelTest, ACancelledReadingGivesNobody)
+{
+    struct Cancelling : core::SilentProgress
+    {
+        bool step(const QString&) override { return false; }
+    } cancelling;
+    desktop::Desk impatient{desk().office,  cancelling,      desk().remembered,
+                            desk().windows, desk().printing, desk().navigation};
+    const auto list = people::active_families(*desk().office.session);
+    EXPECT_FALSE(desktop::read_people(impatient, list));
+    EXPECT_EQ(desktop::read_people(desk(), list)->size(), list.members.size());
 }
 
 TEST_F(FilterPanelTest, EscapeLeadsFromThePeopleBackToTheFilter)

@@ -3,6 +3,7 @@
 #include "people/fusion.h"
 
 #include <QAbstractButton>
+#include <QAction>
 #include <QComboBox>
 #include <QLineEdit>
 #include <QListView>
@@ -124,6 +125,27 @@ TEST_F(FusionPageTest, AMarkedDateIsShownWithItsTag)
     EXPECT_EQ(entry_texts(), QStringList(u"(Tag) date_description 1 (OR+ Can be in Group)"_s));
 }
 
+TEST_F(FusionPageTest, AFlexiFieldCanBeAskedForByItsValue)
+{
+    place.in_database(u"INSERT INTO [tbl_flexi] ([person_id],[flexi_id],[flexi_field]) VALUES (1,1,'Piano');"_s);
+    add_fusion(u"Sunday"_s);
+    choose_kind(u"Flexi"_s);
+    child<QComboBox>(page(), u"value"_s).setFocus();
+    press(window(), Qt::Key_Down);
+    press_button(u"andp"_s);
+    EXPECT_EQ(entry_texts(), QStringList(u"flexi 1 = Piano (And+ Must be in group)"_s));
+}
+
+TEST_F(FusionPageTest, AnotherKindStartsWithItsFirstItemAndNothingTyped)
+{
+    add_fusion(u"Sunday"_s);
+    choose_kind(u"Groups"_s);
+    type(window(), u"group 2"_s);
+    press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(entry_texts(), QStringList(u"family_group 1 (OR+ Can be in Group)"_s));
+}
+
 TEST_F(FusionPageTest, AnEntryNeedsAFusion)
 {
     choose_kind(u"Groups"_s);
@@ -241,6 +263,33 @@ TEST_F(FusionPageTest, LeavingAsksAndDoesAsItIsTold)
         EXPECT_EQ(page().objectName() == u"Setup_Fusion", stays);
         EXPECT_EQ(stored().size(), count);
     }
+}
+
+TEST_F(FusionPageTest, CancelDropsEveryChangeAfterAsking)
+{
+    add_fusion(u"Sunday"_s);
+    press(window(), Qt::Key_S, Qt::ControlModifier);
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    add_fusion(u"Monday"_s);
+    place.dialogue.expect_confirm(u"Do you wish to drop every change since the fusions were saved?"_s,
+                                  core::Answer::yes, core::Answer::no);
+    for (QAction* action : window().page()->actions())
+        if (action->text() == u"Cancel")
+            action->trigger();
+    EXPECT_EQ(names().model()->rowCount(), 1);
+    EXPECT_EQ(entries().count(), 0);
+    EXPECT_FALSE(window().page()->altered());
+}
+
+TEST_F(FusionPageTest, AFailedSaveIsToldAndLosesNothing)
+{
+    add_fusion(u"Sunday"_s);
+    place.in_database(u"DROP TABLE [Tbl_fusion_group];"_s);
+    place.dialogue.expect_box(u"Unable to save the fusions"_s);
+    press(window(), Qt::Key_S, Qt::ControlModifier);
+    EXPECT_TRUE(window().page()->altered());
+    EXPECT_EQ(names().model()->rowCount(), 1);
 }
 
 TEST_F(FusionPageTest, WhatIsTypedButNotEnteredIsSavedToo)

@@ -171,7 +171,7 @@ TEST_F(SearchPageTest, EnterOnAPartListsThoseWhoHaveAnEntryInIt)
     choose_part(u"Title"_s);
     EXPECT_EQ(shown(entries()), (QStringList{u"Naismith"_s, u"Smith"_s}));
     EXPECT_EQ(shown(entries(), 2), (QStringList{u"Ms"_s, u"Dr (hidden)"_s}));
-    EXPECT_EQ(label(u"data_count"_s), u"People with an entry in Title: 2 people"_s);
+    EXPECT_EQ(label(u"data_count"_s), u"2 people with an entry in Title"_s);
     EXPECT_EQ(window().page()->status(), u"2 people"_s);
 
     press(window(), Qt::Key_Tab);

@@ -61,7 +61,7 @@ NetworkPage::NetworkPage(Desk& desk, core::AreaEntry entry, core::NetworkSetup s
       m_switch(new QCheckBox(u"&Work with the data files on the network"_s)), m_path(new QLineEdit),
       m_locks(new LockList)
 {
-    setObjectName(u"network"_s);
+    setObjectName(u"setup_Networking"_s);
     auto* content = new QWidget;
     auto* column = new QVBoxLayout(content);
     column->setContentsMargins(space::group, 0, space::group, space::margin);

@@ -112,14 +112,17 @@ void DataSearchTab::show_entries(std::vector<people::DataEntry> entries)
     else
         m_view->setCurrentIndex(m_model->index(0, 0));
     m_stack->setCurrentIndex(none ? 1 : 0);
-    m_count->setText(m_part ? u"%1: %2"_s.arg(people::heading_of(*m_part), count_words()) : QString());
+    m_count->setText(m_part ? u"%1 with an entry in %2"_s.arg(count_words(), QString::fromLatin1(m_part->name))
+                            : QString());
     Q_EMIT counted();
 }
 
 QString DataSearchTab::count_words() const
 {
+    if (!m_part)
+        return {};
     const int count = m_model->rowCount();
-    const bool of_families = m_part && m_part->owner == people::DataOwner::family;
+    const bool of_families = m_part->owner == people::DataOwner::family;
     if (count == 1)
         return of_families ? u"1 family"_s : u"1 person"_s;
     return (of_families ? u"%1 families"_s : u"%1 people"_s).arg(QLocale().toString(count));

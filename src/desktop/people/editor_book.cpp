@@ -68,7 +68,14 @@ void EditorBook::show_file()
 
 bool EditorBook::finish_typing()
 {
-    return std::ranges::all_of(m_parts, &EditorTab::finish_typing);
+    const auto refuses = [](EditorTab* part) {
+        return !part->finish_typing();
+    };
+    const auto found = std::ranges::find_if(m_parts, refuses);
+    if (found == m_parts.end())
+        return true;
+    setCurrentIndex(int(found - m_parts.begin()));
+    return false;
 }
 
 void EditorBook::focus_guilty(people::SaveRefusal::Where where)

@@ -29,7 +29,7 @@ using Line = FormLine<Person>;
 namespace {
 
 constexpr int short_width = 112;
-constexpr int least_type_length = 14;
+constexpr int least_type_length = 10;
 constexpr int greatest_school_year = 99;
 
 constexpr std::array further_names{
@@ -190,6 +190,7 @@ void EditorPersonTab::add_pin(EditorForm& form)
     auto* pin = new PinField(bench());
     form.on_show([pin] { pin->show_file(); });
     form.add_row(u"P&IN"_s, pin);
+    form.add_wide(pin->buttons());
 }
 
 void EditorPersonTab::show_file()

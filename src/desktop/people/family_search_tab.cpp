@@ -85,6 +85,7 @@ void FamilySearchTab::set_up_list()
 {
     m_groups->setObjectName(u"family_group"_s);
     m_groups->setAccessibleName(u"Which family group"_s);
+    m_groups->setSizeAdjustPolicy(QComboBox::AdjustToContents);
     m_families->replace_filter(m_groups);
     connect(m_families, &FamilyListWidget::opened, this, &FamilySearchTab::open);
     connect(m_families, &FamilyListWidget::looked_at, this, &FamilySearchTab::look);

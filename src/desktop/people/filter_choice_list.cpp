@@ -112,7 +112,7 @@ void FilterChoiceList::select(int row)
 {
     const bool none = m_model->rowCount() == 0;
     if (m_model->empty())
-        m_empty->say(u"This list is empty"_s, u"Its items are made on the page Setup Lists."_s);
+        m_empty->say(u"This list is empty"_s, m_when_empty);
     else if (none)
         m_empty->say(u"Nothing is called \u201c%1\u201d"_s.arg(m_line->text()), u"Shorten what is typed."_s);
     m_stack->setCurrentIndex(none ? 1 : 0);

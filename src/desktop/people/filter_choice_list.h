@@ -26,6 +26,8 @@ public:
 
     /// The chosen item and the typed words stay.
     void set_items(std::vector<people::FilterItem> items);
+    /// How a list without any item gets some.
+    void say_when_empty(const QString& next_step) { m_when_empty = next_step; }
     void forget_typed();
     void refresh() { m_model->refresh(); }
     /// Null when none is chosen.
@@ -55,6 +57,7 @@ private:
     QTableView* m_table;
     QStackedWidget* m_stack;
     EmptyPanel* m_empty;
+    QString m_when_empty = QStringLiteral("Its items are made on the page Setup Lists.");
 };
 
 } // namespace kindrel::desktop

@@ -171,6 +171,7 @@ FilterFusionsPart::FilterFusionsPart(Desk& desk, people::Filter& filter)
           return applied(fusion.item) ? ChoiceUse{u"include"_s, State::contact, u"list-add"_s} : ChoiceUse{};
       }))
 {
+    m_list->say_when_empty(u"Fusions are made on the page Filter Fusion."_s);
     connect(m_list, &FilterChoiceList::step_wanted, this, [this] {
         const FilterItem* fusion = m_list->chosen();
         turn(fusion && !applied(fusion->item));

@@ -12,9 +12,9 @@ namespace kindrel::desktop {
 struct FoundPerson
 {
     int surname_id = 0;
-    QString name; ///< With markers.
-    QString family;
-    QString suburb;
+    QString name = {}; ///< With markers.
+    QString family = {};
+    QString suburb = {};
     State state = State::plain;
 };
 

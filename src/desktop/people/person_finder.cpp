@@ -9,6 +9,8 @@
 #include <QListWidget>
 #include <QVBoxLayout>
 
+#include <algorithm>
+
 namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;

@@ -12,6 +12,8 @@ class PinField : public QWidget
 public:
     explicit PinField(EditorBench& bench);
     void show_file();
+    /// They stand beneath the field, where there is more room.
+    [[nodiscard]] QWidget* buttons() { return m_buttons; }
 
 private:
     void take_new();
@@ -19,6 +21,7 @@ private:
     EditorBench& m_bench;
     FieldLink<QString> m_link;
     TypedLine* m_pin;
+    QWidget* m_buttons;
 };
 
 } // namespace kindrel::desktop

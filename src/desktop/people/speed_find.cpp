@@ -25,10 +25,10 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr QSize window_size{720, 384};
+constexpr QSize window_size{760, 384};
 constexpr int below_top = 72;
 constexpr int most_shown = 100;
-constexpr std::array column_shares{20, 36, 17, 14, 13};
+constexpr std::array column_shares{19, 33, 16, 17, 15};
 
 bool is_enter(int key)
 {
@@ -86,9 +86,8 @@ void SpeedFindWindow::set_up_list()
     m_view->setModel(m_model);
     make_row_list(*m_view);
     m_view->horizontalHeader()->hide();
-    m_view->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
-    for (std::size_t column = 0; column < column_shares.size(); ++column)
-        m_view->setColumnWidth(int(column), window_size.width() * column_shares[column] / 100);
+    m_view->horizontalHeader()->setObjectName(u"speed_find"_s);
+    follow(m_desk.remembered, *m_view->horizontalHeader(), column_shares);
     m_view->installEventFilter(this);
     connect(m_view, &QTableView::clicked, this, &SpeedFindWindow::open_chosen);
     m_stack->addWidget(m_view);

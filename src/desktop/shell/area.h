@@ -1,6 +1,6 @@
 #pragma once
 
-#include "core/rights.h"
+#include "core/entry.h"
 #include "desktop/shell/desk.h"
 
 #include <optional>
@@ -23,7 +23,7 @@ struct AreaDefinition
     const char* key;
     const char* title;
     const char* icon;
-    std::optional<core::Area> right; ///< Nothing: open to everybody.
+    std::optional<core::AreaId> area; ///< Whose rights open it; nothing: open to everybody.
     Parked parked;
     /// Null, after saying why, when the area cannot be entered.
     Page* (*make)(Desk&);

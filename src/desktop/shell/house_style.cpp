@@ -54,7 +54,7 @@ int HouseStyle::pixelMetric(PixelMetric metric, const QStyleOption* option, cons
     case PM_TabBarTabHSpace:
         return space::margin;
     case PM_HeaderMargin:
-        return 6;
+        return 4;
     case PM_ScrollBarExtent:
         return 12;
     default:

@@ -56,7 +56,7 @@ MainWindow::MainWindow(Desk& desk, std::span<const AreaDefinition> areas, Look& 
 
 bool MainWindow::granted(const AreaDefinition& area) const
 {
-    return !area.right || m_desk.office.may(*area.right);
+    return !area.area || core::may_enter(m_desk.office, *area.area);
 }
 
 void MainWindow::add_areas()
