@@ -349,7 +349,8 @@ void offer_stale_locks(Office& office)
                                    "them?"_s.arg(product),
                            .more = lines.join(u'\n'),
                            .icon = Icon::question};
-    if (office.dialogue.confirm(question, Answer::no))
+    // Where nobody else can be in the church, nobody can be hurt by it.
+    if (office.dialogue.confirm(question, office.shared() ? Answer::no : Answer::yes))
         locks.release_stale();
 }
 

@@ -30,7 +30,7 @@ protected:
         settle();
     }
     void close_page() { press(window(), Qt::Key_W, Qt::ControlModifier); }
-    [[nodiscard]] bool in_page() { return window().page()->objectName() == u"network"_s; }
+    [[nodiscard]] bool in_page() { return window().page()->objectName() == u"setup_Networking"_s; }
     void tab_to(const QString& name)
     {
         for (int step = 0; step < 30 && window().focusWidget()->objectName() != name; ++step)

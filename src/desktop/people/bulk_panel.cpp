@@ -158,8 +158,10 @@ void BulkPanel::choose_kind(int row)
 {
     const TagKind kind = kind_rows[std::size_t(row)].kind;
     m_known = people::read_setup_items(*m_desk.office.session, kind_rows[std::size_t(row)].list);
-    if (kind != m_item.kind)
+    if (kind != m_item.kind) {
         m_item.item = 0;
+        m_filter->clear();
+    }
     m_item.kind = kind;
     auto* form = static_cast<QFormLayout*>(m_details->layout());
     form->setRowVisible(m_state, kind == TagKind::ministry);

@@ -68,13 +68,14 @@ FilterDates::FilterDates(Desk& desk, people::Filter& filter)
         m_span->addItem(QString::fromLatin1(words));
     for (int month = 1; month <= months; ++month)
         m_month->addItem(QLocale::c().monthName(month));
-    for (QComboBox* box : {m_source, m_span})
-        connect(box, &QComboBox::currentIndexChanged, this, &FilterDates::show_fields);
+    connect(m_source, &QComboBox::currentIndexChanged, this, &FilterDates::fill_items);
+    connect(m_span, &QComboBox::currentIndexChanged, this, &FilterDates::show_span);
     for (End& end : m_ends) {
         connect(end.field, &DateField::entered, this, [&end](std::optional<core::Date> day) { end.day = day; });
         connect(end.field, &DateField::returnPressed, this, &FilterDates::add);
     }
-    show_fields();
+    fill_items();
+    show_span();
 }
 
 void FilterDates::fill_sources()
@@ -148,7 +149,7 @@ DateSpan FilterDates::span() const
     return DateSpan(m_span->currentIndex());
 }
 
-void FilterDates::show_fields()
+void FilterDates::fill_items()
 {
     m_item->clear();
     m_item->addItem(u"All kinds"_s, 0);
@@ -156,6 +157,10 @@ void FilterDates::show_fields()
         for (const auto& stored : people::read_setup_items(*desk().office.session, *list))
             m_item->addItem(stored.text, stored.key);
     m_form->setRowVisible(m_item, list_of(source()).has_value());
+}
+
+void FilterDates::show_span()
+{
     m_form->setRowVisible(m_month, span() == DateSpan::month);
     for (const End& end : m_ends)
         m_form->setRowVisible(end.field, span() != DateSpan::month);
@@ -207,7 +212,7 @@ void FilterDates::show_filter()
 void FilterDates::reload()
 {
     const int item = m_item->currentData().toInt();
-    show_fields();
+    fill_items();
     m_item->setCurrentIndex(std::max(0, m_item->findData(item)));
     show_filter();
 }

@@ -40,7 +40,8 @@ private:
     [[nodiscard]] QVBoxLayout* make_form();
     void fill_sources();
     void add_row(QFormLayout& form, const QString& caption, QWidget* field, const QString& name);
-    void show_fields();
+    void fill_items();
+    void show_span();
     [[nodiscard]] people::DateSource source() const;
     [[nodiscard]] people::DateSpan span() const;
     void add();

@@ -19,7 +19,7 @@ namespace {
 
 constexpr int place_role = Qt::UserRole;
 constexpr int most_found = 50;
-constexpr int rows_in_sight = 6;
+constexpr int most_in_sight = 8;
 
 } // namespace
 
@@ -35,7 +35,6 @@ PersonFinder::PersonFinder(Desk& desk) : m_desk(desk), m_line(new QLineEdit), m_
     m_found->setAccessibleName(u"People who answer"_s);
     m_found->setUniformItemSizes(true);
     m_found->setFocusPolicy(Qt::ClickFocus);
-    m_found->setFixedHeight(rows_in_sight * row_height());
     m_found->hide();
     connect(m_line, &QLineEdit::textChanged, this, &PersonFinder::find);
     connect(m_found, &QListWidget::itemClicked, this, &PersonFinder::take);
@@ -85,6 +84,8 @@ void PersonFinder::find(const QString& typed)
         (new QListWidgetItem(u"Nobody answers to this"_s, m_found))->setFlags(Qt::NoItemFlags);
     else
         m_found->setCurrentRow(0);
+    const int rows = std::min(m_found->count(), most_in_sight);
+    m_found->setFixedHeight(rows * m_found->sizeHintForRow(0) + 2 * m_found->frameWidth());
 }
 
 void PersonFinder::take()

@@ -53,7 +53,7 @@ TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
     m_views->addWidget(make_bench());
     auto* content = new QWidget;
     auto* column = new QVBoxLayout(content);
-    column->setContentsMargins(space::group, 0, space::group, space::margin);
+    column->setContentsMargins(space::group, space::field / 2, space::group, space::margin);
     column->setSpacing(space::margin);
     column->addWidget(m_bar);
     column->addWidget(m_views, 1);
@@ -186,9 +186,9 @@ void TaggingPage::make_list()
 void TaggingPage::tagged(const people::BulkChange& change)
 {
     m_change = change;
-    const QString words =
-        change.act == people::TagAct::give ? u"\u201c%1\u201d was given: %2."_s : u"\u201c%1\u201d was taken: %2."_s;
-    note().offer(words.arg(change.item.text, change.count.words()), u"Undo"_s, [this] { take_back(); });
+    const bool given = change.act == people::TagAct::give;
+    const QString words = given ? u"\u201c%1\u201d was given to %2."_s : u"\u201c%1\u201d was taken from %2."_s;
+    note().offer(words.arg(change.item.text, people_words(change.count.changed)), u"Undo"_s, [this] { take_back(); });
 }
 
 void TaggingPage::take_back()
