@@ -10,6 +10,7 @@
 #include "core/sqlite_session.h"
 #include "core/system_workstation.h"
 #include "people/list_plan.h"
+#include "people/search_words.h"
 #include "people/tagging.h"
 #include "sample/church.h"
 
@@ -165,6 +166,10 @@ void print_alone(const std::string& what, const Work& work)
 void bench_waiting(Church& church, const std::string& engine)
 {
     print_alone("the list of the active people" + engine, [&] { (void)people::make_list(church.office, church.plan); });
+    print_alone("everybody, for adding by hand" + engine, [&] {
+        for (const auto& person : people::everybody(*church.office.session, false))
+            (void)people::search_words(person.name + u' ' + person.surname);
+    });
     print_alone("the line that tells beforehand" + engine, [&] {
         (void)people::count_tagging(church.office, church.list, item_of(people::TagKind::status), people::TagAct::give);
     });

@@ -9,6 +9,7 @@
 #include "people/address_book.h"
 
 #include <QApplication>
+#include <QLineEdit>
 #include <QPushButton>
 #include <QTabWidget>
 #include <QTextStream>
@@ -92,12 +93,25 @@ void take_reports(desktop::Running& running, Camera& camera)
         camera.take(*window, u"preview"_s);
 }
 
-void take_setup_areas(desktop::Running& running, Camera& camera)
+void take_areas(desktop::Running& running, Camera& camera, const QStringList& keys)
 {
-    for (const auto& key : {u"setup"_s, u"security"_s, u"network"_s}) {
+    for (const auto& key : keys) {
         open_area(running, key);
         camera.take(*running.window(), key);
     }
+}
+
+void take_speed_find(desktop::Running& running, Camera& camera)
+{
+    running.find_family();
+    QApplication::processEvents();
+    auto* window = running.window()->findChild<QWidget*>(u"speed_find"_s);
+    if (!window)
+        return;
+    if (auto* words = window->findChild<QLineEdit*>(u"words"_s))
+        words->setText(u"a"_s);
+    camera.take(*window, u"speed_find"_s);
+    window->hide();
 }
 
 void take_dialog(QDialog& dialog, Camera& camera)
@@ -160,7 +174,9 @@ int take_pictures(desktop::Running& running, desktop::Look& look, const QString&
     take_cards(*running.desk(), camera);
     take_editor(running, camera);
     take_reports(running, camera);
-    take_setup_areas(running, camera);
+    take_areas(running, camera,
+               {u"search"_s, u"filters"_s, u"tagging"_s, u"setup"_s, u"fusions"_s, u"security"_s, u"network"_s});
+    take_speed_find(running, camera);
     take_dialogs(running.desk()->office, camera);
     open_area(running, u"main_menu"_s);
     running.window()->resize(narrow_window);

@@ -1,14 +1,11 @@
 #include "people/family_json.h"
 
 #include "people/fields.h"
-
-#include <QJsonArray>
+#include "people/record_json.h"
 
 namespace kindrel::people {
 
-namespace {
-
-// Each record is described once, for the Writer and the Reader alike.
+// Each record is described once, for the writer and the reader alike.
 
 template <class Side, class Record>
 void describe_fields(Side& side, Record& record, std::span<const Field<Record>> fields)
@@ -109,127 +106,17 @@ void describe(Side& side, FamilyFile& file)
     side.member("people", file.people);
 }
 
-template <class Value>
-concept Code = std::is_enum_v<Value>;
-
-/// Collects a record's members. Changes none of them: they are taken as the descriptions hand them out.
-class Writer
-{
-public:
-    template <class Value>
-    void member(const char* name, Value& value)
-    {
-        m_object.insert(QString::fromLatin1(name), json(value));
-    }
-    template <class Record>
-    [[nodiscard]] static QJsonObject json(Record& record)
-    {
-        Writer writer;
-        describe(writer, record);
-        return writer.m_object;
-    }
-
-private:
-    static QJsonValue json(int& number) { return number; }
-    static QJsonValue json(bool& flag) { return flag; }
-    static QJsonValue json(QString& text) { return text; }
-    static QJsonValue json(core::Date& date) { return date.valid() ? QJsonValue(date.stored()) : QJsonValue(); }
-    static QJsonValue json(Code auto& code) { return static_cast<int>(code); }
-    template <class Inner>
-    static QJsonValue json(std::optional<Inner>& maybe)
-    {
-        return maybe ? QJsonValue(json(*maybe)) : QJsonValue();
-    }
-    template <class Record>
-    static QJsonValue json(std::vector<Record>& list)
-    {
-        QJsonArray array;
-        for (auto& record : list)
-            array.append(json(record));
-        return array;
-    }
-
-    QJsonObject m_object;
-};
-
-/// Fills a record; false once a member is missing or of another kind.
-class Reader
-{
-public:
-    template <class Value>
-    void member(const char* name, Value& value)
-    {
-        m_good = m_good && read(m_object.value(QLatin1StringView(name)), value);
-    }
-    template <class Record>
-    [[nodiscard]] static bool read(const QJsonValue& json, Record& record)
-    {
-        Reader reader(json.toObject());
-        describe(reader, record);
-        return reader.m_good;
-    }
-
-private:
-    explicit Reader(QJsonObject object) : m_object(std::move(object)) {}
-
-    static bool read(const QJsonValue& json, int& number)
-    {
-        number = json.toInt();
-        return json.isDouble();
-    }
-    static bool read(const QJsonValue& json, bool& flag)
-    {
-        flag = json.toBool();
-        return json.isBool();
-    }
-    static bool read(const QJsonValue& json, QString& text)
-    {
-        text = json.toString();
-        return json.isString();
-    }
-    static bool read(const QJsonValue& json, core::Date& date)
-    {
-        const auto found = core::Date::from_stored(json.toString());
-        date = found.value_or(core::Date{});
-        return found.has_value();
-    }
-    static bool read(const QJsonValue& json, Code auto& code)
-    {
-        code = static_cast<std::remove_reference_t<decltype(code)>>(json.toInt());
-        return json.isDouble();
-    }
-    template <class Inner>
-    static bool read(const QJsonValue& json, std::optional<Inner>& maybe)
-    {
-        return json.isNull() || read(json, maybe.emplace());
-    }
-    template <class Record>
-    static bool read(const QJsonValue& json, std::vector<Record>& list)
-    {
-        for (const auto& element : json.toArray()) {
-            if (!read(element, list.emplace_back()))
-                return false;
-        }
-        return json.isArray();
-    }
-
-    QJsonObject m_object;
-    bool m_good = true;
-};
-
-} // namespace
-
 QJsonObject to_json(const FamilyFile& file)
 {
-    // The descriptions serve the Reader too and so take what may be changed.
+    // The descriptions serve the reader too and so take what may be changed.
     auto copy = file;
-    return Writer::json(copy);
+    return JsonWriter::json(copy);
 }
 
 std::optional<FamilyFile> family_from_json(const QJsonObject& object)
 {
     FamilyFile file;
-    return Reader::read(object, file) ? std::optional(std::move(file)) : std::nullopt;
+    return JsonReader::read(object, file) ? std::optional(std::move(file)) : std::nullopt;
 }
 
 } // namespace kindrel::people

@@ -131,8 +131,9 @@ Value filling(const Field& field, int number)
 {
     if (field.type == u"TEXT")
         return to_value(u"2007-06-0%1"_s.arg(number));
-    const bool key = field.in_key || named_after_a_key(field.name) || field.name.endsWith(u"position");
-    return to_value(key ? number : flag_values[static_cast<std::size_t>(number - 1)]);
+    const bool never_zero = field.in_key || named_after_a_key(field.name) || field.name.endsWith(u"position") ||
+                            field.name == u"school_year";
+    return to_value(never_zero ? number : flag_values[static_cast<std::size_t>(number - 1)]);
 }
 
 void fill_table(Session& session, const Relation& table)

@@ -9,7 +9,6 @@
 
 #include <QComboBox>
 #include <QHeaderView>
-#include <QLineEdit>
 #include <QTableView>
 
 namespace kindrel::test {

@@ -25,7 +25,7 @@ protected:
                family(u"Nash"_s, {u"Carl"_s})});
         press(window(), Qt::Key_K, Qt::ControlModifier);
     }
-    [[nodiscard]] SpeedFindWindow& popup() { return child<SpeedFindWindow>(window(), u"speed_find"_s); }
+    [[nodiscard]] SpeedFindWindow& popup() { return child<SpeedFindWindow>(window(), u"find"_s); }
     [[nodiscard]] QLineEdit& words() { return child<QLineEdit>(popup(), u"words"_s); }
     [[nodiscard]] QTableView& hits() { return child<QTableView>(popup(), u"hit_list"_s); }
     [[nodiscard]] QStringList shown()

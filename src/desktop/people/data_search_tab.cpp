@@ -33,6 +33,7 @@ DataSearchTab::DataSearchTab(Desk& desk)
     : m_desk(desk), m_parts(new QListWidget), m_model(new DataSearchModel(Unlisted::shown, this)),
       m_view(new QTableView), m_empty(new EmptyPanel), m_stack(new QStackedWidget), m_count(new QLabel)
 {
+    setObjectName(u"data_search"_s);
     set_up_parts();
     set_up_list();
     m_count->setObjectName(u"data_count"_s);
@@ -43,7 +44,7 @@ DataSearchTab::DataSearchTab(Desk& desk)
     column->addWidget(m_stack, 1);
     column->addWidget(m_count);
     auto* splitter = new QSplitter;
-    splitter->setObjectName(u"data_search"_s);
+    splitter->setObjectName(u"data_search_parts"_s);
     splitter->setChildrenCollapsible(false);
     splitter->setHandleWidth(space::margin);
     splitter->addWidget(m_parts);

@@ -32,9 +32,9 @@ struct PartRow
 
 constexpr std::array part_rows{
     PartRow{&HeadParts::date, "title_date", "The &date"},
-    PartRow{&HeadParts::filters, "title_filters", "The f&ilters in use"},
-    PartRow{&HeadParts::church, "title_church", "The &church's name"},
-    PartRow{&HeadParts::logo, "title_logo", "The &logo"},
+    PartRow{&HeadParts::filters, "title_filters", "The fi&lters in use"},
+    PartRow{&HeadParts::church, "title_church", "The church's na&me"},
+    PartRow{&HeadParts::logo, "title_logo", "The lo&go"},
 };
 
 struct TextRow

@@ -28,8 +28,8 @@ struct NeedRow
 
 constexpr std::array need_rows{
     NeedRow{&Needs::address, "needs_address", "an &address", std::nullopt},
-    NeedRow{&Needs::phone, "needs_phone", "a phone &number", std::nullopt},
-    NeedRow{&Needs::email, "needs_email", "an &e-mail address", std::nullopt},
+    NeedRow{&Needs::phone, "needs_phone", "a phone n&umber", std::nullopt},
+    NeedRow{&Needs::email, "needs_email", "an e-&mail address", std::nullopt},
     NeedRow{&Needs::birth_date, "needs_birth_date", "a &birth date", core::Area::birth_dates},
 };
 
@@ -54,10 +54,10 @@ RangePanel::RangePanel(TaggingSheet& sheet) : StepPanel(sheet, u"Range"_s)
     auto* rows = new QGridLayout;
     rows->setSpacing(space::field);
     column->addLayout(rows);
-    m_first_letter = make_line(u"first_letter"_s, *rows, u"Surnames &from"_s);
+    m_first_letter = make_line(u"first_letter"_s, *rows, u"Surna&mes from"_s);
     m_last_letter = make_line(u"last_letter"_s, *rows, u"up &to"_s);
     m_first = make_line(u"first_place"_s, *rows, u"Pl&aces from"_s);
-    m_last = make_line(u"last_place"_s, *rows, u"up t&o"_s);
+    m_last = make_line(u"last_place"_s, *rows, u"&up to"_s);
     for (QLineEdit* place : {m_first, m_last})
         place->setValidator(new QIntValidator(1, most_places, place));
     for (QLineEdit* line : {m_first_letter, m_last_letter, m_first, m_last})

@@ -22,7 +22,7 @@ SearchPage* SearchPage::open(Desk& desk)
 SearchPage::SearchPage(Desk& desk, core::AreaEntry entry)
     : Page(u"Search"_s), m_desk(desk), m_entry(std::move(entry)), m_tabs(new QTabWidget)
 {
-    setObjectName(u"search"_s);
+    setObjectName(u"Search"_s);
     m_tabs->setObjectName(u"searches"_s);
     m_tabs->setDocumentMode(true);
     add_tab<FamilySearchTab>(u"Families"_s);

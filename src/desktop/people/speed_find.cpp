@@ -43,7 +43,7 @@ SpeedFindWindow::SpeedFindWindow(Desk& desk, QWidget& over)
       m_stack(new QStackedWidget), m_count(new QLabel),
       m_add(new QPushButton(icon(u"list-add"_s), u"&Add a new family"_s))
 {
-    setObjectName(u"speed_find"_s);
+    setObjectName(u"find"_s);
     setWindowTitle(u"Find a family"_s);
     set_up_words();
     set_up_list();

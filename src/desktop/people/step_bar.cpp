@@ -28,7 +28,7 @@ constexpr std::array<StepRow, StepBar::step_count> step_rows{{
     {"title", "T&itle", "What heads a report"},
     {"format", "F&ormat", "Paper and text size of a report"},
     {"suppress", "Su&ppress", "Leave out people without an address, a phone number and so on"},
-    {"process", "Pro&cess", "Make a report, or give the people something or take it from them"},
+    {"process", "Proc&ess", "Make a report, or give the people something or take it from them"},
 }};
 
 } // namespace

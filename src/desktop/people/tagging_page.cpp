@@ -36,7 +36,7 @@ TaggingPage* TaggingPage::open(Desk& desk)
 
 TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
     : Page(u"Tagging"_s), m_desk(desk), m_entry(std::move(entry)), m_bar(new StepBar), m_filter(new FilterPanel(desk)),
-      m_list(new WorkingListView(desk, m_sheet, note())), m_views(new QStackedWidget), m_panels(new QStackedWidget),
+      m_list(new WorkingListView(desk, m_sheet)), m_views(new QStackedWidget), m_panels(new QStackedWidget),
       m_pause(new QTimer(this))
 {
     setObjectName(u"Tagging"_s);
@@ -48,6 +48,8 @@ TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
         m_process->set_list(m_list->list());
         set_status(m_list->count_words());
     });
+    connect(m_list, &WorkingListView::told, this, [this](const QString& words) { note().say(words); });
+    connect(m_list, &WorkingListView::changed_by_hand, this, &TaggingPage::offer_undo);
     add_panels();
     m_views->addWidget(m_filter);
     m_views->addWidget(make_bench());
@@ -60,6 +62,7 @@ TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
     set_content(content);
     add_keys();
     add_actions();
+    sheet_changed();
 }
 
 void TaggingPage::add_panels()
@@ -185,28 +188,37 @@ void TaggingPage::make_list()
 
 void TaggingPage::tagged(const people::BulkChange& change)
 {
-    m_change = change;
     const bool given = change.act == people::TagAct::give;
     const QString words = given ? u"\u201c%1\u201d was given to %2."_s : u"\u201c%1\u201d was taken from %2."_s;
-    note().offer(words.arg(change.item.text, people_words(change.count.changed)), u"Undo"_s, [this] { take_back(); });
+    offer_undo(words.arg(change.item.text, people_words(change.count.changed)), [this, change] { untag(change); });
 }
 
-void TaggingPage::take_back()
+void TaggingPage::untag(const people::BulkChange& change)
 {
-    if (!m_change)
-        return;
-    const auto change = std::exchange(m_change, std::nullopt);
     int stay = 0;
     try {
-        stay = people::undo_tagging(m_desk.office, *change);
+        stay = people::undo_tagging(m_desk.office, change);
     } catch (const core::DatabaseError& error) {
-        m_change = change;
         m_desk.office.dialogue.show({u"The change could not be taken back."_s, error.text()});
-        return;
+        return tagged(change);
     }
     m_process->set_list(m_list->list());
     note().say(stay == 0 ? u"The change was taken back."_s
                          : u"The change was taken back; %1 changed since stay as they are."_s.arg(people_words(stay)));
+}
+
+void TaggingPage::offer_undo(const QString& words, const std::function<void()>& undo)
+{
+    m_undo = undo;
+    note().offer(words, u"Undo"_s, [this] { take_back(); });
+}
+
+void TaggingPage::take_back()
+{
+    if (!m_undo)
+        return;
+    note().clear();
+    std::exchange(m_undo, {})();
 }
 
 } // namespace kindrel::desktop

@@ -7,6 +7,8 @@
 #include "desktop/shell/page.h"
 #include "people/tagging.h"
 
+#include <functional>
+
 class QStackedWidget;
 class QTimer;
 
@@ -45,12 +47,15 @@ private:
     void sheet_changed();
     void make_list();
     void tagged(const people::BulkChange& change);
+    void untag(const people::BulkChange& change);
+    /// In the note bar and by Ctrl+Z, until something else is done.
+    void offer_undo(const QString& words, const std::function<void()>& undo);
     void take_back();
 
     Desk& m_desk;
     core::AreaEntry m_entry;
     TaggingSheet m_sheet;
-    std::optional<people::BulkChange> m_change; ///< The last one, while it can be taken back.
+    std::function<void()> m_undo;
     StepBar* m_bar;
     FilterPanel* m_filter;
     WorkingListView* m_list;

@@ -4,7 +4,6 @@
 #include "desktop/output/list_report.h"
 #include "desktop/people/working_people.h"
 #include "desktop/shell/look.h"
-#include "desktop/shell/note_bar.h"
 #include "desktop/shell/table_text.h"
 
 #include <QHBoxLayout>
@@ -22,9 +21,9 @@ const QString list_title = u"People of the list"_s;
 
 } // namespace
 
-WorkingListView::WorkingListView(Desk& desk, TaggingSheet& sheet, NoteBar& note)
-    : m_desk(desk), m_sheet(sheet), m_note(note), m_state(new QLabel),
-      m_as_filtered(new QPushButton(u"As f&iltered"_s)), m_people(new WorkingPeople(desk))
+WorkingListView::WorkingListView(Desk& desk, TaggingSheet& sheet)
+    : m_desk(desk), m_sheet(sheet), m_state(new QLabel), m_as_filtered(new QPushButton(u"As filtered"_s)),
+      m_people(new WorkingPeople(desk))
 {
     m_state->setObjectName(u"state"_s);
     m_state->setTextFormat(Qt::PlainText);
@@ -86,7 +85,7 @@ void WorkingListView::change_by_hand(const QString& words, const std::function<v
     const auto before = m_sheet.plan;
     change();
     make();
-    m_note.offer(words, u"Undo"_s, [this, added = before.added, struck = before.struck] {
+    Q_EMIT changed_by_hand(words, [this, added = before.added, struck = before.struck] {
         m_sheet.plan.added = added;
         m_sheet.plan.struck = struck;
         make();
@@ -97,7 +96,7 @@ void WorkingListView::add(const people::ListedPerson& person)
 {
     const auto& there = m_made.list.members;
     if (std::ranges::find(there, person.member.person_id, &people::Member::person_id) != there.end())
-        return m_note.say(u"%1 %2 is on the list already."_s.arg(person.name, person.surname));
+        return Q_EMIT told(u"%1 %2 is on the list already."_s.arg(person.name, person.surname));
     change_by_hand(u"%1 %2 was added to the list."_s.arg(person.name, person.surname),
                    [&] { people::add_by_hand(m_sheet.plan, person.member); });
 }

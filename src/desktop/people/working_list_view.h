@@ -10,7 +10,6 @@ class QPushButton;
 
 namespace kindrel::desktop {
 
-class NoteBar;
 class WorkingPeople;
 
 /// The working list under the sentence that made it. People are added and struck by hand, which can be taken back.
@@ -19,7 +18,7 @@ class WorkingListView : public QWidget
     Q_OBJECT
 
 public:
-    WorkingListView(Desk& desk, TaggingSheet& sheet, NoteBar& note);
+    WorkingListView(Desk& desk, TaggingSheet& sheet);
 
     [[nodiscard]] const people::WorkingList& list() const { return m_made.list; }
     /// "84 people".
@@ -33,6 +32,9 @@ public:
 
 Q_SIGNALS:
     void made();
+    void told(const QString& words);
+    /// The list was changed by hand, which `undo` takes back.
+    void changed_by_hand(const QString& words, const std::function<void()>& undo);
 
 private:
     [[nodiscard]] bool can_make() const;
@@ -44,7 +46,6 @@ private:
 
     Desk& m_desk;
     TaggingSheet& m_sheet;
-    NoteBar& m_note;
     people::MadeList m_made;
     QLabel* m_state;
     QPushButton* m_as_filtered;

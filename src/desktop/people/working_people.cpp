@@ -15,7 +15,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr std::array column_shares{45, 32, 23};
+constexpr std::array column_shares{42, 30, 28};
 
 } // namespace
 

@@ -23,6 +23,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+constexpr std::size_t areas_with_keys = 9;
 constexpr int narrow_below = 900;
 constexpr QSize first_size{1024, 690};
 constexpr QSize least_size{720, 480};
@@ -64,15 +65,15 @@ void MainWindow::add_areas()
     for (std::size_t place = 0; place < m_areas.size(); ++place) {
         const AreaDefinition& area = m_areas[place];
         auto* button = m_rail->add_area(QString::fromLatin1(area.icon), QString::fromLatin1(area.title));
-        const QKeySequence key(Qt::CTRL | Qt::Key(Qt::Key_1 + place));
         button->setObjectName(QString::fromLatin1(area.key));
         button->setEnabled(granted(area));
-        button->set_tip(granted(area) ? u"%1 (%2)"_s.arg(button->text(), key.toString(QKeySequence::NativeText))
-                                      : u"Your password does not open this area"_s);
-        if (place < 9) {
-            auto* shortcut = new QShortcut(key, this);
-            connect(shortcut, &QShortcut::activated, this, [this, place] { open_place(place); });
-        }
+        button->set_tip(granted(area) ? button->text() : u"Your password does not open this area"_s);
+        if (place >= areas_with_keys)
+            continue;
+        const QKeySequence key(Qt::CTRL | Qt::Key(Qt::Key_1 + place));
+        if (granted(area))
+            button->set_tip(u"%1 (%2)"_s.arg(button->text(), key.toString(QKeySequence::NativeText)));
+        connect(new QShortcut(key, this), &QShortcut::activated, this, [this, place] { open_place(place); });
     }
     connect(m_rail, &Rail::chosen, this, [this](int place) { open_place(std::size_t(place)); });
     connect(m_stack, &PageStack::came_forward, this, [this](std::size_t place) {
