@@ -5,6 +5,7 @@
 #include "desktop/people/family_card.h"
 #include "desktop/people/group_details_dialog.h"
 #include "desktop/people/quick_add_dialogs.h"
+#include "desktop/people/speed_find.h"
 #include "desktop/shell/main_window.h"
 #include "people/address_book.h"
 
@@ -105,7 +106,7 @@ void take_speed_find(desktop::Running& running, Camera& camera)
 {
     running.find_family();
     QApplication::processEvents();
-    auto* window = running.window()->findChild<QWidget*>(u"speed_find"_s);
+    auto* window = running.window()->findChild<desktop::SpeedFindWindow*>();
     if (!window)
         return;
     if (auto* words = window->findChild<QLineEdit*>(u"words"_s))

@@ -37,7 +37,6 @@ struct Header
 struct Footer
 {
     QString title;
-    QString note;
     Statement vision;
     qreal line = 0; ///< Above everything; 0 for none.
 };
@@ -91,8 +90,7 @@ Footer footer_of(const ReportInput& input, const QString& title, const pages::Ty
     if (settings.include_vision_footer)
         lines = {settings.footer_vision, settings.footer_vision_line2};
     lines.removeAll(QString());
-    const QString note = input.options.hidden_details ? hidden_details_note.toString() : QString();
-    return {title, note, statement(settings, lines.join(u'\n'), type.small), settings.footer_line ? thin_line : 0};
+    return {title, statement(settings, lines.join(u'\n'), type.small), settings.footer_line ? thin_line : 0};
 }
 
 void write_title(pages::Writer& place, const Header& header)
@@ -154,7 +152,7 @@ void write_footer(pages::Writer& band, const Footer& footer, int number)
     if (footer.line > 0)
         band.rule({.thickness = footer.line, .colour = pages::ink::black, .before = 0, .after = 3});
     write_vision(band, footer.vision);
-    band.spread(footer.title, footer.note, u"Page %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
+    band.spread(footer.title, {}, u"Page %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
 }
 
 } // namespace

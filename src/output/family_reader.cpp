@@ -61,7 +61,7 @@ bool for_each_family(const ReportInput& input, core::Progress& progress,
     const auto keys = input.list.families();
     const auto listed = sorted_people(input.list);
     auto disclosure = people::Disclosure::of(input.office);
-    disclosure.hidden_details = input.options.hidden_details && input.office.may(core::Area::security);
+    disclosure.withheld = input.options.withheld;
     const ReportRun run(progress, static_cast<int>((keys.size() + families_at_once - 1) / families_at_once));
 
     for (std::size_t first = 0; first < keys.size(); first += families_at_once) {

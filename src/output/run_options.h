@@ -2,6 +2,7 @@
 
 #include "core/settings.h"
 #include "pages/page_setup.h"
+#include "people/disclosed.h"
 
 #include <optional>
 
@@ -29,12 +30,9 @@ struct RunOptions
     int text_percent = 100;             ///< Of the layout's own text size.
     QString title = {};                 ///< Empty: the report's own.
     std::optional<HeadParts> head = {}; ///< Unset: as the church has it.
-    bool hidden_details = false;        ///< Prints what is kept hidden too; needs the right to the security setup.
+    people::Details withheld = {};      ///< Left out beyond what is hidden anyway.
 
     friend bool operator==(const RunOptions&, const RunOptions&) = default;
 };
-
-/// Stands at the foot of every page that may hold hidden details.
-inline constexpr QStringView hidden_details_note = u"Holds unlisted details: for the office alone";
 
 } // namespace kindrel::output

@@ -63,6 +63,41 @@ void blank_hidden(Record& record, const Twins& twins)
     }
 }
 
+/// The hidden twins that a withheld kind of detail sets.
+template <class Record>
+struct Withheld
+{
+    Detail detail;
+    bool Record::*hidden;
+};
+
+constexpr std::array withheld_of_people{
+    Withheld<Person>{Detail::phones, &Person::mobile_hidden},
+    Withheld<Person>{Detail::phones, &Person::bussiness_phone_hidden},
+    Withheld<Person>{Detail::phones, &Person::Bussiness_fax_hidden},
+    Withheld<Person>{Detail::emails, &Person::email_hidden},
+    Withheld<Person>{Detail::emails, &Person::bussiness_email_hidden},
+    Withheld<Person>{Detail::birth_dates, &Person::birthdate_hidden},
+    Withheld<Person>{Detail::work, &Person::Bussiness_hidden},
+};
+constexpr std::array withheld_of_families{
+    Withheld<Address>{Detail::addresses, &Address::res_hidden},
+    Withheld<Address>{Detail::addresses, &Address::post_hidden},
+    Withheld<Address>{Detail::phones, &Address::phone_hidden},
+    Withheld<Address>{Detail::phones, &Address::family_mobile_hidden},
+    Withheld<Address>{Detail::phones, &Address::family_fax_hidden},
+    Withheld<Address>{Detail::emails, &Address::family_email_hidden},
+};
+
+template <class Record, class Rows>
+void hide(Record& record, const Rows& rows, const Details& withheld)
+{
+    for (const auto& [detail, hidden] : rows) {
+        if (withheld[static_cast<std::size_t>(detail)])
+            record.*hidden = true;
+    }
+}
+
 void blank_address(FamilyFile& file)
 {
     blank_hidden(file.address, address_twins);
@@ -74,12 +109,11 @@ void blank_address(FamilyFile& file)
 
 void blank_person(Person& person, const Disclosure& disclosure)
 {
-    const bool hides = !disclosure.hidden_details;
-    if (hides)
-        blank_hidden(person, person_twins);
-    if (hides && person.Bussiness_hidden)
+    hide(person, withheld_of_people, disclosure.withheld);
+    blank_hidden(person, person_twins);
+    if (person.Bussiness_hidden)
         person.occupations.clear();
-    if ((hides && person.birthdate_hidden) || !disclosure.birth_dates)
+    if (person.birthdate_hidden || !disclosure.birth_dates)
         person.birthdate.reset();
     if (!disclosure.pins)
         person.personal_pin.clear();
@@ -91,7 +125,7 @@ Disclosure Disclosure::of(const core::Office& office)
 {
     using core::Area;
     const bool pins = office.may(Area::full_financial) || office.may(Area::pin_financial_only);
-    return {office.settings.use_preferred_names, office.may(Area::birth_dates), pins, office.day_order()};
+    return {office.settings.use_preferred_names, office.may(Area::birth_dates), pins, office.day_order(), {}};
 }
 
 QString DisclosedFamily::name(const Person& person) const
@@ -104,8 +138,8 @@ DisclosedFamily disclose(FamilyFile file, const Disclosure& disclosure)
     DisclosedFamily disclosed;
     disclosed.m_use_preferred_names = disclosure.use_preferred_names;
     disclosed.m_day_order = disclosure.day_order;
-    if (!disclosure.hidden_details)
-        blank_address(file);
+    hide(file.address, withheld_of_families, disclosure.withheld);
+    blank_address(file);
     for (auto& person : file.people)
         blank_person(person, disclosure);
     disclosed.m_file = std::move(file);

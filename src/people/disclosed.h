@@ -3,7 +3,14 @@
 #include "core/office.h"
 #include "people/records.h"
 
+#include <bitset>
+
 namespace kindrel::people {
+
+/// Kinds of details that a single run can keep to itself, beyond what is hidden anyway.
+enum class Detail { addresses, phones, emails, birth_dates, work };
+inline constexpr int detail_count = 5;
+using Details = std::bitset<detail_count>;
 
 /// What a reader may see: the church's options and the user's rights.
 struct Disclosure
@@ -12,7 +19,7 @@ struct Disclosure
     bool birth_dates = true;
     bool pins = true;
     core::DayOrder day_order = core::DayOrder::day_first;
-    bool hidden_details = false; ///< What is hidden shows too, for the office's own eyes.
+    Details withheld = {};
 
     [[nodiscard]] static Disclosure of(const core::Office& office);
 };

@@ -100,8 +100,7 @@ MadeList make_list(core::Office& office, const ListPlan& plan)
 {
     auto& session = *office.session;
     const bool preferred = office.settings.use_preferred_names;
-    const auto found =
-        having(session, in_order(office, plan), plan.needs, plan.hidden_details && office.may(core::Area::security));
+    const auto found = having(session, in_order(office, plan), plan.needs);
     const QSet<int> struck(plan.struck.begin(), plan.struck.end());
     MadeList made;
     made.people = listed_people(session, found, preferred);

@@ -28,7 +28,6 @@ struct ListPlan
     SortOrder sort;
     ListRange range;
     Needs needs;
-    bool hidden_details = false;    ///< Hidden details meet the needs too; needs the right to the security setup.
     std::vector<Member> added = {}; ///< By hand.
     std::vector<int> struck = {};   ///< By hand: keys of people.
 };

@@ -81,14 +81,13 @@ constexpr std::array need_rows{
     NeedRow{&Needs::birth_date, u"a birth date"},
 };
 
-QString condition(bool Needs::*need, bool hidden_too)
+QString condition(bool Needs::*need)
 {
     QStringList alternatives;
     for (const auto& source : sources) {
         if (source.need != need)
             continue;
-        const auto value = u"%1 IS NOT NULL"_s.arg(QStringView(source.value));
-        alternatives += hidden_too ? value : u"(%1 AND %2=0)"_s.arg(value, QStringView(source.hidden));
+        alternatives += u"(%1 IS NOT NULL AND %2=0)"_s.arg(QStringView(source.value), QStringView(source.hidden));
     }
     return u'(' + alternatives.join(u" OR "_s) + u')';
 }
@@ -111,14 +110,14 @@ std::vector<ListedPerson> everybody(core::Session& session, bool use_preferred_n
         use_preferred_names);
 }
 
-WorkingList having(core::Session& session, const WorkingList& list, const Needs& needs, bool hidden_too)
+WorkingList having(core::Session& session, const WorkingList& list, const Needs& needs)
 {
     if (!needs.any())
         return list;
     QStringList conditions;
     for (const auto& row : need_rows) {
         if (needs.*row.need)
-            conditions += condition(row.need, hidden_too);
+            conditions += condition(row.need);
     }
     lend(session, list);
     auto rows = session.select(u"SELECT w.[person_id],w.[surname_id] FROM [work_people] w "

@@ -34,8 +34,8 @@ struct Needs
     friend bool operator==(const Needs&, const Needs&) = default;
 };
 
-/// Those of the list who have it all. What is kept hidden does not count unless `hidden_too`. One statement.
-[[nodiscard]] WorkingList having(core::Session& session, const WorkingList& list, const Needs& needs, bool hidden_too);
+/// Those of the list who have it all. What is kept hidden does not count. One statement.
+[[nodiscard]] WorkingList having(core::Session& session, const WorkingList& list, const Needs& needs);
 /// "with an address and a phone number"; empty without needs.
 [[nodiscard]] QString needs_words(const Needs& needs);
 

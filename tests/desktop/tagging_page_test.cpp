@@ -36,6 +36,7 @@ protected:
     {
         begin({born(family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s}), {{1990, 3, 20}, {1988, 7, 1}}),
                born(family(u"Smith"_s, {u"Cy"_s}), {{1970, 3, 4}}), family(u"Brown"_s, {u"Di"_s})});
+        place.in_database(u"UPDATE [tbl_address] SET [res_street]='3 Mill Lane';"_s);
         place.in_database(u"UPDATE [tbl_surname] SET [booked_out]=-1 WHERE [surname]='Smith';"_s);
         running->open_area(u"tagging"_s);
         settle();
@@ -276,13 +277,22 @@ TEST_F(TaggingPageTest, AReportIsMadeOfTheListAsTheStepsSay)
     EXPECT_FALSE(preview_holds(u"Brown"_s));
 }
 
-TEST_F(TaggingPageTest, UnlistedDetailsAreNotPrintedWithoutTheRight)
+TEST_F(TaggingPageTest, DetailsThatAreTickedAreLeftOutOfTheReport)
 {
-    desk().office.rights.set(core::Area::security, false);
+    push(u"process"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_TRUE(preview_holds(u"3 Mill Lane"_s));
+    for (auto* preview : desk().windows.all<desktop::PreviewWindow>())
+        preview->close();
+    settle();
+
     push(u"hidden"_s);
-    place.dialogue.expect_box(u"Your password does not give access to \"Security\""_s);
     press(window(), Qt::Key_Space);
-    EXPECT_FALSE(child<QAbstractButton>(bench(), u"hidden_details"_s).isChecked());
+    EXPECT_TRUE(child<QAbstractButton>(bench(), u"withhold_addresses"_s).isChecked());
+    push(u"process"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_TRUE(preview_holds(u"Naismith"_s));
+    EXPECT_FALSE(preview_holds(u"3 Mill Lane"_s));
 }
 
 TEST_F(TaggingPageTest, EveryStepFitsTheSmallestWindow)

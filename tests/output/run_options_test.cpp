@@ -25,8 +25,6 @@ protected:
     }
 };
 
-const QString unlisted_note = u"Holds unlisted details: for the office alone"_s;
-
 } // namespace
 
 TEST_F(RunOptionsTest, TheRunsOwnTitleAndHeadGoBeforeThoseOfReportAndChurch)
@@ -55,30 +53,18 @@ TEST_F(RunOptionsTest, TextGrowsAndShrinksWithItsPercentage)
     EXPECT_NEAR(size_of(u"Niels"_s), usual * 1.2, 0.01);
 }
 
-TEST_F(RunOptionsTest, HiddenDetailsArePrintedOnRequestWithANoteOnThePage)
+TEST_F(RunOptionsTest, WithheldDetailsAreLeftOutLikeHiddenOnes)
 {
-    auto hidden = full_family(true);
-    const QString street = hidden.address.res_street;
-    add({hidden});
-    EXPECT_FALSE(pdf_text().contains(street));
-    EXPECT_FALSE(pdf_text().contains(unlisted_note));
+    const auto open = full_family(false);
+    add({open});
+    EXPECT_TRUE(pdf_text().contains(open.address.res_street));
+    EXPECT_TRUE(pdf_text().contains(open.address.phone));
 
-    options.hidden_details = true;
-
-    EXPECT_TRUE(pdf_text().contains(street));
-    EXPECT_TRUE(pdf_text().contains(unlisted_note));
-}
-
-TEST_F(RunOptionsTest, HiddenDetailsNeedTheirRight)
-{
-    add({full_family(true)});
-    options.hidden_details = true;
-    office.rights.set(core::Area::security, false);
-    dialogue.expect_box(u"Your password does not give access to \"Security\""_s);
-    pages::PageSpool spool;
-
-    EXPECT_FALSE(run(spool));
-    EXPECT_EQ(spool.page_count(), 0);
+    options.withheld.set(static_cast<std::size_t>(people::Detail::addresses));
+    EXPECT_FALSE(pdf_text().contains(open.address.res_street));
+    EXPECT_TRUE(pdf_text().contains(open.address.phone));
+    options.withheld.set(static_cast<std::size_t>(people::Detail::phones));
+    EXPECT_FALSE(pdf_text().contains(open.address.phone));
 }
 
 } // namespace kindrel::test

@@ -1,6 +1,5 @@
 #include "desktop/people/layout_steps.h"
 
-#include "core/entry.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
 
@@ -37,6 +36,21 @@ constexpr std::array part_rows{
     PartRow{&HeadParts::logo, "title_logo", "The lo&go"},
 };
 
+struct DetailRow
+{
+    people::Detail detail;
+    const char* name;
+    const char* text;
+};
+
+constexpr std::array detail_rows{
+    DetailRow{people::Detail::addresses, "withhold_addresses", "&Addresses"},
+    DetailRow{people::Detail::phones, "withhold_phones", "Phone and fa&x numbers"},
+    DetailRow{people::Detail::emails, "withhold_emails", "E-mai&l addresses"},
+    DetailRow{people::Detail::birth_dates, "withhold_birth_dates", "&Birth dates"},
+    DetailRow{people::Detail::work, "withhold_work", "&Work and occupation"},
+};
+
 struct TextRow
 {
     int percent;
@@ -48,31 +62,26 @@ constexpr std::array text_rows{TextRow{85, "Small"}, TextRow{100, "As the report
 
 } // namespace
 
-HiddenPanel::HiddenPanel(Desk& desk, TaggingSheet& sheet)
-    : StepPanel(sheet, u"Hidden"_s), m_desk(desk), m_print(new QCheckBox(u"Print &unlisted details too"_s))
+HiddenPanel::HiddenPanel(TaggingSheet& sheet) : StepPanel(sheet, u"Hidden"_s)
 {
-    m_print->setObjectName(u"hidden_details"_s);
-    connect(m_print, &QCheckBox::clicked, this, &HiddenPanel::turn);
-    auto* column = make_step_column(*this, u"Hidden details"_s);
-    column->addWidget(m_print);
-    add_step_words(*column,
-                   u"What is marked as unlisted is left out of every report. For the office's own eyes it can be "
-                   "printed; every page then says so at its foot."_s);
+    auto* column = make_step_column(*this, u"Leave out of reports"_s);
+    for (const auto& row : detail_rows) {
+        auto* detail = new QCheckBox(QString::fromLatin1(row.text));
+        detail->setObjectName(QString::fromLatin1(row.name));
+        connect(detail, &QCheckBox::toggled, this, [this, place = static_cast<std::size_t>(row.detail)](bool on) {
+            this->sheet().options.withheld.set(place, on);
+            Q_EMIT changed();
+        });
+        column->addWidget(detail);
+        m_details.push_back(detail);
+    }
+    add_step_words(*column, u"What is marked as unlisted is left out of every report anyway."_s);
     column->addStretch(1);
 }
 
 void HiddenPanel::focus_first()
 {
-    m_print->setFocus(Qt::OtherFocusReason);
-}
-
-void HiddenPanel::turn(bool on)
-{
-    const bool granted = on && core::permitted(m_desk.office, core::Area::security);
-    m_print->setChecked(granted);
-    sheet().options.hidden_details = granted;
-    sheet().plan.hidden_details = granted;
-    Q_EMIT changed();
+    m_details.front()->setFocus(Qt::OtherFocusReason);
 }
 
 TitlePanel::TitlePanel(Desk& desk, TaggingSheet& sheet)

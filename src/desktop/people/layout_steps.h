@@ -9,21 +9,18 @@ class QLineEdit;
 
 namespace kindrel::desktop {
 
-/// Whether reports print what is kept hidden.
+/// What reports of this list leave out beyond what is hidden anyway.
 class HiddenPanel : public StepPanel
 {
     Q_OBJECT
 
 public:
-    HiddenPanel(Desk& desk, TaggingSheet& sheet);
+    explicit HiddenPanel(TaggingSheet& sheet);
     void focus_first() override;
-    [[nodiscard]] bool is_set() const override { return sheet().options.hidden_details; }
+    [[nodiscard]] bool is_set() const override { return sheet().options.withheld.any(); }
 
 private:
-    void turn(bool on);
-
-    Desk& m_desk;
-    QCheckBox* m_print;
+    std::vector<QCheckBox*> m_details;
 };
 
 /// The title of a report, and what else stands in its head.

@@ -97,9 +97,7 @@ SuppressPanel::SuppressPanel(Desk& desk, TaggingSheet& sheet) : StepPanel(sheet,
         column->addWidget(need);
         m_needs.push_back(need);
     }
-    add_step_words(*column,
-                   u"Of the person or of the family. What is unlisted counts only where the step Hidden prints "
-                   "it."_s);
+    add_step_words(*column, u"Of the person or of the family. What is unlisted does not count."_s);
     column->addStretch(1);
 }
 

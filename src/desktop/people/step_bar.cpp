@@ -23,7 +23,7 @@ struct StepRow
 constexpr std::array<StepRow, StepBar::step_count> step_rows{{
     {"filter", "&Filter", "Choose the people"},
     {"sort", "&Sort", "Put them in order, and search by date and family type"},
-    {"hidden", "&Hidden", "Whether a report prints unlisted details"},
+    {"hidden", "&Hidden", "What reports leave out beyond what is unlisted"},
     {"range", "Ra&nge", "Take a part of the list"},
     {"title", "T&itle", "What heads a report"},
     {"format", "F&ormat", "Paper and text size of a report"},

@@ -70,7 +70,7 @@ void TaggingPage::add_panels()
     m_process = new ProcessPanel(m_desk, m_sheet);
     connect(m_process, &ProcessPanel::tagged, this, &TaggingPage::tagged);
     m_steps = {new SortPanel(m_desk, m_sheet),
-               new HiddenPanel(m_desk, m_sheet),
+               new HiddenPanel(m_sheet),
                new RangePanel(m_sheet),
                new TitlePanel(m_desk, m_sheet),
                new FormatPanel(m_desk, m_sheet),

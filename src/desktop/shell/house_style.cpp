@@ -54,7 +54,7 @@ int HouseStyle::pixelMetric(PixelMetric metric, const QStyleOption* option, cons
     case PM_TabBarTabHSpace:
         return space::margin;
     case PM_HeaderMargin:
-        return 4;
+        return 6;
     case PM_ScrollBarExtent:
         return 12;
     default:
@@ -72,8 +72,14 @@ int HouseStyle::styleHint(StyleHint hint, const QStyleOption* option, const QWid
 
 QRect HouseStyle::subElementRect(SubElement element, const QStyleOption* option, const QWidget* widget) const
 {
-    const QRect place = QProxyStyle::subElementRect(element, option, widget);
-    return element == SE_LineEditContents ? place.adjusted(3, 0, -3, 0) : place;
+    QRect place = QProxyStyle::subElementRect(element, option, widget);
+    if (element == SE_LineEditContents)
+        return place.adjusted(3, 0, -3, 0);
+    if (element == SE_HeaderLabel) { // The margin is for the sides: a heading needs the whole height.
+        place.setTop(option->rect.top());
+        place.setBottom(option->rect.bottom());
+    }
+    return place;
 }
 
 QRect HouseStyle::subControlRect(ComplexControl control, const QStyleOptionComplex* option, SubControl part,
