@@ -5,6 +5,8 @@
 #include "people/group_history.h"
 #include "people/link_tables.h"
 
+#include <QHash>
+
 #include <algorithm>
 #include <array>
 
@@ -94,54 +96,62 @@ Keyed key_of(const LinkTable& table, const LinkRow& row, const QString& alias = 
     return key;
 }
 
-/// A person of the list who is still in the register, with the row that carries the item.
-struct Candidate
+/// Why a person of the list is passed over.
+enum class Skip { gone = 1, away, closed };
+
+/// What a bulk change finds: whom it passes over, and who carries the item. Everybody else does not.
+struct Findings
 {
-    int person_id = 0;
-    bool away = false;
-    bool closed = false;
-    std::optional<LinkRow> carried;
-    int position = 0;
+    QHash<int, Skip> skipped;
+    QHash<int, BulkChange::Row> carried;
 };
+
+QHash<int, Skip> skipped_people(core::Office& office, TagKind kind)
+{
+    const auto away = office.mode == core::Mode::booked_out ? u"[active_in_book]=0"_s : u"[booked_out]<>0"_s;
+    const auto in_away = u"p.[Surname_ID] IN (SELECT [Surname_ID] FROM [tbl_surname] WHERE %1)"_s.arg(away);
+    const auto in_closed = u"p.[Surname_ID] IN (SELECT [surname_id] FROM [tbl_record_access] WHERE [%1]=0)"_s.arg(
+        named(rule_of(kind).section));
+    auto rows = office.session->select(
+        u"SELECT w.[person_id],CASE WHEN p.[person_id] IS NULL THEN 1 WHEN %1 THEN 2 ELSE 3 END FROM [work_people] w "
+        "LEFT JOIN [tbl_people] p ON p.[person_id]=w.[person_id] WHERE p.[person_id] IS NULL OR %1 OR %2;"_s.arg(
+            in_away, in_closed));
+    QHash<int, Skip> skipped;
+    for (const core::Row& row : rows)
+        skipped.insert(row.integer(core::Column{0}), static_cast<Skip>(row.integer(core::Column{1})));
+    return skipped;
+}
 
 QString column_or_null(const char* name)
 {
-    return name ? u"l.[%1]"_s.arg(named(name)) : u"NULL"_s;
+    return name ? u"[%1]"_s.arg(named(name)) : u"NULL"_s;
 }
 
-std::vector<Candidate> candidates(core::Office& office, const WorkingList& list, const TagItem& item)
+QHash<int, BulkChange::Row> carriers(core::Session& session, const TagItem& item)
 {
-    core::Session& session = *office.session;
-    lend(session, list);
     const LinkTable& table = table_of(item.kind);
-    const LinkRow row = row_of(item);
-    const Keyed key = key_of(table, row, u"l."_s);
-    const auto text =
-        u"SELECT w.[person_id],f.[booked_out],f.[active_in_book],a.[%1],l.[%2],%3,%4,%5,%6 FROM [work_people] w "
-        "INNER JOIN [tbl_people] p ON p.[person_id]=w.[person_id] "
-        "INNER JOIN [tbl_surname] f ON f.[Surname_ID]=p.[Surname_ID] "
-        "LEFT JOIN [tbl_record_access] a ON a.[surname_id]=f.[Surname_ID] "
-        "LEFT JOIN [%7] l ON l.[person_id]=w.[person_id] AND %8 ORDER BY w.[place];"_s.arg(
-            named(rule_of(item.kind).section), named(table.item), column_or_null(table.date),
-            column_or_null(table.field), column_or_null(table.tagged), column_or_null(table.position),
-            named(table.table), key.where);
-    auto rows = session.select_with(text, key.values);
-    std::vector<Candidate> found;
-    for (const core::Row& each : rows) {
-        Candidate& person = found.emplace_back();
-        person.person_id = each.integer(core::Column{0});
-        const bool booked_out = each.flag(core::Column{1});
-        person.away = office.mode == core::Mode::booked_out ? !each.flag(core::Column{2}) : booked_out;
-        person.closed = !each.is_null(core::Column{3}) && !each.flag(core::Column{3});
-        if (each.is_null(core::Column{4}))
-            continue;
-        LinkRow& carried = person.carried.emplace(row);
-        carried.date = each.date(core::Column{5});
-        carried.field = each.text(core::Column{6});
-        carried.tagged = each.flag(core::Column{7});
-        person.position = each.integer(core::Column{8});
+    const Keyed key = key_of(table, row_of(item));
+    auto rows = session.select_with(
+        u"SELECT [person_id],%1,%2,%3,%4 FROM [%5] WHERE %6 AND [person_id] IN (SELECT [person_id] FROM [work_people]);"_s
+            .arg(column_or_null(table.date), column_or_null(table.field), column_or_null(table.tagged),
+                 column_or_null(table.position), named(table.table), key.where),
+        key.values);
+    QHash<int, BulkChange::Row> found;
+    for (const core::Row& row : rows) {
+        BulkChange::Row& carried = found[row.integer(core::Column{0})];
+        carried = {row.integer(core::Column{0}), row_of(item), row.integer(core::Column{4})};
+        carried.row.date = row.date(core::Column{1});
+        carried.row.field = row.text(core::Column{2});
+        carried.row.tagged = row.flag(core::Column{3});
     }
     return found;
+}
+
+/// Leaves the list lent in `work_people`.
+Findings find(core::Office& office, const WorkingList& list, const TagItem& item)
+{
+    lend(*office.session, list);
+    return {skipped_people(office, item.kind), carriers(*office.session, item)};
 }
 
 /// Who gets a row, whose row gets other content, whose goes.
@@ -149,22 +159,24 @@ BulkChange plan(core::Office& office, const WorkingList& list, const TagItem& it
 {
     BulkChange change{.act = act, .item = item, .day = office.clock.today(), .count = {}, .added = {}, .before = {}};
     const LinkRow wanted = row_of(item);
-    for (const auto& person : candidates(office, list, item)) {
-        const bool gives = act == TagAct::give && (!person.carried || *person.carried != wanted);
-        const bool takes = act == TagAct::take && person.carried;
-        if (person.away)
-            ++change.count.booked_out;
-        else if (person.closed)
-            ++change.count.closed;
-        else if (!gives && !takes)
-            ++change.count.as_it_was;
-        else {
-            ++change.count.changed;
-            if (person.carried)
-                change.before.push_back({person.person_id, *person.carried, person.position});
-            else
-                change.added.push_back(person.person_id);
+    const Findings found = find(office, list, item);
+    for (const auto& [person, family] : list.members) {
+        if (const auto skip = found.skipped.find(person); skip != found.skipped.end()) {
+            change.count.booked_out += *skip == Skip::away;
+            change.count.closed += *skip == Skip::closed;
+            continue;
         }
+        const auto carried = found.carried.find(person);
+        const bool carries = carried != found.carried.end();
+        if (act == TagAct::give ? carries && carried->row == wanted : !carries) {
+            ++change.count.as_it_was;
+            continue;
+        }
+        ++change.count.changed;
+        if (carries)
+            change.before.push_back(*carried);
+        else
+            change.added.push_back(person);
     }
     return change;
 }
@@ -176,26 +188,29 @@ std::vector<int> people_of(const std::vector<BulkChange::Row>& rows)
     return people;
 }
 
-constexpr auto among_lent = u" AND [person_id] IN (SELECT [person_id] FROM [work_tagged])";
-
-void lend_people(core::Session& session, const std::vector<int>& people)
+/// The temporary table in which the people stand: that of the whole list where all of it is meant.
+QString lend_people(core::Session& session, const std::vector<int>& people, int whole_list)
 {
+    if (std::ssize(people) == whole_list)
+        return u"work_people"_s;
     std::vector<std::vector<Value>> rows;
     for (const int person : people)
         rows.push_back({to_value(person)});
     session.fill_temporary(u"work_tagged"_s, {u"person_id"_s}, rows);
+    return u"work_tagged"_s;
 }
 
-/// The place behind what each of the lent people carries; nothing for a kind without places.
-std::vector<std::pair<int, int>> last_places(core::Session& session, const LinkTable& table)
+/// The last place of what each person of the lent list carries; nothing for a kind without places.
+QHash<int, int> last_places(core::Session& session, const LinkTable& table)
 {
-    std::vector<std::pair<int, int>> places;
+    QHash<int, int> places;
     if (!table.position)
         return places;
-    auto rows = session.select(u"SELECT [person_id],MAX([%1]) FROM [%2] WHERE 1=1%3 GROUP BY [person_id] "
-                               "ORDER BY [person_id];"_s.arg(named(table.position), named(table.table), among_lent));
+    auto rows = session.select(u"SELECT [person_id],MAX([%1]) FROM [%2] WHERE [person_id] IN "
+                               "(SELECT [person_id] FROM [work_people]) GROUP BY [person_id];"_s.arg(
+                                   named(table.position), named(table.table)));
     for (const core::Row& row : rows)
-        places.emplace_back(row.integer(core::Column{0}), row.integer(core::Column{1}));
+        places.insert(row.integer(core::Column{0}), row.integer(core::Column{1}));
     return places;
 }
 
@@ -221,25 +236,27 @@ void insert_rows(core::Session& session, const LinkTable& table, const std::vect
     session.insert(named(table.table), fields, rows);
 }
 
-/// At the end of what each person carries.
+/// At the end of what each person of the lent list carries.
 void add_rows(core::Session& session, const LinkTable& table, const LinkRow& row, const std::vector<int>& people)
 {
-    lend_people(session, people);
     const auto places = last_places(session, table);
     std::vector<BulkChange::Row> rows;
-    for (const int person : people) {
-        const auto last = std::ranges::lower_bound(places, person, {}, &std::pair<int, int>::first);
-        const bool carries = last != places.end() && last->first == person;
-        rows.push_back({person, row, carries ? last->second + 1 : 1});
-    }
+    rows.reserve(people.size());
+    for (const int person : people)
+        rows.push_back({person, row, places.value(person) + 1});
     insert_rows(session, table, rows);
 }
 
-void delete_rows(core::Session& session, const LinkTable& table, const LinkRow& row, const std::vector<int>& people)
+/// `whole_list` is the number of people who are lent in `work_people`.
+void delete_rows(core::Session& session, const LinkTable& table, const LinkRow& row, const std::vector<int>& people,
+                 int whole_list)
 {
-    lend_people(session, people);
+    if (people.empty())
+        return;
     const Keyed key = key_of(table, row);
-    session.execute_with(u"DELETE FROM [%1] WHERE %2%3;"_s.arg(named(table.table), key.where, among_lent), key.values);
+    session.execute_with(u"DELETE FROM [%1] WHERE %2 AND [person_id] IN (SELECT [person_id] FROM [%3]);"_s.arg(
+                             named(table.table), key.where, lend_people(session, people, whole_list)),
+                         key.values);
 }
 
 std::vector<Membership> memberships(const std::vector<int>& people, int group)
@@ -260,8 +277,7 @@ void carry_out(core::Session& session, const BulkChange& change)
         write_group_history(session, giving ? memberships(change.added, row.item) : std::vector<Membership>{},
                             giving ? std::vector<Membership>{} : memberships(had, row.item), change.day);
     }
-    if (!had.empty())
-        delete_rows(session, table, row, had);
+    delete_rows(session, table, row, had, change.count.people());
     if (change.act == TagAct::take)
         return;
     auto rewritten = change.before;
@@ -311,9 +327,14 @@ std::vector<int> untouched(core::Office& office, const BulkChange& change, const
     if (change.act == TagAct::give)
         left = row_of(change.item);
     std::vector<int> found;
-    for (const auto& person : candidates(office, list, change.item)) {
-        if (person.carried == left)
-            found.push_back(person.person_id);
+    const Findings now = find(office, list, change.item);
+    for (const int person : people) {
+        if (now.skipped.contains(person))
+            continue;
+        const auto carried = now.carried.find(person);
+        const auto row = carried == now.carried.end() ? std::nullopt : std::optional(carried->row);
+        if (row == left)
+            found.push_back(person);
     }
     std::ranges::sort(found);
     return found;
@@ -378,8 +399,9 @@ int undo_tagging(core::Office& office, const BulkChange& change)
     had = among(had, as_left);
     const auto added = among(change.added, as_left);
     if (change.act == TagAct::give) {
-        delete_rows(session, table, row, added);
-        delete_rows(session, table, row, had);
+        const auto whole_list = static_cast<int>(all.size());
+        delete_rows(session, table, row, added, whole_list);
+        delete_rows(session, table, row, had, whole_list);
     }
     std::vector<BulkChange::Row> restored;
     std::ranges::copy_if(change.before, std::back_inserter(restored), [&](const BulkChange::Row& each) {
