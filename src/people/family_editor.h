@@ -113,6 +113,8 @@ public:
     [[nodiscard]] bool set_today(RowPlace place);
 
     // What is stored at once. The family must be saved; an altered one is offered for saving.
+    /// Whether anybody can be transferred out of the family as it is; otherwise says why not.
+    [[nodiscard]] bool may_transfer() const;
     [[nodiscard]] bool transfer_to_new(int index);
     [[nodiscard]] bool transfer_to(int index, int surname_id);
     /// Whether notebook and photographs can be opened: the family is stored and has a person.
@@ -153,7 +155,6 @@ private:
     void release() noexcept;
     /// The same family and people, without the keys under which they were stored once.
     [[nodiscard]] static FamilyFile as_new(FamilyFile file);
-    [[nodiscard]] bool may_transfer() const;
     /// The key of the person, once everything that must come before a transfer is done.
     [[nodiscard]] std::optional<int> person_to_transfer(int index);
     /// Whether an adult is left at the first place without the person.

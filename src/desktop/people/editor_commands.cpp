@@ -10,8 +10,8 @@ namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
 
-EditorCommands::EditorCommands(EditorBench& bench, NoteBar& note, QWidget& page)
-    : QObject(&page), m_bench(bench), m_note(note), m_menu(new QMenu(&page))
+EditorCommands::EditorCommands(EditorBench& bench, NoteBar& note, QWidget& page, std::function<bool()> ready)
+    : QObject(&page), m_bench(bench), m_note(note), m_ready(std::move(ready)), m_menu(new QMenu(&page))
 {
     m_menu->setObjectName(u"more"_s);
     add(u"Transfer person to &new family"_s, &EditorCommands::transfer_to_new);
@@ -26,8 +26,8 @@ EditorCommands::EditorCommands(EditorBench& bench, NoteBar& note, QWidget& page)
 void EditorCommands::add(const QString& text, void (EditorCommands::*command)())
 {
     connect(m_menu->addAction(text), &QAction::triggered, this, [this, command] {
-        Q_EMIT about_to_run();
-        (this->*command)();
+        if (m_ready())
+            (this->*command)();
     });
 }
 
@@ -56,6 +56,8 @@ void EditorCommands::transfer_to_new()
 
 void EditorCommands::transfer()
 {
+    if (!m_bench.editor.may_transfer()) // Before a family is chosen in vain.
+        return;
     const QString name = person_name();
     const auto family = choose_family(m_bench.desk, m_bench.editor.file().family.Surname_ID);
     if (family && m_bench.editor.transfer_to(m_bench.person(), *family))

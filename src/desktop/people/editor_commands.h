@@ -2,6 +2,8 @@
 
 #include "desktop/people/editor_tab.h"
 
+#include <functional>
+
 class QMenu;
 
 namespace kindrel::desktop {
@@ -14,13 +16,11 @@ class EditorCommands : public QObject
     Q_OBJECT
 
 public:
-    EditorCommands(EditorBench& bench, NoteBar& note, QWidget& page);
+    /// `ready` is asked before each command: what is typed and not entered yet belongs to the family. A command does
+    /// not run when it answers false.
+    EditorCommands(EditorBench& bench, NoteBar& note, QWidget& page, std::function<bool()> ready);
 
     [[nodiscard]] QMenu& menu() { return *m_menu; }
-
-Q_SIGNALS:
-    /// Before a command: what is typed and not entered yet belongs to the family.
-    void about_to_run();
 
 private:
     void add(const QString& text, void (EditorCommands::*command)());
@@ -34,6 +34,7 @@ private:
 
     EditorBench& m_bench;
     NoteBar& m_note;
+    std::function<bool()> m_ready;
     QMenu* m_menu;
 };
 

@@ -33,8 +33,8 @@ EditorPage* EditorPage::open(Desk& desk)
 EditorPage::EditorPage(Desk& desk, core::AreaEntry entry)
     : Page({}), m_entry(std::move(entry)), m_bench(desk, nullptr), m_header(new EditorHeader(m_bench)),
       m_people(new EditorPeople(m_bench)), m_tabs(new EditorBook(m_bench, note())),
-      m_commands(new EditorCommands(m_bench, note(), *this)), m_duplicates(new DuplicateWatch(m_bench, note(), this)),
-      m_drafts(new DraftKeeper(m_bench, note(), this))
+      m_commands(new EditorCommands(m_bench, note(), *this, [this] { return finish_typing(); })),
+      m_duplicates(new DuplicateWatch(m_bench, note(), this)), m_drafts(new DraftKeeper(m_bench, note(), this))
 {
     setObjectName(u"Editor"_s);
     set_content(make_content());
@@ -46,7 +46,6 @@ EditorPage::EditorPage(Desk& desk, core::AreaEntry entry)
     connect(&m_bench, &EditorBench::person_chosen, this, &EditorPage::show_person);
     connect(m_people, &EditorPeople::opened, m_tabs, &EditorBook::open_person);
     connect(m_people, &EditorPeople::name_entered, m_duplicates, &DuplicateWatch::look);
-    connect(m_commands, &EditorCommands::about_to_run, this, [this] { (void)finish_typing(); });
     show_family();
 }
 
