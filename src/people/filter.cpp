@@ -1,5 +1,7 @@
 #include "people/filter.h"
 
+#include <algorithm>
+
 namespace kindrel::people {
 
 namespace {
@@ -76,6 +78,13 @@ std::span<const FamilyTypeRow> family_types()
 const FamilyTypeRow& family_type(FamilyType type)
 {
     return types[static_cast<std::size_t>(type)];
+}
+
+bool asks_for_birth_dates(const Filter& filter)
+{
+    return filter.ages || std::ranges::any_of(filter.dates, [](const DateCriterion& criterion) {
+               return criterion.source == DateSource::birth_date;
+           });
 }
 
 } // namespace kindrel::people

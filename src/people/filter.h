@@ -157,6 +157,9 @@ struct Filter
     friend bool operator==(const Filter&, const Filter&) = default;
 };
 
+/// Whether it could tell a birth date to somebody who may not see one: by age or by the date itself.
+[[nodiscard]] bool asks_for_birth_dates(const Filter& filter);
+
 /// What is said of a filter without a family list.
 inline constexpr QStringView no_families_chosen =
     u"You need to apply a File Status filter before continuing, for example choose 'Active Families'";

@@ -1,5 +1,6 @@
 #include "people/saved_filters.h"
 
+#include "core/entry.h"
 #include "core/open_church.h"
 #include "people/filter_json.h"
 #include "people/filter_texts.h"
@@ -129,6 +130,8 @@ std::optional<Filter> load_filter(core::Office& office, int filter_id)
         office.dialogue.show({words_of(*read.fault)});
         return std::nullopt;
     }
+    if (asks_for_birth_dates(read.filter) && !core::permitted(office, core::Area::birth_dates))
+        return std::nullopt;
     refresh_texts(*office.session, read.filter);
     return std::move(read.filter);
 }

@@ -19,7 +19,8 @@ struct SavedFilter
 /// Keeps the filter under a name; asks before it replaces the one that bears it already. The key, or nullopt after
 /// saying why nothing was saved.
 [[nodiscard]] std::optional<int> save_filter(core::Office& office, const QString& name, const Filter& filter);
-/// With the texts that its items have now. Nullopt, after saying why, when it is gone or cannot be understood.
+/// With the texts that its items have now. Nullopt, after saying why, when it is gone, cannot be understood, or
+/// asks for birth dates that the person may not see.
 [[nodiscard]] std::optional<Filter> load_filter(core::Office& office, int filter_id);
 [[nodiscard]] bool rename_filter(core::Office& office, int filter_id, const QString& name);
 /// Asks first.

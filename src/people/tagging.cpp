@@ -108,7 +108,7 @@ struct Findings
 
 QHash<int, Skip> skipped_people(core::Office& office, TagKind kind)
 {
-    const auto away = office.mode == core::Mode::booked_out ? u"[active_in_book]=0"_s : u"[booked_out]<>0"_s;
+    const auto away = office.mode == core::Mode::booked_out ? u"[active_in_book]=0"_s : u"[booked_out]=-1"_s;
     const auto in_away = u"p.[Surname_ID] IN (SELECT [Surname_ID] FROM [tbl_surname] WHERE %1)"_s.arg(away);
     const auto in_closed = u"p.[Surname_ID] IN (SELECT [surname_id] FROM [tbl_record_access] WHERE [%1]=0)"_s.arg(
         named(rule_of(kind).section));
@@ -224,8 +224,12 @@ void insert_rows(core::Session& session, const LinkTable& table, const std::vect
     for (const auto& content : content_of(table, {}))
         fields += named(content.name);
     std::vector<std::vector<Value>> rows;
+    rows.reserve(added.size());
     for (const auto& [person, link, position] : added) {
-        auto& row = rows.emplace_back(std::vector<Value>{to_value(person), to_value(link.item)});
+        auto& row = rows.emplace_back();
+        row.reserve(static_cast<std::size_t>(fields.size()));
+        row.push_back(to_value(person));
+        row.push_back(to_value(link.item));
         if (table.type)
             row.push_back(to_value(link.type));
         if (table.position)

@@ -131,4 +131,20 @@ TEST_P(SavedFiltersTest, AFilterThatIsGoneOrTooNewIsRefused)
 
 KINDREL_ON_BOTH_ENGINES(SavedFiltersTest);
 
+TEST_P(SavedFiltersTest, OneThatAsksForBirthDatesNeedsTheirRight)
+{
+    const Filter by_age{.families = FamilyList::active, .ages = Ages{18, 30, {}}};
+    Filter by_month{.families = FamilyList::active};
+    by_month.dates.push_back({.span = DateSpan::month, .month = 3});
+    const int age = save_filter(office(), u"Young adults"_s, by_age).value();
+    const int month = save_filter(office(), u"March"_s, by_month).value();
+    EXPECT_EQ(load_filter(office(), age), by_age);
+
+    office().rights.set(core::Area::birth_dates, false);
+    for (const int filter : {age, month}) {
+        dialogue().expect_box(u"Your password does not give access to \"Birth Dates Access\""_s);
+        EXPECT_EQ(load_filter(office(), filter), std::nullopt);
+    }
+}
+
 } // namespace kindrel::test

@@ -12,6 +12,12 @@ namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+constexpr int header_margin = 6;
+
+}
+
 HouseStyle::HouseStyle() : QProxyStyle(QStyleFactory::create(u"Fusion"_s)) {}
 
 QSize HouseStyle::sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& size,
@@ -54,7 +60,7 @@ int HouseStyle::pixelMetric(PixelMetric metric, const QStyleOption* option, cons
     case PM_TabBarTabHSpace:
         return space::margin;
     case PM_HeaderMargin:
-        return 6;
+        return header_margin;
     case PM_ScrollBarExtent:
         return 12;
     default:
@@ -72,14 +78,8 @@ int HouseStyle::styleHint(StyleHint hint, const QStyleOption* option, const QWid
 
 QRect HouseStyle::subElementRect(SubElement element, const QStyleOption* option, const QWidget* widget) const
 {
-    QRect place = QProxyStyle::subElementRect(element, option, widget);
-    if (element == SE_LineEditContents)
-        return place.adjusted(3, 0, -3, 0);
-    if (element == SE_HeaderLabel) { // The margin is for the sides: a heading needs the whole height.
-        place.setTop(option->rect.top());
-        place.setBottom(option->rect.bottom());
-    }
-    return place;
+    const QRect place = QProxyStyle::subElementRect(element, option, widget);
+    return element == SE_LineEditContents ? place.adjusted(3, 0, -3, 0) : place;
 }
 
 QRect HouseStyle::subControlRect(ComplexControl control, const QStyleOptionComplex* option, SubControl part,
@@ -132,7 +132,12 @@ void HouseStyle::drawControl(ControlElement element, const QStyleOption* option,
     const auto* heading = qstyleoption_cast<const QStyleOptionHeader*>(option);
     if (element == CE_HeaderSection && heading)
         draw_header_section(*heading, *painter);
-    else if (element == CE_HeaderEmptyArea)
+    else if (element == CE_HeaderLabel && heading) {
+        // The margin is meant for the sides: a heading needs the whole height.
+        QStyleOptionHeader whole(*heading);
+        whole.rect.adjust(0, -header_margin, 0, header_margin);
+        QProxyStyle::drawControl(element, &whole, painter, widget);
+    } else if (element == CE_HeaderEmptyArea)
         draw_header_ground(*option, *painter);
     else if (element == CE_TabBarTabShape && tab)
         draw_tab(*tab, *painter);
