@@ -90,6 +90,20 @@ void set_portrait(const core::Paths& paths, const OwnFile& portrait, const std::
     core::write_file(path_of(paths, portrait), *jpeg);
 }
 
+QString attach_sound(const core::Paths& paths, const QString& file)
+{
+    const QFileInfo chosen(file);
+    const auto folder = paths.folder(Folder::audio);
+    if (QFileInfo(folder) == QFileInfo(chosen.absolutePath() + u'/'))
+        return chosen.fileName();
+    core::make_folder(folder);
+    QString name = chosen.fileName();
+    for (int copy = 2; QFileInfo::exists(folder + name); ++copy)
+        name = u"%1 (%2).%3"_s.arg(chosen.completeBaseName()).arg(copy).arg(chosen.suffix());
+    core::copy_file(file, folder + name);
+    return name;
+}
+
 QString read_notebook(const core::Paths& paths, const OwnFile& page)
 {
     const auto content = core::read_file(path_of(paths, page));

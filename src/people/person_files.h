@@ -27,6 +27,10 @@ void remove_files(const core::Paths& paths, const std::vector<OwnFile>& files);
 /// Puts a photograph in place of an earlier one; null removes it. `jpeg` is the file's content. Throws core::FileError.
 void set_portrait(const core::Paths& paths, const OwnFile& portrait, const std::optional<QByteArray>& jpeg);
 
+/// Copies a sound into the church's `Audio` folder under a name that is free there, which comes back: what a family's
+/// `audio_note` keeps. A sound that lies there already stays as it is. Throws core::FileError.
+[[nodiscard]] QString attach_sound(const core::Paths& paths, const QString& file);
+
 /// The page's text; empty when there is none yet.
 [[nodiscard]] QString read_notebook(const core::Paths& paths, const OwnFile& page);
 /// An empty text removes the page. Throws core::FileError.

@@ -220,6 +220,18 @@ TEST_P(FamilyTransferTest, AGuardIsAskedBeforePeopleAreTouched)
     EXPECT_EQ(editor->save(), Saved::yes);
 }
 
+TEST_P(FamilyTransferTest, AnAlteredFamilyIsSavedBeforeItMovesToAnotherChurch)
+{
+    core::SilentProgress progress;
+    type_phone(*editor, u"5550 1111"_s);
+    dialogue().expect_box(u"This file has been altered and needs to be saved before moving to another church."_s);
+    EXPECT_FALSE(editor->move_to_church(2, progress));
+    ASSERT_EQ(editor->save(), Saved::yes);
+    dialogue().expect_box(u"Please select a church to move the family too first"_s);
+    EXPECT_FALSE(editor->move_to_church(std::nullopt, progress));
+    EXPECT_EQ(locks(key), 1);
+}
+
 TEST_P(FamilyTransferTest, NotebookPhotographsAndVisitsNeedAStoredPerson)
 {
     FamilyEditor fresh(office());

@@ -106,4 +106,16 @@ TEST_F(PersonFilesTest, PagesOfOtherProgramsLoseNothing)
     }
 }
 
+TEST_F(PersonFilesTest, ASoundComesIntoTheAudioFolderUnderAFreeName)
+{
+    const QString other = place.path() + u"/elsewhere/hello.wav"_s;
+    DataFolder::write(other, "sound");
+    DataFolder::write(path(Folder::audio, u"hello.wav"_s), "earlier");
+
+    EXPECT_EQ(attach_sound(paths, other), u"hello (2).wav");
+    EXPECT_EQ(DataFolder::read(path(Folder::audio, u"hello (2).wav"_s)), "sound");
+    EXPECT_EQ(DataFolder::read(path(Folder::audio, u"hello.wav"_s)), "earlier");
+    EXPECT_EQ(attach_sound(paths, path(Folder::audio, u"hello.wav"_s)), u"hello.wav");
+}
+
 } // namespace kindrel::test

@@ -2,7 +2,9 @@
 
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
+#include "people/person_files.h"
 
+#include <QCheckBox>
 #include <QHBoxLayout>
 #include <QPushButton>
 
@@ -24,6 +26,7 @@ constexpr std::array residential_street{Line{"res_street", "S&treet", &Address::
 constexpr std::array residential_rest{
     Line{"res_state", "State", &Address::res_state}, Line{"res_country", "Country", &Address::res_country},
     Line{"res_map", "Map", &Address::res_map}, Line{"res_ref", "Map reference", &Address::res_ref}};
+constexpr std::array further{Line{"audio_note", "Audio note", &Address::audio_note}};
 constexpr std::array postal_street{Line{"post_street", "Street", &Address::post_street, &Address::post_hidden},
                                    Line{"post_street2", "", &Address::post_street2}};
 constexpr std::array postal_rest{Line{"post_state", "State", &Address::post_state},
@@ -41,6 +44,7 @@ EditorFamilyTab::EditorFamilyTab(EditorBench& bench, NoteBar& note) : EditorTab(
     auto* left = new QVBoxLayout;
     left->setSpacing(space::group);
     left->addWidget(make_residential());
+    left->addWidget(make_further());
     left->addStretch(1);
     auto* right = new QVBoxLayout;
     right->setSpacing(space::group);
@@ -62,6 +66,52 @@ EditorForm* EditorFamilyTab::make_residential()
     form->add_lines<Address>(residential_rest);
     m_forms.push_back(form);
     return form;
+}
+
+EditorForm* EditorFamilyTab::make_further()
+{
+    auto* form = new EditorForm(bench(), u"Further"_s, &RecordAccess::Address);
+    form->add_lines<Address>(further);
+    auto* buttons = new QWidget;
+    auto* row = new QHBoxLayout(buttons);
+    row->setContentsMargins(0, 0, 0, 0);
+    row->setSpacing(space::field);
+    const auto add = [&](const QString& name, const QString& text, auto act) {
+        auto* button = new QPushButton(text);
+        button->setObjectName(name);
+        connect(button, &QPushButton::clicked, this, act);
+        row->addWidget(button);
+        return button;
+    };
+    QPushButton* choose = add(u"choose_sound"_s, u"Choose sound\u2026"_s, [this] { choose_sound(); });
+    add(u"play_sound"_s, u"Play"_s, [this] {
+        if (!file().address.audio_note.isEmpty())
+            bench().desk.office.dialogue.play(file().address.audio_note);
+    });
+    row->addStretch(1);
+    form->add_wide(buttons);
+    auto* transferred = new QCheckBox(u"Somebody was transferred"_s);
+    transferred->setObjectName(u"transfer_exists"_s);
+    const auto link = field_link(bench(), "transfer_exists", &Address::transfer_exists);
+    connect(transferred, &QCheckBox::clicked, form, link.change);
+    form->on_show([this, choose, transferred, value = link.value] {
+        transferred->setChecked(value());
+        choose->setEnabled(editor().may_edit());
+    });
+    form->add_wide(transferred);
+    m_forms.push_back(form);
+    return form;
+}
+
+void EditorFamilyTab::choose_sound()
+{
+    auto& office = bench().desk.office;
+    const auto chosen = office.dialogue.choose_file({.title = u"Sound of the family"_s,
+                                                     .filter = u"Sounds (*.wav *.mp3 *.ogg *.flac)"_s,
+                                                     .suggested = office.paths.folder(core::Folder::audio)});
+    if (!chosen)
+        return;
+    field_link(bench(), "audio_note", &Address::audio_note).change(people::attach_sound(office.paths, *chosen));
 }
 
 EditorForm* EditorFamilyTab::make_contacts()

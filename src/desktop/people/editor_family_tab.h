@@ -22,6 +22,8 @@ public:
 private:
     [[nodiscard]] EditorForm* make_residential();
     [[nodiscard]] EditorForm* make_postal();
+    [[nodiscard]] EditorForm* make_further();
+    void choose_sound();
     [[nodiscard]] EditorForm* make_contacts();
     void copy_residential();
 

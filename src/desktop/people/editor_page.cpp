@@ -11,6 +11,7 @@
 #include "desktop/shell/note_bar.h"
 
 #include <QAction>
+#include <QCoreApplication>
 #include <QHBoxLayout>
 #include <QMenu>
 #include <QToolButton>
@@ -202,11 +203,6 @@ void EditorPage::undo()
     m_bench.show_again();
 }
 
-bool EditorPage::altered() const
-{
-    return m_bench.editor.altered();
-}
-
 bool EditorPage::holds_lock() const
 {
     return m_bench.desk.office.shared() && !m_bench.editor.is_new();
@@ -216,6 +212,8 @@ bool EditorPage::save()
 {
     if (!finish_typing())
         return false;
+    set_status(u"Saving..."_s);
+    QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
     const Saved saved = m_bench.editor.save();
     m_saved = saved == Saved::yes;
     m_bench.show_again();

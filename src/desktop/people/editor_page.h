@@ -32,7 +32,7 @@ public:
     void entered() override;
     void find() override;
     bool save() override;
-    [[nodiscard]] bool altered() const override;
+    [[nodiscard]] bool altered() const override { return m_bench.editor.altered(); }
     [[nodiscard]] bool holds_lock() const override;
     [[nodiscard]] bool leave() override;
 
