@@ -6,6 +6,19 @@
 
 namespace kindrel::test {
 
+/// Agrees to everything; stands where a process works until it is killed.
+class AgreeingDialogue : public core::Dialogue
+{
+public:
+    void show(const core::Message&) override {}
+    bool confirm(const core::Message&, core::Answer) override { return true; }
+    std::optional<bool> confirm_or_cancel(const core::Message&) override { return true; }
+    std::optional<QString> ask_text(const core::Message&, bool) override { return {}; }
+    std::optional<int> choose(const core::Message&, const QStringList&) override { return 0; }
+    std::optional<QString> choose_file(const core::FileQuestion&) override { return {}; }
+    void play(const QString&) override {}
+};
+
 /// A workstation in a church with setup lists; another one can come in.
 class EditorTest : public EngineTest
 {

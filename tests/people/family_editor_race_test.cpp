@@ -1,6 +1,7 @@
 #include "people/editor_fixture.h"
 
 #include "people/family_changes.h"
+#include "support/processes.h"
 
 namespace kindrel::test {
 
@@ -115,6 +116,40 @@ TEST_P(FamilyRaceTest, VisitsItemNamesAndOrderOfDatesAreNoChange)
     type_phone(*editor, u"5550 9999"_s);
     EXPECT_EQ(editor->save(), Saved::yes);
     EXPECT_EQ(stored(key).visits.size(), 1u);
+}
+
+TEST_P(FamilyRaceTest, SeveralProcessesEditOneFamilyInTurnAndLoseNothing)
+{
+    constexpr int saves = 8;
+    editor.reset();
+    desk.reset();
+    church->close();
+    const auto work = [&]() -> QByteArray {
+        SetupOffice own(*church);
+        AgreeingDialogue agreeing;
+        core::Office office{.paths = own.office.paths,
+                            .session = church->another(),
+                            .rights = core::Rights::all(),
+                            .workstation = own.workstation,
+                            .dialogue = agreeing,
+                            .clock = own.clock};
+        int refused = 0;
+        for (int saved = 0; saved < saves;) {
+            FamilyEditor mine(office);
+            if (!mine.open(key)) {
+                ++refused;
+                continue;
+            }
+            mine.change(
+                {}, [](FamilyFile& file) { file.address.res_ref = QString::number(file.address.res_ref.toInt() + 1); });
+            saved += mine.save() == Saved::yes;
+        }
+        return QByteArray::number(refused);
+    };
+    (void)run_together({work, work, work});
+    church->reopen();
+    EXPECT_EQ(stored(key).address.res_ref.toInt(), 3 * saves);
+    EXPECT_EQ(locks(key), 0);
 }
 
 TEST_P(FamilyRaceTest, UnsavedWorkIsOfferedAgainAfterTheProgramDied)

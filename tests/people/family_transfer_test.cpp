@@ -34,19 +34,6 @@ public:
     bool answer = false;
 };
 
-/// Agrees to everything; stands where a process works until it is killed.
-class AgreeingDialogue : public core::Dialogue
-{
-public:
-    void show(const core::Message&) override {}
-    bool confirm(const core::Message&, Answer) override { return true; }
-    std::optional<bool> confirm_or_cancel(const core::Message&) override { return true; }
-    std::optional<QString> ask_text(const core::Message&, bool) override { return {}; }
-    std::optional<int> choose(const core::Message&, const QStringList&) override { return 0; }
-    std::optional<QString> choose_file(const core::FileQuestion&) override { return {}; }
-    void play(const QString&) override {}
-};
-
 class FamilyTransferTest : public EditorTest
 {
 protected:
