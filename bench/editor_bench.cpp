@@ -4,6 +4,7 @@
 
 #include "bare_family.h"
 #include "measure.h"
+#include "quiet_dialogue.h"
 
 #include "core/schema.h"
 #include "core/sqlite_session.h"
@@ -25,22 +26,6 @@ constexpr std::array sizes{1000, 10000, 60000};
 constexpr int steps = 200;
 constexpr int saves = 41;
 const QDate today(2026, 11, 22);
-
-/// Nothing is asked here; a question is an error of the benchmark.
-class NoDialogue : public core::Dialogue
-{
-public:
-    void show(const core::Message& message) override { fail(message); }
-    bool confirm(const core::Message& message, core::Answer) override { return fail(message); }
-    std::optional<bool> confirm_or_cancel(const core::Message& message) override { return fail(message); }
-    std::optional<QString> ask_text(const core::Message& message, bool) override { return fail(message), u""_s; }
-    std::optional<int> choose(const core::Message& message, const QStringList&) override { return fail(message); }
-    std::optional<QString> choose_file(const core::FileQuestion&) override { return std::nullopt; }
-    void play(const QString&) override {}
-
-private:
-    static bool fail(const core::Message& message) { throw std::runtime_error(message.text.toStdString()); }
-};
 
 /// Five people with eight rows each.
 int add_family_of_five(core::Session& session)
@@ -139,7 +124,7 @@ void bench_all(int people)
     const auto file = root + u"church.kdl"_s;
     core::SystemWorkstation workstation;
     core::SystemClock clock;
-    NoDialogue dialogue;
+    QuietDialogue dialogue;
     core::Office office{.paths = core::Paths(root, root, root, core::Mode::normal, 1),
                         .rights = core::Rights::all(),
                         .workstation = workstation,

@@ -4,6 +4,7 @@
 
 #include "bare_sqlite.h"
 #include "measure.h"
+#include "quiet_dialogue.h"
 
 #include "core/postgres_session.h"
 #include "core/schema.h"
@@ -29,22 +30,6 @@ constexpr int rounds = 7;
 constexpr double goal = 2;
 constexpr int item = 9999; ///< Nobody carries it yet.
 const QDate today(2026, 11, 22);
-
-/// Hears that the change is done; a question is an error of the benchmark.
-class QuietDialogue : public core::Dialogue
-{
-public:
-    void show(const core::Message&) override {}
-    bool confirm(const core::Message& message, core::Answer) override { return fail(message); }
-    std::optional<bool> confirm_or_cancel(const core::Message& message) override { return fail(message); }
-    std::optional<QString> ask_text(const core::Message& message, bool) override { return fail(message), u""_s; }
-    std::optional<int> choose(const core::Message& message, const QStringList&) override { return fail(message); }
-    std::optional<QString> choose_file(const core::FileQuestion&) override { return std::nullopt; }
-    void play(const QString&) override {}
-
-private:
-    static bool fail(const core::Message& message) { throw std::runtime_error(message.text.toStdString()); }
-};
 
 /// An office on a church of 60,000 people, with 20,000 of them on a list.
 struct Church

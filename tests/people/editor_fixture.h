@@ -19,6 +19,25 @@ public:
     void play(const QString&) override {}
 };
 
+/// An office for a process of its own, in which everything is agreed to.
+class WorkingOffice
+{
+public:
+    explicit WorkingOffice(const TestChurch& church)
+        : own(church), office{.paths = own.office.paths,
+                              .session = church.another(),
+                              .rights = core::Rights::all(),
+                              .workstation = own.workstation,
+                              .dialogue = agreeing,
+                              .clock = own.clock}
+    {
+    }
+
+    SetupOffice own;
+    AgreeingDialogue agreeing;
+    core::Office office;
+};
+
 /// A workstation in a church with setup lists; another one can come in.
 class EditorTest : public EngineTest
 {

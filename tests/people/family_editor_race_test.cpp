@@ -125,14 +125,8 @@ TEST_P(FamilyRaceTest, SeveralProcessesEditOneFamilyInTurnAndLoseNothing)
     desk.reset();
     church->close();
     const auto work = [&]() -> QByteArray {
-        SetupOffice own(*church);
-        AgreeingDialogue agreeing;
-        core::Office office{.paths = own.office.paths,
-                            .session = church->another(),
-                            .rights = core::Rights::all(),
-                            .workstation = own.workstation,
-                            .dialogue = agreeing,
-                            .clock = own.clock};
+        WorkingOffice working(*church);
+        core::Office& office = working.office;
         int refused = 0;
         for (int saved = 0; saved < saves;) {
             FamilyEditor mine(office);

@@ -255,14 +255,8 @@ TEST_P(FamilyTransferTest, ATransferOrDeletionKilledAtAnyMomentIsWholeOrUndone)
     for (int round = 0; round < 12; ++round) {
         run_and_kill(
             [&](const Ready& ready) {
-                SetupOffice own(*church);
-                AgreeingDialogue agreeing;
-                core::Office office{.paths = own.office.paths,
-                                    .session = church->another(),
-                                    .rights = core::Rights::all(),
-                                    .workstation = own.workstation,
-                                    .dialogue = agreeing,
-                                    .clock = own.clock};
+                WorkingOffice working(*church);
+                core::Office& office = working.office;
                 ready();
                 for (int from = key, to = other;; std::swap(from, to)) {
                     (void)core::Locks(office).unlock(core::LockKind::family, from);
