@@ -63,9 +63,12 @@ FileAccess FamilyEditor::access() const
 {
     if (m_office.may(Area::read_only_family_data))
         return FileAccess::read_only;
-    const Family& family = m_stored.family;
-    const bool away = m_office.mode == core::Mode::booked_out ? !family.active_in_book : family.booked_out;
-    return away ? FileAccess::booked_out : FileAccess::edit;
+    return is_away(m_stored.family) ? FileAccess::booked_out : FileAccess::edit;
+}
+
+bool FamilyEditor::is_away(const Family& family) const
+{
+    return m_office.mode == core::Mode::booked_out ? !family.active_in_book : family.booked_out;
 }
 
 QString FamilyEditor::caption() const

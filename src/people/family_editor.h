@@ -130,6 +130,8 @@ public:
 
 private:
     [[nodiscard]] bool refuse(const QString& text, const QString& more = {}) const;
+    /// Whether the family is booked out, or not among those booked out to this computer.
+    [[nodiscard]] bool is_away(const Family& family) const;
     [[nodiscard]] bool refuse_reading(const QString& act) const;
     /// Offers what is altered for saving; false when the person stays.
     [[nodiscard]] bool settle();
@@ -160,7 +162,15 @@ private:
     /// Whether an adult is left at the first place without the person.
     [[nodiscard]] bool can_spare(int person_id) const;
     [[nodiscard]] bool confirm_end_of_family(int person_id, const FamilyFile& target);
-    [[nodiscard]] bool carry_over(int person_id, FamilyFile target);
+    [[nodiscard]] bool carry_over(int person_id, int surname_id);
+    /// The family that stays behind, as it was stored; nullopt, and nothing is written, when others changed it.
+    [[nodiscard]] std::optional<FamilyFile> write_founding(int person_id);
+    /// The same with the family that took the person in; one that stays without people is gone.
+    [[nodiscard]] std::optional<std::pair<FamilyFile, FamilyFile>> write_transfer(int person_id, int surname_id);
+    /// The family as it is in the database, unless others changed it since it was read here.
+    [[nodiscard]] std::optional<FamilyFile> unchanged() const;
+    /// Says so and shows what is there now; always false.
+    [[nodiscard]] bool changed_elsewhere();
     [[nodiscard]] bool may_open(const QString& unsaved, const QString& no_person);
     [[nodiscard]] bool move_person(int index, int by);
     [[nodiscard]] bool move_row(RowPlace place, int by);

@@ -108,7 +108,16 @@ Saved FamilyEditor::save()
         return Saved::no;
     if (is_new() && !core::permitted(m_office, core::Area::add_family))
         return Saved::no;
-    return write() ? Saved::yes : Saved::no;
+    try {
+        return write() ? Saved::yes : Saved::no;
+    } catch (const core::DatabaseError& error) {
+        // Between the look and the save somebody else may have stored the same number.
+        const auto taken = error.constraint_broken() ? pin_clash(*m_office.session, m_file) : std::nullopt;
+        if (!taken)
+            throw;
+        m_office.dialogue.show(*taken);
+        return Saved::no;
+    }
 }
 
 bool FamilyEditor::write()
@@ -122,14 +131,19 @@ bool FamilyEditor::write()
     {
         core::Transaction transaction(session);
         theirs = load_family(session, m_file.family.Surname_ID);
-        if (theirs && changes_between(m_stored, *theirs).isEmpty()) {
+        if (theirs && !is_away(theirs->family) && changes_between(m_stored, *theirs).isEmpty()) {
             auto saved = save_family(session, m_file, m_office.clock.today());
             transaction.commit();
             settle_on(std::move(saved));
             return true;
         }
     }
-    return theirs ? meet(*theirs) : go_on_as_new();
+    if (!theirs)
+        return go_on_as_new();
+    if (!is_away(theirs->family))
+        return meet(*theirs);
+    m_stored.family = theirs->family; // Booked out meanwhile: from now on it is only shown.
+    return refuse_reading(u"save"_s);
 }
 
 bool FamilyEditor::meet(const FamilyFile& theirs)

@@ -1,6 +1,7 @@
 #include "people/family_editor.h"
 
 #include "core/entry.h"
+#include "people/family_changes.h"
 #include "people/family_roles.h"
 #include "people/family_rows.h"
 #include "people/family_store.h"
@@ -162,23 +163,51 @@ bool FamilyEditor::transfer_to_new(int index)
         return refuse(keeps_an_adult);
     if (!core::permitted(m_office, core::Area::add_family))
         return false;
-    core::Session& session = *m_office.session;
-    const auto today = m_office.clock.today();
-    FamilyFile from = m_stored;
-    FamilyFile founded = family_for(take_out(from, *person), m_stored);
-    const QString name = founded.people.front().Name;
-    note_transfer(founded, u"%1 came from the %2"_s.arg(name, family_of(from)), today);
-    note_transfer(from, u"%1 went to a new family file"_s.arg(name), today);
-    core::Transaction transaction(session);
-    founded.family.Surname_ID = add_family_row(session, founded, today);
-    founded.family.created = core::Date::from(today);
-    repoint(session, *person, founded.family.Surname_ID);
-    from = save_family(session, std::move(from), today);
-    (void)save_family(session, std::move(founded), today);
-    transaction.commit();
-    become(std::move(from));
+    auto left = write_founding(*person);
+    if (!left)
+        return changed_elsewhere();
+    const QString name = m_stored.people[static_cast<std::size_t>(place_of(m_stored, *person))].Name;
+    become(std::move(*left));
     m_office.dialogue.show(core::information(name + u" has now been transferred to a new family file."_s));
     return true;
+}
+
+std::optional<FamilyFile> FamilyEditor::write_founding(int person_id)
+{
+    core::Session& session = *m_office.session;
+    const auto today = m_office.clock.today();
+    core::Transaction transaction(session);
+    auto from = unchanged();
+    if (!from)
+        return std::nullopt;
+    FamilyFile founded = family_for(take_out(*from, person_id), *from);
+    const QString name = founded.people.front().Name;
+    note_transfer(founded, u"%1 came from the %2"_s.arg(name, family_of(*from)), today);
+    note_transfer(*from, u"%1 went to a new family file"_s.arg(name), today);
+    founded.family.Surname_ID = add_family_row(session, founded, today);
+    founded.family.created = core::Date::from(today);
+    repoint(session, person_id, founded.family.Surname_ID);
+    from = save_family(session, std::move(*from), today);
+    (void)save_family(session, std::move(founded), today);
+    transaction.commit();
+    return from;
+}
+
+std::optional<FamilyFile> FamilyEditor::unchanged() const
+{
+    auto now = load_family(*m_office.session, m_stored.family.Surname_ID);
+    return now && changes_between(m_stored, *now).isEmpty() ? now : std::nullopt;
+}
+
+bool FamilyEditor::changed_elsewhere()
+{
+    (void)refuse(u"Nobody was transferred, as this family file was changed elsewhere while it was open here"_s,
+                 u"It is shown as it is now. Please look at it and transfer the person again."_s);
+    if (hold(m_stored.family.Surname_ID) == Opened::gone) {
+        tell_gone();
+        forget_family();
+    }
+    return false;
 }
 
 bool FamilyEditor::transfer_to(int index, int surname_id)
@@ -205,7 +234,7 @@ bool FamilyEditor::transfer_to(int index, int surname_id)
         m_office.dialogue.show(family_is_full());
         return false;
     }
-    return (!last || confirm_end_of_family(*person, *target)) && carry_over(*person, std::move(*target));
+    return (!last || confirm_end_of_family(*person, *target)) && carry_over(*person, surname_id);
 }
 
 bool FamilyEditor::confirm_end_of_family(int person_id, const FamilyFile& target)
@@ -222,46 +251,53 @@ bool FamilyEditor::confirm_end_of_family(int person_id, const FamilyFile& target
         core::Answer::no);
 }
 
-bool FamilyEditor::carry_over(int person_id, FamilyFile target)
+bool FamilyEditor::carry_over(int person_id, int surname_id)
 {
-    core::Session& session = *m_office.session;
-    const auto today = m_office.clock.today();
-    const FamilyFile left = m_stored;
-    FamilyFile from = left;
-    target.people.push_back(take_out(from, person_id));
-    Person& person = target.people.back();
-    const QString name = person.Name;
-    if (person.other_surname.isEmpty() && from.family.surname != target.family.surname)
-        person.other_surname = from.family.surname;
-    else if (person.other_surname == target.family.surname)
-        person.other_surname.clear();
-    note_transfer(target, u"%1 came from the %2"_s.arg(name, family_of(from)), today);
-    note_transfer(from, u"%1 went to the %2"_s.arg(name, family_of(target)), today);
-
-    core::Transaction transaction(session);
-    repoint(session, person_id, target.family.Surname_ID);
-    if (!from.people.empty())
-        from = save_family(session, std::move(from), today);
-    target = save_family(session, std::move(target), today);
-    if (from.people.empty())
-        remove_family_rows(session, left.family.Surname_ID);
-    transaction.commit();
-
+    const auto carried = write_transfer(person_id, surname_id);
+    if (!carried)
+        return changed_elsewhere();
+    const auto& [from, target] = *carried;
+    const QString name = m_stored.people[static_cast<std::size_t>(place_of(m_stored, person_id))].Name;
     if (from.people.empty()) {
-        FamilyFile emptied = left;
-        emptied.people.clear();
         forget_family();
-        remove_family_files(m_office, emptied);
+        remove_family_files(m_office, from);
     } else {
-        become(std::move(from));
+        become(from);
     }
-    const QString surname = target.family.surname;
     m_office.dialogue.show(core::information(
         u"%1 has now been transferred to the %2 family file as a %3. If you need to position %1 to a different "
         "position in the %2 family then enter the family file and use the positioning arrows under the names list box "
-        "on the individual tab to move the person to a different position."_s.arg(name, surname,
+        "on the individual tab to move the person to a different position."_s.arg(name, target.family.surname,
                                                                                   role_in(target, person_id))));
     return true;
+}
+
+std::optional<std::pair<FamilyFile, FamilyFile>> FamilyEditor::write_transfer(int person_id, int surname_id)
+{
+    core::Session& session = *m_office.session;
+    const auto today = m_office.clock.today();
+    core::Transaction transaction(session);
+    auto from = unchanged();
+    auto target = load_family(session, surname_id);
+    if (!from || !target || std::ssize(target->people) >= most_people)
+        return std::nullopt;
+    target->people.push_back(take_out(*from, person_id));
+    Person& person = target->people.back();
+    const QString name = person.Name;
+    if (person.other_surname.isEmpty() && from->family.surname != target->family.surname)
+        person.other_surname = from->family.surname;
+    else if (person.other_surname == target->family.surname)
+        person.other_surname.clear();
+    note_transfer(*target, u"%1 came from the %2"_s.arg(name, family_of(*from)), today);
+    note_transfer(*from, u"%1 went to the %2"_s.arg(name, family_of(*target)), today);
+    repoint(session, person_id, surname_id);
+    target = save_family(session, std::move(*target), today);
+    if (from->people.empty())
+        remove_family_rows(session, from->family.Surname_ID);
+    else
+        from = save_family(session, std::move(*from), today);
+    transaction.commit();
+    return std::pair(std::move(*from), std::move(*target));
 }
 
 bool FamilyEditor::may_open(const QString& unsaved, const QString& no_person)

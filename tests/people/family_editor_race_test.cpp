@@ -118,6 +118,36 @@ TEST_P(FamilyRaceTest, VisitsItemNamesAndOrderOfDatesAreNoChange)
     EXPECT_EQ(stored(key).visits.size(), 1u);
 }
 
+TEST_P(FamilyRaceTest, ATransferOverwritesNothingThatOthersStored)
+{
+    const int other = add(u"Smith"_s, {u"Eve"_s});
+    const auto refusal = u"Nobody was transferred, as this family file was changed elsewhere while it was open here"_s;
+    change_elsewhere([](FamilyFile& file) { file.address.phone = u"5550 1234"_s; });
+    dialogue().expect_box(refusal);
+    EXPECT_FALSE(editor->transfer_to_new(2));
+    EXPECT_EQ(editor->file().address.phone, u"5550 1234");
+    change_elsewhere([](FamilyFile& file) { file.address.res_map = u"12"_s; });
+    dialogue().expect_box(refusal);
+    EXPECT_FALSE(editor->transfer_to(2, other));
+    EXPECT_EQ(names(stored(key)).size(), 3);
+    EXPECT_EQ(stored(key).address.phone, u"5550 1234");
+    EXPECT_EQ(stored(key).address.res_map, u"12");
+
+    dialogue().expect_box(u"Cy has now been transferred to a new family file."_s);
+    EXPECT_TRUE(editor->transfer_to_new(2));
+    EXPECT_EQ(stored(key).address.res_map, u"12");
+}
+
+TEST_P(FamilyRaceTest, AFamilyBookedOutMeanwhileIsNotWritten)
+{
+    session().execute(u"UPDATE [tbl_surname] SET [booked_out]=-1,[booked_out_person]='Ruth';"_s);
+    type_phone(*editor, u"5550 9999"_s);
+    dialogue().expect_box(u"Unable to save this family file as it is booked out"_s);
+    EXPECT_EQ(editor->save(), Saved::no);
+    EXPECT_TRUE(stored(key).address.phone.isEmpty());
+    EXPECT_FALSE(editor->may_edit());
+}
+
 TEST_P(FamilyRaceTest, SeveralProcessesEditOneFamilyInTurnAndLoseNothing)
 {
     constexpr int saves = 8;
