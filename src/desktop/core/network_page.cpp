@@ -26,8 +26,7 @@ namespace {
 
 constexpr std::array column_shares{46, 32, 22};
 
-const core::Message save_question{.text = u"The network setting has been altered. Do you wish to save it?"_s,
-                                  .icon = core::Icon::question};
+const QString save_question = u"The network setting has been altered. Do you wish to save it?"_s;
 
 QLabel* make_explanation(const QString& text)
 {
@@ -159,18 +158,12 @@ void NetworkPage::print()
 
 bool NetworkPage::leave()
 {
-    if (!m_setup.altered())
-        return true;
-    const auto wanted = m_desk.office.dialogue.confirm_or_cancel(save_question);
-    if (!wanted)
-        return false;
-    if (*wanted)
-        return save();
-    if (auto stored = core::NetworkSetup::open(m_desk.office))
-        m_setup = std::move(*stored);
-    show_place();
-    show_state();
-    return true;
+    return save_or_drop(m_desk.office.dialogue, save_question, [this] {
+        if (auto stored = core::NetworkSetup::open(m_desk.office))
+            m_setup = std::move(*stored);
+        show_place();
+        show_state();
+    });
 }
 
 void NetworkPage::show_place()

@@ -199,17 +199,8 @@ void FusionPage::drop()
 
 bool FusionPage::leave()
 {
-    if (!altered())
-        return true;
-    const core::Message question{.text = u"Do you wish to save the changes made to the fusions?"_s,
-                                 .icon = core::Icon::question};
-    const auto wanted = m_desk.office.dialogue.confirm_or_cancel(question);
-    if (!wanted)
-        return false;
-    if (*wanted)
-        return save();
-    drop(); // The page may stay, for another one may not let go.
-    return true;
+    return save_or_drop(m_desk.office.dialogue, u"Do you wish to save the changes made to the fusions?"_s,
+                        [this] { drop(); });
 }
 
 } // namespace kindrel::desktop

@@ -71,4 +71,17 @@ void Page::set_content(QWidget* content)
     m_column->addWidget(content, 1);
 }
 
+bool Page::save_or_drop(core::Dialogue& dialogue, const QString& question, const std::function<void()>& drop)
+{
+    if (!altered())
+        return true;
+    const auto wanted = dialogue.confirm_or_cancel({.text = question, .icon = core::Icon::question});
+    if (!wanted)
+        return false;
+    if (*wanted)
+        return save();
+    drop(); // The page may stay, for another one may not let go.
+    return true;
+}
+
 } // namespace kindrel::desktop

@@ -1,6 +1,10 @@
 #pragma once
 
+#include "core/dialogue.h"
+
 #include <QWidget>
+
+#include <functional>
 
 class QAction;
 class QHBoxLayout;
@@ -55,6 +59,10 @@ protected:
     /// A button at the right of the header.
     QAction* add_action(const QString& text, const QString& icon_name, const QString& tip);
     void set_content(QWidget* content);
+    /// How a page that is saved as a whole leaves: what is altered is saved or, by `drop`, forgotten, as the person
+    /// answers the question. False when the page must stay.
+    [[nodiscard]] bool save_or_drop(core::Dialogue& dialogue, const QString& question,
+                                    const std::function<void()>& drop);
 
 private:
     QLabel* m_title;
