@@ -128,7 +128,7 @@ double read_families(Church& church)
     for (std::size_t first = 0; first < keys.size(); first += at_once) {
         const auto count = std::min(at_once, keys.size() - first);
         static_cast<void>(people::load_families(*church.office.session, std::span(keys).subspan(first, count),
-                                                people::Extent::names_and_address));
+                                                people::Part::address));
     }
     return seconds_since(start);
 }

@@ -71,10 +71,10 @@ QHash<int, people::DisclosedFamily> families_of(core::Office& office, std::span<
 void add_rows(Listing& listing, core::Office& office, std::span<const people::Member> members,
               const std::vector<PeopleField>& fields)
 {
-    const bool whole =
-        std::ranges::any_of(fields, [](const auto& field) { return field.extent == people::Extent::whole; });
-    const auto families =
-        families_of(office, members, whole ? people::Extent::whole : people::Extent::names_and_address);
+    people::Extent extent;
+    for (const auto& field : fields)
+        extent |= field.extent;
+    const auto families = families_of(office, members, extent);
     for (const auto& member : members) {
         const auto family = families.constFind(member.surname_id);
         if (family == families.constEnd())

@@ -11,6 +11,7 @@ namespace kindrel::apps {
 using namespace Qt::StringLiterals;
 using people::DisclosedFamily;
 using people::Extent;
+using people::Part;
 using people::Person;
 
 namespace {
@@ -80,9 +81,9 @@ QJsonValue age_of(const Person& person, const QDate& today)
 }
 
 void add_items(std::vector<PeopleField>& to, const QString& name, const QString& heading,
-               std::vector<people::LinkRow> Person::*rows)
+               std::vector<people::LinkRow> Person::*rows, Part part)
 {
-    to.push_back({name, heading, Extent::whole, [rows](const DisclosedFamily&, const Person& person) {
+    to.push_back({name, heading, part, [rows](const DisclosedFamily&, const Person& person) {
                       QStringList texts;
                       for (const auto& row : person.*rows)
                           texts += row.text;
@@ -94,7 +95,7 @@ void add_items(std::vector<PeopleField>& to, const QString& name, const QString&
 
 std::vector<PeopleField> people_list_fields(const QDate& today)
 {
-    constexpr auto names = Extent::names_and_address;
+    constexpr auto names = Part::address;
     std::vector<PeopleField> fields{
         {u"person_id"_s, u"Key"_s, names,
          [](const auto&, const auto& person) {
@@ -120,18 +121,18 @@ std::vector<PeopleField> people_list_fields(const QDate& today)
          [](const auto& family, const auto&) {
              return family.residential() ? family.residential()->shown_postcode() : QString();
          }},
-        {u"age"_s, u"Age"_s, Extent::whole,
+        {u"age"_s, u"Age"_s, Part::details,
          [today](const auto&, const auto& person) {
              return age_of(person, today);
          }},
     };
     add_stored(fields, people::people_fields(), names);
-    add_stored(fields, people::detail_fields(), Extent::whole);
+    add_stored(fields, people::detail_fields(), Part::details);
     add_stored(fields, people::address_fields(), names);
-    add_items(fields, u"status"_s, u"Status"_s, &Person::status);
-    add_items(fields, u"groups"_s, u"Groups"_s, &Person::groups);
-    add_items(fields, u"ministries"_s, u"Ministries"_s, &Person::ministries);
-    add_items(fields, u"occupations"_s, u"Occupations"_s, &Person::occupations);
+    add_items(fields, u"status"_s, u"Status"_s, &Person::status, Part::status);
+    add_items(fields, u"groups"_s, u"Groups"_s, &Person::groups, Part::groups);
+    add_items(fields, u"ministries"_s, u"Ministries"_s, &Person::ministries, Part::ministries);
+    add_items(fields, u"occupations"_s, u"Occupations"_s, &Person::occupations, Part::occupations);
     return fields;
 }
 

@@ -14,7 +14,7 @@ struct PeopleField
 {
     QString name; ///< The stored one, where there is one.
     QString heading;
-    people::Extent extent = people::Extent::names_and_address; ///< How much of a family it needs.
+    people::Extent extent = people::Part::address; ///< How much of a family it needs.
     std::function<QJsonValue(const people::DisclosedFamily&, const people::Person&)> value;
 };
 

@@ -6,6 +6,8 @@
 
 #include <algorithm>
 #include <array>
+#include <iterator>
+#include <vector>
 
 namespace kindrel::output {
 
@@ -13,17 +15,31 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr auto directories = "Church Directories";
-
-constexpr std::array reports{
-    ReportDefinition{"k10", directories, "Directory 1",
-                     "One column: names, address, phone, fax, e-mail and map details", core::Area::report_outputs,
-                     write_directory, &directory_layouts[0]},
+/// The families in the order of the tree.
+constexpr std::array families{
+    directory_reports,
 };
+
+std::vector<ReportDefinition> all_reports()
+{
+    std::vector<ReportDefinition> reports;
+    for (const auto& family : families)
+        std::ranges::copy(family(), std::back_inserter(reports));
+    return reports;
+}
 
 const ReportLayout& layout_of(const ReportDefinition& report)
 {
     return *static_cast<const ReportLayout*>(report.layout);
+}
+
+pages::PageSetup page_of(const ReportDefinition& report, const ReportInput& input)
+{
+    if (report.page)
+        return report.page(input);
+    auto setup = layout_of(report).page;
+    setup.paper = input.options.paper;
+    return setup;
 }
 
 bool is_called(const ReportDefinition& report, QStringView name)
@@ -46,11 +62,13 @@ bool may_run(const ReportDefinition& report, const ReportInput& input)
 
 std::span<const ReportDefinition> catalogue()
 {
+    static const auto reports = all_reports();
     return reports;
 }
 
 const ReportDefinition* find_report(QStringView key_or_leaf)
 {
+    const auto reports = catalogue();
     const auto found =
         std::ranges::find_if(reports, [&](const auto& report) { return is_called(report, key_or_leaf); });
     return found == reports.end() ? nullptr : &*found;
@@ -62,12 +80,11 @@ bool run_report(const ReportDefinition& report, const ReportInput& input, core::
     if (!may_run(report, input))
         return false;
     const auto& layout = layout_of(report);
-    auto setup = layout.page;
     const auto& options = input.options;
-    setup.paper = options.paper;
     const double text_size = layout.text_size * options.text_percent / 100;
-    pages::Flow flow(spool, setup, pages::TypeScale::around({.size = text_size}));
-    decorate(flow, options.title.isEmpty() ? QString::fromUtf8(layout.title) : options.title, input);
+    pages::Flow flow(spool, page_of(report, input), pages::TypeScale::around({.size = text_size}));
+    if (layout.decorated)
+        decorate(flow, options.title.isEmpty() ? QString::fromUtf8(layout.title) : options.title, input);
     if (!report.write(input, report.layout, progress, flow))
         return false;
     flow.finish();

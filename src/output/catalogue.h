@@ -23,6 +23,7 @@ struct ReportDefinition
     core::Area area;
     bool (*write)(const ReportInput&, const void* layout, core::Progress&, pages::Flow&); ///< False when cancelled.
     const void* layout; ///< A row of the family's own table, which begins with a ReportLayout.
+    pages::PageSetup (*page)(const ReportInput&) = nullptr; ///< Unset: the layout's, on the paper of the run.
 };
 
 [[nodiscard]] std::span<const ReportDefinition> catalogue();

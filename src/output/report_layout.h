@@ -11,6 +11,7 @@ struct ReportLayout
     const char* title; ///< Heads every page.
     pages::PageSetup page = {};
     double text_size = 9.5; ///< Of the body, in points; headings follow it.
+    bool decorated = true;  ///< Whether pages carry header and footer; sheets of labels do not.
 };
 
 } // namespace kindrel::output

@@ -169,13 +169,8 @@ void load_people_rows(Session& session, const Scope& scope, const FamilyMap& fam
     }
 }
 
-void load_person_rows(Session& session, const Scope& scope, std::vector<FamilyFile>& files)
+void load_details(Session& session, const Scope& scope, const PersonMap& people)
 {
-    PersonMap people;
-    for (auto& file : files) {
-        for (auto& person : file.people)
-            people.insert(person.person_id, &person);
-    }
     auto details = scope.people(session, "tbl_personal_details");
     const auto key = details.column(u"person_id");
     const FieldReader reader(details, detail_fields());
@@ -183,6 +178,10 @@ void load_person_rows(Session& session, const Scope& scope, std::vector<FamilyFi
         if (auto* person = people.value(row.integer(key)))
             reader.read(row, *person);
     }
+}
+
+void load_pins(Session& session, const Scope& scope, const PersonMap& people)
+{
     auto pins = scope.people(session, "tbl_pin");
     const auto holder = pins.column(u"person_id");
     const auto pin = pins.column(u"personal_pin");
@@ -190,24 +189,53 @@ void load_person_rows(Session& session, const Scope& scope, std::vector<FamilyFi
         if (auto* person = people.value(row.integer(holder)))
             person->personal_pin = row.text(pin);
     }
-    for (const auto& [table, list] : person_links())
-        load_links(scope.people(session, table.load_query, order_of(table)), table, list, people);
+}
+
+/// What hangs on the people.
+void load_person_rows(Session& session, const Scope& scope, std::vector<FamilyFile>& files, Extent extent)
+{
+    PersonMap people;
+    for (auto& file : files) {
+        for (auto& person : file.people)
+            people.insert(person.person_id, &person);
+    }
+    if (extent & (Part::details | Part::occupations))
+        load_details(session, scope, people);
+    if (extent & Part::pins)
+        load_pins(session, scope, people);
+    for (const auto& [table, list] : person_links()) {
+        if (extent & table.part)
+            load_links(scope.people(session, table.load_query, order_of(table)), table, list, people);
+    }
 }
 
 /// What hangs on the families themselves.
-void load_belongings(Session& session, const Scope& scope, const FamilyMap& families)
+void load_belongings(Session& session, const Scope& scope, const FamilyMap& families, Extent extent)
 {
-    load_of_families<RecordAccess>(scope.families(session, "tbl_record_access"), families, access_fields(),
-                                   [](FamilyFile& file) -> RecordAccess& { return file.access; });
-    load_of_families<OtherContact>(
-        scope.families(session, "tbl_other_contact", " ORDER BY [position]"), families, other_contact_fields(),
-        [](FamilyFile& file) -> OtherContact& { return file.other_contacts.emplace_back(); });
-    load_of_families<Event>(scope.families(session, "Qry_events_load", " ORDER BY [e_position]"), families,
-                            event_fields(), [](FamilyFile& file) -> Event& { return file.events.emplace_back(); });
-    load_of_families<Visit>(scope.families(session, "tbl_visitation", " ORDER BY [date]"), families, visit_fields(),
-                            [](FamilyFile& file) -> Visit& { return file.visits.emplace_back(); });
-    for (const auto& [table, list] : family_links())
-        load_links(scope.families(session, table.load_query, order_of(table)), table, list, families);
+    if (extent & Part::access)
+        load_of_families<RecordAccess>(scope.families(session, "tbl_record_access"), families, access_fields(),
+                                       [](FamilyFile& file) -> RecordAccess& { return file.access; });
+    if (extent & Part::other_contacts)
+        load_of_families<OtherContact>(
+            scope.families(session, "tbl_other_contact", " ORDER BY [position]"), families, other_contact_fields(),
+            [](FamilyFile& file) -> OtherContact& { return file.other_contacts.emplace_back(); });
+    if (extent & Part::events)
+        load_of_families<Event>(scope.families(session, "Qry_events_load", " ORDER BY [e_position]"), families,
+                                event_fields(), [](FamilyFile& file) -> Event& { return file.events.emplace_back(); });
+    if (extent & Part::visits)
+        load_of_families<Visit>(scope.families(session, "tbl_visitation", " ORDER BY [date]"), families, visit_fields(),
+                                [](FamilyFile& file) -> Visit& { return file.visits.emplace_back(); });
+    for (const auto& [table, list] : family_links()) {
+        if (extent & table.part)
+            load_links(scope.families(session, table.load_query, order_of(table)), table, list, families);
+    }
+}
+
+void load_address(Session& session, const Scope& scope, const FamilyMap& families)
+{
+    load_of_families<Address>(scope.families(session, "tbl_address"), families, address_fields(),
+                              [](FamilyFile& file) -> Address& { return file.address; });
+    load_suburbs(session, scope, families);
 }
 
 } // namespace
@@ -222,13 +250,10 @@ std::vector<FamilyFile> load_families(Session& session, std::span<const int> sur
         lend_families(session, surname_ids);
     const auto families = load_family_rows(session, scope, surname_ids, files);
     load_people_rows(session, scope, families);
-    load_of_families<Address>(scope.families(session, "tbl_address"), families, address_fields(),
-                              [](FamilyFile& file) -> Address& { return file.address; });
-    load_suburbs(session, scope, families);
-    if (extent == Extent::whole) {
-        load_belongings(session, scope, families);
-        load_person_rows(session, scope, files);
-    }
+    if (extent & Part::address)
+        load_address(session, scope, families);
+    load_belongings(session, scope, families, extent);
+    load_person_rows(session, scope, files, extent);
     return files;
 }
 

@@ -7,16 +7,33 @@
 
 namespace kindrel::people {
 
-/// How much of a family is read: a directory needs neither details nor items.
-enum class Extent {
-    whole,
-    names_and_address ///< The family, its people's names and flags, address and suburbs.
+/// What can be read of a family beside itself and its people's names and flags, which always are.
+enum class Part : quint32 {
+    address = 1 << 0, ///< With the suburbs.
+    details = 1 << 1, ///< Of the people.
+    pins = 1 << 2,
+    status = 1 << 3,
+    groups = 1 << 4,
+    ministries = 1 << 5,
+    flexi = 1 << 6,
+    dates = 1 << 7,
+    occupations = 1 << 8, ///< Brings the details along, which tell whether they are hidden.
+    family_groups = 1 << 9,
+    family_dates = 1 << 10,
+    other_contacts = 1 << 11,
+    events = 1 << 12,
+    visits = 1 << 13,
+    access = 1 << 14
 };
+Q_DECLARE_FLAGS(Extent, Part)
+Q_DECLARE_OPERATORS_FOR_FLAGS(Extent)
+
+inline constexpr Extent whole_family{QFlag((1 << 15) - 1)};
 
 /// The families of these keys with everything that hangs on them, in the order of the keys; a key without a row is
 /// passed over. A handful of statements, whatever their number. Throws core::DatabaseError.
 [[nodiscard]] std::vector<FamilyFile> load_families(core::Session& session, std::span<const int> surname_ids,
-                                                    Extent extent = Extent::whole);
+                                                    Extent extent = whole_family);
 
 /// Nullopt when the family is gone.
 [[nodiscard]] std::optional<FamilyFile> load_family(core::Session& session, int surname_id);

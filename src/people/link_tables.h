@@ -1,7 +1,7 @@
 #pragma once
 
 #include "core/entity.h"
-#include "people/records.h"
+#include "people/family_store.h"
 
 #include <span>
 
@@ -20,6 +20,7 @@ struct LinkTable
     const char* date;
     const char* field;
     const char* tagged;
+    Part part; ///< Under which its rows are read.
 };
 
 struct PersonLink

@@ -105,6 +105,14 @@ int next_school_year(int year)
     return year == -1 ? 1 : year + 1;
 }
 
+QString school_year_text(const std::optional<int>& year)
+{
+    constexpr int kinder = -2;
+    if (!year)
+        return {};
+    return year == kinder ? u"Kinder"_s : QString::number(*year);
+}
+
 QString family_summary(const FamilyFile& file, bool use_preferred_names)
 {
     const auto household = household_of(file.people);

@@ -30,6 +30,8 @@ struct Household
 
 /// The year after `year`: zero is skipped, so -1 is followed by 1.
 [[nodiscard]] int next_school_year(int year);
+/// "3", "-1", "Kinder"; empty for who is not at school.
+[[nodiscard]] QString school_year_text(const std::optional<int>& year);
 
 /// The family in the lines of the visitation list, joined by CR LF.
 [[nodiscard]] QString family_summary(const FamilyFile& file, bool use_preferred_names);

@@ -133,8 +133,7 @@ TEST_F(DirectoryTest, EveryLayoutPrintsTheSameContentAndItsLetterBands)
             const output::DirectoryLayout layout{
                 {.title = "Church Directory", .page = {.columns = shape == output::EntryShape::stacked ? 2 : 1}},
                 shape,
-                bands,
-                output::family_contacts};
+                bands};
             report.layout = &layout;
             EXPECT_EQ(told(entries()), bands == output::LetterBands::on ? banded : plain);
         }

@@ -55,7 +55,7 @@ std::optional<std::vector<FoundPerson>> read_people(Desk& desk, const people::Wo
     bool cancelled = false;
     for (std::size_t first = 0; first < families.size() && !cancelled; first += families_per_step) {
         const auto some = std::span(families).subspan(first, std::min(families_per_step, families.size() - first));
-        for (auto& file : people::load_families(*desk.office.session, some, people::Extent::names_and_address))
+        for (auto& file : people::load_families(*desk.office.session, some, people::Part::address))
             add_family(known, people::disclose(std::move(file), disclosure));
         cancelled = !desk.progress.step();
     }

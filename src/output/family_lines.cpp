@@ -1,0 +1,189 @@
+#include "output/family_lines.h"
+
+#include "pages/text_metrics.h"
+
+#include <array>
+
+namespace kindrel::output {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// A caption, exactly, and where its value lies.
+template <class Record>
+struct Contact
+{
+    const char16_t* caption;
+    QString Record::*value;
+};
+
+using FamilyContact = Contact<people::Address>;
+using PersonContact = Contact<people::Person>;
+
+constexpr std::array phone_and_fax{FamilyContact{u"Family Ph: ", &people::Address::phone},
+                                   FamilyContact{u"  Family Fax: ", &people::Address::family_fax}};
+constexpr std::array family_mobile{FamilyContact{u"Family Mobile: ", &people::Address::family_mobile}};
+constexpr std::array family_email{FamilyContact{u"Family Email: ", &people::Address::family_email}};
+constexpr std::array map_and_reference{FamilyContact{u"Map: ", &people::Address::res_map},
+                                       FamilyContact{u" Ref: ", &people::Address::res_ref}};
+constexpr std::array<std::span<const FamilyContact>, 4> family_lines{phone_and_fax, family_mobile, family_email,
+                                                                     map_and_reference};
+
+constexpr std::array other_names{PersonContact{u"Other Surname: ", &people::Person::other_surname},
+                                 PersonContact{u"Middle Name: ", &people::Person::middle_name}};
+constexpr std::array phones{PersonContact{u"Mobile: ", &people::Person::mobile_phone},
+                            PersonContact{u"Business Phone: ", &people::Person::business_phone},
+                            PersonContact{u"Business Fax: ", &people::Person::business_fax}};
+constexpr std::array emails{PersonContact{u"Email: ", &people::Person::Personal_email},
+                            PersonContact{u"Business Email: ", &people::Person::business_email}};
+constexpr std::array<std::span<const PersonContact>, 3> personal_lines{other_names, phones, emails};
+
+template <class Record>
+std::vector<pages::CaptionValue> values_of(std::span<const Contact<Record>> contacts, const Record& record)
+{
+    std::vector<pages::CaptionValue> pairs;
+    for (const auto& contact : contacts) {
+        if (const auto& value = record.*contact.value; !value.isEmpty())
+            pairs.push_back({QStringView(contact.caption).toString(), value});
+    }
+    return pairs;
+}
+
+void add_line(CaptionLines& lines, std::vector<pages::CaptionValue> line)
+{
+    if (!line.empty())
+        lines.push_back(std::move(line));
+}
+
+/// Where an address of one kind lies.
+struct AddressFields
+{
+    QString people::Address::*street, people::Address::*street2, people::Address::*state, people::Address::*country;
+};
+constexpr AddressFields residential{&people::Address::res_street, &people::Address::res_street2,
+                                    &people::Address::res_state, &people::Address::res_country};
+constexpr AddressFields postal{&people::Address::post_street, &people::Address::post_street2,
+                               &people::Address::post_state, &people::Address::post_country};
+
+const AddressFields& fields_of(people::SuburbType type)
+{
+    return type == people::SuburbType::postal ? postal : residential;
+}
+
+} // namespace
+
+QString joined(QStringView separator, std::initializer_list<QString> parts)
+{
+    QString text;
+    for (const auto& part : parts) {
+        if (!text.isEmpty() && !part.isEmpty())
+            text += separator;
+        text += part;
+    }
+    return text;
+}
+
+QString names_of(const people::DisclosedFamily& family, std::span<const people::Person* const> people,
+                 QStringView separator)
+{
+    QString text;
+    for (const auto* person : people) {
+        if (!text.isEmpty())
+            text += separator;
+        text += family.name(*person);
+    }
+    return text;
+}
+
+QString addressee_of(const ListedFamily& listed)
+{
+    const auto& household = listed.household;
+    const auto& addressed = household.adults.empty() ? household.children : household.adults;
+    return joined(u" ", {names_of(listed.family, addressed, u" & "), listed.family.family().surname});
+}
+
+QString suburb_line(const people::DisclosedFamily& family, people::SuburbType type)
+{
+    const auto& address = family.address();
+    const auto& fields = fields_of(type);
+    const auto* suburb = type == people::SuburbType::postal ? family.postal() : family.residential();
+    if (suburb)
+        return joined(u" ", {suburb->suburb, address.*fields.state, suburb->shown_postcode()});
+    const auto street_known = !(address.*fields.street).isEmpty() || !(address.*fields.street2).isEmpty();
+    return joined(u" ", {street_known ? u"Unknown Suburb"_s : QString(), address.*fields.state});
+}
+
+QStringList address_lines(const people::DisclosedFamily& family, people::SuburbType type)
+{
+    const auto& address = family.address();
+    const auto& fields = fields_of(type);
+    QStringList lines{address.*fields.street, address.*fields.street2, suburb_line(family, type),
+                      address.*fields.country};
+    lines.removeAll(QString());
+    return lines;
+}
+
+QStringList mailing_lines(const people::DisclosedFamily& family)
+{
+    const auto lines = address_lines(family, people::SuburbType::postal);
+    return lines.isEmpty() ? address_lines(family, people::SuburbType::residential) : lines;
+}
+
+QString shown(const people::DisclosedFamily& family, const std::optional<core::Date>& date)
+{
+    return date ? family.shown(*date) : QString();
+}
+
+CaptionLines family_contacts(const people::DisclosedFamily& family)
+{
+    CaptionLines lines;
+    for (const auto& line : family_lines)
+        add_line(lines, values_of(line, family.address()));
+    return lines;
+}
+
+CaptionLines personal_contacts(const people::DisclosedFamily& family, const people::Person& person)
+{
+    CaptionLines lines;
+    std::vector<pages::CaptionValue> first;
+    if (person.birthdate)
+        first.push_back({u"Birth Date: "_s, family.shown(*person.birthdate)});
+    if (person.school_year)
+        first.push_back({u"School Year: "_s, people::school_year_text(person.school_year)});
+    add_line(lines, std::move(first));
+    for (const auto& line : personal_lines)
+        add_line(lines, values_of(line, person));
+    return lines;
+}
+
+void write_line(pages::Writer& place, const QString& text, const pages::TextStyle& style)
+{
+    if (!text.isEmpty())
+        place.line(text, style);
+}
+
+void write_lines(pages::Writer& place, const QStringList& lines, const pages::TextStyle& style)
+{
+    for (const auto& line : lines)
+        write_line(place, line, style);
+}
+
+void write_contacts(pages::Writer& place, const CaptionLines& lines)
+{
+    for (const auto& line : lines) {
+        qreal width = 0;
+        for (const auto& pair : line) {
+            width += place.metrics().width(pair.caption, place.type().caption);
+            width += place.metrics().width(pair.value, place.type().body);
+        }
+        if (width <= place.width()) {
+            place.captions(line);
+            continue;
+        }
+        for (const auto& pair : line)
+            place.captions({&pair, 1});
+    }
+}
+
+} // namespace kindrel::output
