@@ -3,6 +3,8 @@
 #include <QMarginsF>
 #include <QSizeF>
 
+#include <optional>
+
 namespace kindrel::pages {
 
 enum class Paper { a4, letter };
@@ -18,6 +20,7 @@ struct PageSetup
     int columns = 1; ///< 1 to 4.
     qreal column_gap = 18;
     ColumnRule column_rule = ColumnRule::none;
+    std::optional<QSizeF> sheet = {}; ///< The exact size as it lies, whatever paper and orientation say.
 
     [[nodiscard]] QSizeF size() const;
     [[nodiscard]] qreal body_width() const { return size().width() - margins.left() - margins.right(); }

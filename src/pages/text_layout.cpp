@@ -170,8 +170,11 @@ Blocks Paragraph::lines(qreal width)
 
     Blocks blocks;
     const auto count = m_layout.lineCount();
-    for (int i = 0; i < count; ++i)
+    for (int i = 0; i < count; ++i) {
+        // A line is read with the tab stops that it was laid out with, which count from its own start.
+        set_options(m_style.indent + (i == 0 ? m_style.first_indent : 0));
         blocks.push_back(block_of(m_layout.lineAt(i), i == count - 1, rooms[size_t(i)]));
+    }
     return blocks;
 }
 

@@ -120,6 +120,19 @@ TEST_F(TextTest, LineBreaksAndTabsOfANoteHold)
     EXPECT_GT(texts[2].at.y(), texts[0].at.y());
 }
 
+TEST_F(TextTest, ABulletHangsOutAndItsTextStandsAtTheIndentOnEveryLine)
+{
+    auto flow = narrow(300);
+    flow.paragraph({{u"1.\t"_s + u"Some words "_s.repeated(30), flow.type().body}},
+                   {.indent = 40, .first_indent = -40, .tabs = {40}});
+    flow.finish();
+    const auto texts = placed();
+    ASSERT_GT(texts.size(), 2u);
+    EXPECT_NEAR(texts[0].at.x(), 40, 0.01);
+    for (const auto& text : std::span(texts).subspan(1))
+        EXPECT_NEAR(text.at.x(), 80, 0.01) << text.text.toStdString();
+}
+
 TEST_F(TextTest, AnIndentMovesWhatIsWrittenDuringItsLife)
 {
     auto flow = narrow(300);
