@@ -6,6 +6,7 @@ pkg_check_modules(pqxx REQUIRED IMPORTED_TARGET libpqxx)
 pkg_check_modules(pq REQUIRED IMPORTED_TARGET libpq)
 pkg_check_modules(sqlite3 REQUIRED IMPORTED_TARGET sqlite3)
 pkg_check_modules(sodium REQUIRED IMPORTED_TARGET libsodium)
+pkg_check_modules(zip REQUIRED IMPORTED_TARGET libzip)
 
 find_path(ZINT_INCLUDE_DIR zint.h REQUIRED)
 find_library(ZINT_LIBRARY zint REQUIRED)

@@ -52,6 +52,7 @@ constexpr std::array flags{
 constexpr std::array texts{
     Field<QString>{u"booked_out_code", &Settings::booked_out_code},
     Field<QString>{u"vision", &Settings::vision},
+    Field<QString>{u"church_vision", &Settings::church_vision},
     Field<QString>{u"vision_font", &Settings::vision_font},
     Field<QString>{u"footer_vision", &Settings::footer_vision},
     Field<QString>{u"footer_vision_line2", &Settings::footer_vision_line2},

@@ -37,6 +37,7 @@ struct Settings
     int vision_format = 0;    ///< 0 plain, 1 bold, 2 italic, 3 both.
     bool vision_line = false;
     bool vision_thick_line = false;
+    QString church_vision; ///< What reports print; empty: the text of `vision`.
     QString footer_vision;
     QString footer_vision_line2;
     bool footer_line = false;

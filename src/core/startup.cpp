@@ -35,6 +35,7 @@ constexpr std::array steps{
     Step{startup_steps::check_busy_marker},
     Step{startup_steps::set_caption},
     Step{startup_steps::open_database},
+    Step{startup_steps::settle_restore},
     Step{startup_steps::check_version},
     Step{startup_steps::load_settings},
     Step{startup_steps::count_start, For::desktop},

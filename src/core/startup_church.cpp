@@ -2,8 +2,10 @@
 
 #include "core/backup_rotation.h"
 #include "core/compaction.h"
+#include "core/logo.h"
 #include "core/marker.h"
 #include "core/open_church.h"
+#include "core/restore_swap.h"
 #include "core/schema.h"
 #include "core/upgrade.h"
 
@@ -74,18 +76,6 @@ bool attempt(Office& office, const QString& sentence, Work&& work)
     return !failure;
 }
 
-QString path_if_there(const Paths& paths, Folder folder, const QString& name)
-{
-    return !name.isEmpty() && paths.exists(folder, name) ? paths.file(folder, name) : QString();
-}
-
-/// A logo lies with the church's pictures, or in the program folder.
-QString logo_path(const Paths& paths, const QString& name)
-{
-    const QString own = path_if_there(paths, Folder::images, name);
-    return own.isEmpty() ? path_if_there(paths, Folder::program, name) : own;
-}
-
 QString name_of_church(const Office& office)
 {
     if (office.church == training_church)
@@ -141,9 +131,8 @@ bool rotate_backups(State& state)
 bool find_logo(State& state)
 {
     Office& office = state.office;
-    const QString own = read_or_default(office, side_files::workstation_logo).text("logo");
     office.logo =
-        own.isEmpty() ? path_if_there(office.paths, Folder::program, u"Logo.jpg"_s) : logo_path(office.paths, own);
+        workstation_logo_path(office.paths, read_or_default(office, side_files::workstation_logo).text("logo"));
     return true;
 }
 
@@ -208,6 +197,21 @@ bool open_database(State& state)
     if (office.session && !state.backup_fault.isEmpty())
         office.dialogue.show(information(rotation_failed, state.backup_fault));
     return office.session != nullptr;
+}
+
+bool settle_restore(State& state)
+{
+    Office& office = state.office;
+    if (!restore_unsettled(office.paths))
+        return true;
+    const auto busy = Marker::take(office.paths, side_files::busy); // It may be under way at another workstation.
+    if (!busy) {
+        office.dialogue.show(busy_notice());
+        return false;
+    }
+    settle_interrupted_restore(office.paths, *office.session);
+    office.church_names.clear(); // These and the settings may have been read from files that are exchanged now.
+    return read_church_names(state) && find_logo(state) && read_sounds_and_options(state) && set_caption(state);
 }
 
 bool bring_to_version(State& state, int ours, std::span<const Upgrade> chain)

@@ -37,6 +37,8 @@ struct State
 [[nodiscard]] bool check_busy_marker(State&);
 [[nodiscard]] bool set_caption(State&);
 [[nodiscard]] bool open_database(State&);
+/// Brings a restore that was cut off to its end, before anybody works in what may be a mixture of two churches.
+[[nodiscard]] bool settle_restore(State&);
 [[nodiscard]] bool check_version(State&);
 [[nodiscard]] bool load_settings(State&);
 [[nodiscard]] bool count_start(State&);

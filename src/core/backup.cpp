@@ -1,0 +1,196 @@
+#include "core/backup.h"
+
+#include "core/backup_files.h"
+#include "core/backup_writing.h"
+#include "core/compaction.h"
+#include "core/entry.h"
+#include "core/files.h"
+#include "core/marker.h"
+#include "core/open_church.h"
+#include "core/restore_swap.h"
+#include "core/windows1252.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+
+namespace kindrel::core {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int own_folders = 5;
+constexpr qsizetype longest_path = 250; ///< That the settings can hold.
+
+const QString failed = u"Backup failed because:-"_s;
+const QString cancel_question = u"Do you wish to stop the backup?"_s;
+const QString not_noted = u"The backup is made, but its settings could not be kept."_s;
+
+/// Of `Backup1` to `Backup5` the one whose turn it is.
+int folder_in_turn(const Office& office)
+{
+    const int next = office.side.backup.number("next_folder");
+    return next >= 1 && next <= own_folders ? next : 1;
+}
+
+QString own_folder(const Office& office, int number)
+{
+    return as_folder(office.paths.file(Folder::church, u"Backup%1"_s.arg(number)));
+}
+
+/// Throws FileError when the folder that the person chose is not there.
+QString target_folder(const Office& office, const BackupRequest& request)
+{
+    if (request.folder.isEmpty()) {
+        const QString folder = own_folder(office, folder_in_turn(office));
+        make_private_folder(folder);
+        return folder;
+    }
+    const QString folder = as_folder(request.folder);
+    if (!QFileInfo(folder).isDir())
+        throw FileError(u"The folder '%1' cannot be found."_s.arg(folder));
+    if (!QFileInfo(folder).isWritable())
+        throw FileError(u"The folder '%1' does not allow files to be written."_s.arg(folder));
+    return folder;
+}
+
+/// Whether it went through; a backup of the uncompacted database is as good.
+bool compacted(Office& office)
+{
+    try {
+        return compact_held_church(office);
+    } catch (const DatabaseError&) {
+        return false;
+    } catch (const FileError&) {
+        return false;
+    }
+}
+
+void remove_older(const Office& office, const QString& folder, const QString& kept)
+{
+    for (const auto& name : archives_in(folder, office.church)) {
+        if (name != kept)
+            remove_file(folder + name);
+    }
+}
+
+/// Read anew: another workstation may have made a backup since the program was started.
+SideRecord stored_settings(const Office& office)
+{
+    return read_side_file(office.paths, side_files::backup).value_or(SideRecord(side_files::backup));
+}
+
+void keep_settings(Office& office, const BackupRequest& request)
+{
+    SideRecord record = office.side.backup;
+    const auto path = to_windows1252(request.folder);
+    if (request.folder.isEmpty())
+        record.set_number("next_folder", folder_in_turn(office) % own_folders + 1);
+    else if (path && path->size() <= longest_path) // Any other is chosen anew each time.
+        record.set_text("path", request.folder);
+    record.set_flag("with_pictures", request.choice.with_pictures);
+    record.set_flag("with_documents", request.choice.with_documents);
+    record.set_flag("with_letters", request.choice.with_letters);
+    record.set_text("last_backup", Date::from(office.clock.today()).stored());
+    write_side_file(office.paths, record);
+    office.side.backup = record;
+}
+
+/// What follows a finished backup can fail without harm to it.
+void note(Office& office, const BackupRequest& request, const BackupContents& contents, const QString& folder)
+{
+    try {
+        backup_rules::remember(office, contents);
+        if (request.folder.isEmpty())
+            remove_older(office, folder, QFileInfo(contents.file).fileName());
+        keep_settings(office, request);
+    } catch (const FileError& error) {
+        office.dialogue.show(information(not_noted, error.text()));
+    }
+}
+
+BackupReport back_up(Office& office, const BackupRequest& request, Progress& progress)
+{
+    settle_interrupted_restore(office.paths, *office.session);
+    office.side.backup = stored_settings(office);
+    const QString folder = target_folder(office, request);
+    demand_work_space(office);
+    const ProgressRun run(progress, u"Backing up"_s, archive_steps + 1, cancel_question);
+    BackupReport report;
+    report.compacted = compacted(office);
+    if (!progress.step())
+        throw Cancelled();
+    const QString code = provide_church_code(*office.session);
+    report.contents = write_archive(office,
+                                    {.folder = folder,
+                                     .name = archive_name(office, folder),
+                                     .password = request.password,
+                                     .choice = request.choice,
+                                     .church_code = code},
+                                    progress);
+    note(office, request, report.contents, folder);
+    return report;
+}
+
+} // namespace
+
+std::optional<BackupReport> make_backup(Office& office, const BackupRequest& request, Progress& progress)
+{
+    if (!enter(office, AreaId::backup))
+        return std::nullopt;
+    std::optional<BackupReport> report;
+    const bool done = backup_rules::attempt(office, failed, [&] {
+        if (const auto marker = Marker::take(office.paths, side_files::busy))
+            report = back_up(office, request, progress);
+        else
+            office.dialogue.show(backup_rules::busy(failed));
+    });
+    return done ? report : std::nullopt;
+}
+
+ChurchSummary present_state(const Office& office)
+{
+    QStringList tables;
+    for (const CountedKind& kind : counted_kinds())
+        tables += QString::fromUtf16(kind.table);
+    ChurchSummary church = summary_of(*office.session, tables);
+    church.church = office.church;
+    church.church_name = office.church_name;
+    return church;
+}
+
+namespace backup_rules {
+
+QString safety_folder(const Office& office)
+{
+    return as_folder(office.paths.file(Folder::church, u"Before_restore"_s));
+}
+
+bool attempt(const Office& office, const QString& sentence, const std::function<void()>& work)
+{
+    QString why;
+    try {
+        work();
+        return true;
+    } catch (const DatabaseError& error) {
+        why = error.text();
+    } catch (const FileError& error) {
+        why = error.text();
+    } catch (const BackupError& error) {
+        why = error.text();
+    } catch (const Cancelled&) {
+        return false;
+    }
+    office.dialogue.show({.text = sentence, .more = why});
+    return false;
+}
+
+Message busy(const QString& sentence)
+{
+    return {.text = sentence, .more = busy_notice().more};
+}
+
+} // namespace backup_rules
+
+} // namespace kindrel::core

@@ -1,0 +1,62 @@
+#pragma once
+
+#include "core/progress.h"
+
+#include <algorithm>
+
+namespace kindrel::core {
+
+/// The person gave up a long run. Thrown and caught inside the engine: what was begun is taken away on the way.
+struct Cancelled
+{
+};
+
+/// Begins a long run and ends it, however it goes.
+class ProgressRun
+{
+public:
+    ProgressRun(Progress& progress, const QString& what, int steps, const QString& cancel_question)
+        : m_progress(progress)
+    {
+        m_progress.begin(what, steps, cancel_question);
+    }
+    ProgressRun(const ProgressRun&) = delete;
+    ProgressRun& operator=(const ProgressRun&) = delete;
+    ~ProgressRun() { m_progress.end(); }
+
+private:
+    Progress& m_progress;
+};
+
+/// Turns amounts of bytes into `meter_steps` steps of a progress.
+class ByteMeter
+{
+public:
+    static constexpr int meter_steps = 50;
+
+    ByteMeter(Progress& progress, qint64 total) : m_progress(progress), m_total(std::max<qint64>(total, 1)) {}
+
+    /// False once cancelled.
+    [[nodiscard]] bool advance(qint64 bytes)
+    {
+        m_done = std::min(m_done + bytes, m_total);
+        for (; m_running && m_steps < m_done * meter_steps / m_total; ++m_steps)
+            m_running = m_progress.step();
+        return m_running;
+    }
+    /// Throws Cancelled.
+    void add(qint64 bytes)
+    {
+        if (!advance(bytes))
+            throw Cancelled();
+    }
+
+private:
+    Progress& m_progress;
+    qint64 m_total;
+    qint64 m_done = 0;
+    int m_steps = 0;
+    bool m_running = true;
+};
+
+} // namespace kindrel::core

@@ -1,0 +1,78 @@
+#pragma once
+
+#include "core/office.h"
+
+#include <span>
+#include <vector>
+
+namespace kindrel::core {
+
+/// What takes a finding away.
+enum class Cure {
+    mend,    ///< mend_church().
+    unlock,  ///< unlock_church().
+    recover, ///< recover_church(): the file is damaged, and what can be read of it goes into a new one.
+    by_hand  ///< A person must decide.
+};
+
+/// A damage in words for the church office.
+struct Finding
+{
+    QString kind; ///< A word that stays the same, for programs.
+    QString words;
+    int count = 1;
+    Cure cure = Cure::mend;
+    QString remedy; ///< What the cure does, or what to do by hand.
+};
+using Findings = std::vector<Finding>;
+
+/// The church that is looked at, which start-up may refuse to open. Without a session its database cannot be opened.
+struct MenderPlace
+{
+    Paths paths;
+    int church = 1;
+    Workstation& workstation;
+    Clock& clock;
+    std::unique_ptr<Session> session = {};
+    QString why_closed = {}; ///< The engine's own words.
+};
+
+/// One kind of damage. Row checks need a session and are mended inside one transaction, in their order, whether or not
+/// they found anything; file checks are mended after it.
+struct Check
+{
+    enum class On { rows, files };
+    On on;
+    Findings (*examine)(MenderPlace& place);
+    void (*mend)(MenderPlace& place); ///< Null: nothing to mend.
+};
+
+/// Looks for everything that may be wrong with database and folder and changes nothing. `more` are the checks of other
+/// rooms, which come last.
+[[nodiscard]] Findings examine_church(MenderPlace& place, std::span<const Check> more);
+
+/// What mending came to.
+struct Mending
+{
+    QString refusal; ///< Why nothing was done; empty when mending ran.
+    QString copy;    ///< The copy of the database as it was before.
+    Findings mended, left;
+};
+
+/// Takes away every finding that mending cures, after a verified copy was laid into the church's folder `mended`. The
+/// rows are mended in one transaction. Refuses while somebody else may be inside. Throws DatabaseError or FileError:
+/// the rows are then as they were.
+[[nodiscard]] Mending mend_church(MenderPlace& place, std::span<const Check> more);
+
+/// Removes every lock and every marker of the church, whoever left it; what was removed, in words.
+QStringList unlock_church(MenderPlace& place);
+
+/// A place of its own in the church's folder `mended`, which is made, for a file of this name.
+[[nodiscard]] QString mended_place(const MenderPlace& place, const QString& name);
+/// Moves a file into the folder `mended`.
+void set_aside(const MenderPlace& place, const QString& file);
+
+/// "1 family", "12 families".
+[[nodiscard]] QString counted(int count, const QString& one, const QString& many);
+
+} // namespace kindrel::core

@@ -1,0 +1,249 @@
+#include "core/backup.h"
+
+#include "backup_place.h"
+#include "core/backup_writing.h"
+#include "support/processes.h"
+
+#include <QFileInfo>
+
+#include <unistd.h>
+
+namespace kindrel::test {
+
+using namespace Qt::StringLiterals;
+using namespace core;
+
+namespace {
+
+const QString failed = u"Backup failed because:-"_s;
+
+} // namespace
+
+class BackupTest : public BackupPlaceTest
+{
+protected:
+    /// No backup comes about; the first thing told holds the words, and nothing is left behind.
+    void expect_failure(const BackupRequest& request, const QString& words)
+    {
+        const auto before = place->archives();
+        EXPECT_FALSE(make_backup(place->office(), request, place->started->silent));
+        ASSERT_EQ(place->dialogue().told.size(), 1);
+        EXPECT_TRUE(place->dialogue().told.first().contains(words)) << place->dialogue().told.first().toStdString();
+        EXPECT_EQ(place->archives(), before);
+        EXPECT_TRUE(place->leftovers().isEmpty()) << place->leftovers().join(u' ').toStdString();
+    }
+};
+KINDREL_ON_BOTH_ENGINES(BackupTest);
+
+TEST_P(BackupTest, ABackupTellsWhatIsInIt)
+{
+    place->session().execute(u"INSERT INTO [tbl_visitation] ([Surname_ID],[visitor]) VALUES (1,'A');"_s);
+    const QString file = place->back_up();
+
+    const auto contents = read_backup(file, {});
+    EXPECT_EQ(contents.made, place->started->clock.now());
+    EXPECT_EQ(contents.church.church_name, u"Morning"_s);
+    EXPECT_EQ(contents.church.last_change, (Date{2024, 5, 1}));
+    EXPECT_EQ(kinds_of(contents.church).front().rows, 20);
+    EXPECT_EQ(kinds_of(contents.church)[2].rows, 1) << "Visitation notes.";
+    QMap<QString, int> files;
+    for (const auto& part : contents.parts)
+        files[part.words] = part.files;
+    EXPECT_EQ(files[u"Photographs"_s], 2);
+    EXPECT_EQ(files[u"Wardline documents"_s], 1);
+    EXPECT_EQ(files.size(), 9);
+    EXPECT_TRUE(place->leftovers().isEmpty());
+}
+
+TEST_P(BackupTest, AChurchGetsItsCodeOnceAndForAll)
+{
+    const auto first = read_backup(place->back_up(), {}).church.church_code;
+    const auto second = read_backup(place->back_up(), {}).church.church_code;
+
+    EXPECT_EQ(first.size(), 32);
+    EXPECT_EQ(first, second);
+    EXPECT_EQ(present_state(place->office()).church_code, first);
+}
+
+TEST_P(BackupTest, TheFiveFoldersTakeTurnsAndTheOldestBackupGoes)
+{
+    DataFolder::write(place->church() + u"Backup1/systembackup.kdl"_s, "system");
+    const QString first = place->back_up();
+    for (int folder = 2; folder <= 5; ++folder)
+        EXPECT_TRUE(place->back_up().contains(u"/Backup%1/"_s.arg(folder)));
+    place->started->clock.set(QDate(2024, 5, 16));
+    const QString sixth = place->back_up();
+
+    EXPECT_TRUE(sixth.contains(u"/Backup1/"));
+    EXPECT_FALSE(QFile::exists(first));
+    EXPECT_EQ(place->archives().size(), 5);
+    EXPECT_EQ(DataFolder::read(place->church() + u"Backup1/systembackup.kdl"_s), "system");
+    const auto settings = read_side_file(place->paths(), side_files::backup);
+    EXPECT_EQ(settings->number("next_folder"), 2);
+    EXPECT_EQ(settings->text("last_backup"), u"2024-05-16"_s);
+}
+
+/// Looks at every file of a backup folder at each step.
+class WatchingProgress : public SilentProgress
+{
+public:
+    explicit WatchingProgress(const QString& folder) : m_folder(folder) {}
+    bool step(const QString&) override
+    {
+        for (const auto& file : QDir(m_folder).entryInfoList(QDir::Files)) {
+            ++seen;
+            const auto others = QFile::ReadOther | QFile::WriteOther | QFile::ExeOther;
+            EXPECT_FALSE(file.permissions() & others) << file.filePath().toStdString();
+        }
+        return true;
+    }
+    int seen = 0;
+
+private:
+    QString m_folder;
+};
+
+TEST_P(BackupTest, OnlyOwnerAndGroupCanReadABackupAtAnyMoment)
+{
+    const QTemporaryDir disk;
+    WatchingProgress progress(disk.path());
+
+    ASSERT_TRUE(make_backup(place->office(), {.folder = disk.path()}, progress));
+
+    EXPECT_GT(progress.seen, 0);
+    EXPECT_TRUE(progress.step({}));
+    const auto list = QFile::permissions(place->church() + u"backups.json"_s);
+    EXPECT_FALSE(list & (QFile::ReadOther | QFile::WriteOther));
+}
+
+TEST_P(BackupTest, WithAPasswordNothingIsReadWithoutIt)
+{
+    const QTemporaryDir disk;
+    const QString file = place->back_up({.folder = disk.path(), .password = u"für uns"_s});
+
+    EXPECT_TRUE(read_backup(file, u"für uns"_s).encrypted);
+    EXPECT_FALSE(DataFolder::read(file).contains("Morning"));
+    const auto fault_with = [&](const QString& password) {
+        try {
+            (void)read_backup(file, password);
+        } catch (const BackupError& error) {
+            return error.fault();
+        }
+        return BackupFault::older;
+    };
+    EXPECT_EQ(fault_with({}), BackupFault::password_needed);
+    EXPECT_NE(fault_with(u"fur uns"_s), BackupFault::older);
+    EXPECT_EQ(read_side_file(place->paths(), side_files::backup)->text("path"), disk.path());
+}
+
+TEST_P(BackupTest, GivenUpAtAnyStepNothingIsLeft)
+{
+    for (int last = 1;; ++last) {
+        StoppingProgress progress(last);
+        const auto report = make_backup(place->office(), {}, progress);
+        EXPECT_TRUE(progress.ended);
+        EXPECT_TRUE(place->leftovers().isEmpty()) << "after step " << last;
+        if (report) {
+            EXPECT_EQ(progress.taken, progress.announced);
+            EXPECT_EQ(last, progress.announced + 1);
+            break;
+        }
+        EXPECT_TRUE(place->archives().isEmpty()) << "after step " << last;
+    }
+    EXPECT_TRUE(place->dialogue().told.isEmpty());
+}
+
+TEST_P(BackupTest, ABusyChurchIsNotBackedUp)
+{
+    DataFolder::write(place->church() + u"Lock.dat"_s, "1234567890");
+
+    EXPECT_FALSE(make_backup(place->office(), {}, place->started->silent));
+
+    EXPECT_TRUE(place->dialogue().told.first().contains(u"Another user is either compacting files"));
+    EXPECT_TRUE(QFile::exists(place->church() + u"Lock.dat"_s));
+    EXPECT_TRUE(place->archives().isEmpty());
+}
+
+TEST_P(BackupTest, WithoutTheRightThereIsNoBackup)
+{
+    place->office().rights = {};
+
+    expect_failure({}, u"Your password does not give access"_s);
+}
+
+TEST_P(BackupTest, AMissingFolderIsToldAndNotMade)
+{
+    const QTemporaryDir disk;
+
+    expect_failure({.folder = disk.filePath(u"gone"_s)}, u"cannot be found"_s);
+
+    EXPECT_FALSE(QFile::exists(disk.filePath(u"gone"_s)));
+}
+
+TEST_P(BackupTest, TooLittleRoomIsToldBeforehand)
+{
+    place->started->workstation.free = 3'000'000;
+
+    expect_failure({}, u"too little free space"_s);
+}
+
+TEST_P(BackupTest, AFolderThatCannotBeWrittenIsTold)
+{
+    if (geteuid() == 0)
+        GTEST_SKIP() << "Nothing keeps the superuser from writing.";
+    const QTemporaryDir disk;
+    QFile::setPermissions(disk.path(), QFile::ReadOwner | QFile::ExeOwner);
+
+    expect_failure({.folder = disk.path()}, u"does not allow files to be written"_s);
+
+    QFile::setPermissions(disk.path(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+}
+
+QByteArray back_up_on_full_disk(const Paths& paths, rlim_t bytes)
+{
+    StartedOffice started(paths);
+    fill_disk(bytes);
+    const bool made = make_backup(started.office, {}, started.silent).has_value();
+    return made ? "made" : started.dialogue.told.join(u'\n').toUtf8();
+}
+
+TEST_P(BackupTest, AFullDiskLeavesTheOlderBackupsAndNothingElse)
+{
+    const QString older = place->back_up();
+    DataFolder::write(place->church() + u"Portrait/2.jpg"_s, QByteArray(3'000'000, 'x'));
+    const Paths paths = place->paths();
+    for (const rlim_t bytes : {4'096, 60'000, 1'000'000, 2'900'000}) {
+        const auto told = run_together({[&] {
+                              return back_up_on_full_disk(paths, bytes);
+                          }}).front();
+
+        EXPECT_TRUE(told.startsWith(failed.toUtf8())) << bytes << ": " << told.toStdString();
+        EXPECT_EQ(place->archives(), QStringList(older));
+        EXPECT_TRUE(place->leftovers().isEmpty()) << place->leftovers().join(u' ').toStdString();
+    }
+}
+
+TEST_P(BackupTest, KnownBackupsAreListedAndChangedOnesAreNotVerified)
+{
+    const QTemporaryDir disk;
+    const QString own = place->back_up();
+    place->started->clock.set(QDate(2024, 5, 20));
+    const QString on_disk = place->back_up({.folder = disk.path()});
+    place->started->clock.set(QDate(2024, 5, 21));
+    const QString changed = place->back_up();
+    DataFolder::write(changed, DataFolder::read(changed) + "x");
+    QFile::remove(on_disk);
+
+    const auto known = backups_of(place->office());
+
+    ASSERT_EQ(known.size(), 3U);
+    EXPECT_EQ(known[0].file, changed);
+    EXPECT_FALSE(known[0].verified);
+    EXPECT_EQ(known[1].file, on_disk);
+    EXPECT_FALSE(known[1].present);
+    EXPECT_EQ(known[2].file, own);
+    EXPECT_TRUE(known[2].verified);
+    EXPECT_EQ(known[2].size, QFileInfo(own).size());
+}
+
+} // namespace kindrel::test
