@@ -2,6 +2,7 @@
 
 #include "people/names.h"
 
+#include <algorithm>
 #include <array>
 
 namespace kindrel::people {
@@ -139,6 +140,8 @@ DisclosedFamily disclose(FamilyFile file, const Disclosure& disclosure)
     disclosed.m_use_preferred_names = disclosure.use_preferred_names;
     disclosed.m_day_order = disclosure.day_order;
     hide(file.address, withheld_of_families, disclosure.withheld);
+    if (disclosure.withheld[static_cast<std::size_t>(Detail::phones)])
+        std::ranges::for_each(file.other_contacts, [](OtherContact& contact) { contact.phone.clear(); });
     blank_address(file);
     for (auto& person : file.people)
         blank_person(person, disclosure);

@@ -200,20 +200,6 @@ QString lend_people(core::Session& session, const std::vector<int>& people, int 
     return u"work_tagged"_s;
 }
 
-/// The last place of what each person of the lent list carries; nothing for a kind without places.
-QHash<int, int> last_places(core::Session& session, const LinkTable& table)
-{
-    QHash<int, int> places;
-    if (!table.position)
-        return places;
-    auto rows = session.select(u"SELECT [person_id],MAX([%1]) FROM [%2] WHERE [person_id] IN "
-                               "(SELECT [person_id] FROM [work_people]) GROUP BY [person_id];"_s.arg(
-                                   named(table.position), named(table.table)));
-    for (const core::Row& row : rows)
-        places.insert(row.integer(core::Column{0}), row.integer(core::Column{1}));
-    return places;
-}
-
 void insert_rows(core::Session& session, const LinkTable& table, const std::vector<BulkChange::Row>& added)
 {
     QStringList fields{u"person_id"_s, named(table.item)};
@@ -240,15 +226,46 @@ void insert_rows(core::Session& session, const LinkTable& table, const std::vect
     session.insert(named(table.table), fields, rows);
 }
 
-/// At the end of what each person of the lent list carries.
-void add_rows(core::Session& session, const LinkTable& table, const LinkRow& row, const std::vector<int>& people)
+/// What a lent person's row gets in a field: a bound value, or the place after what the person carries already.
+struct Filling
 {
-    const auto places = last_places(session, table);
-    std::vector<BulkChange::Row> rows;
-    rows.reserve(people.size());
-    for (const int person : people)
-        rows.push_back({person, row, places.value(person) + 1});
-    insert_rows(session, table, rows);
+    const char* field;
+    std::optional<Value> value; ///< Unset for the place.
+};
+
+QString expression(const Filling& filling, const LinkTable& table)
+{
+    if (!filling.value)
+        return u"COALESCE((SELECT MAX(t.[%1]) FROM [%2] t WHERE t.[person_id]=w.[person_id]),0)+1"_s.arg(
+            named(filling.field), named(table.table));
+    return std::holds_alternative<qint64>(*filling.value) ? u"CAST(? AS BIGINT)"_s : u"CAST(? AS TEXT)"_s;
+}
+
+/// The same row for all these people, at the end of what each carries.
+void add_rows(core::Session& session, const LinkTable& table, const LinkRow& row, const std::vector<int>& people,
+              int whole_list)
+{
+    if (people.empty())
+        return;
+    std::vector<Filling> fillings{{table.item, to_value(row.item)}};
+    if (table.type)
+        fillings.push_back({table.type, to_value(row.type)});
+    if (table.position)
+        fillings.push_back({table.position, std::nullopt});
+    for (auto& content : content_of(table, row))
+        fillings.push_back({content.name, std::move(content.value)});
+    QString fields = u"[person_id]"_s;
+    QString selected = u"w.[person_id]"_s;
+    std::vector<Value> values;
+    for (const auto& filling : fillings) {
+        fields += u",[%1]"_s.arg(named(filling.field));
+        selected += u',' + expression(filling, table);
+        if (filling.value)
+            values.push_back(*filling.value);
+    }
+    session.execute_with(u"INSERT INTO [%1] (%2) SELECT %3 FROM [%4] w;"_s.arg(
+                             named(table.table), fields, selected, lend_people(session, people, whole_list)),
+                         values);
 }
 
 /// `whole_list` is the number of people who are lent in `work_people`.
@@ -287,7 +304,7 @@ void carry_out(core::Session& session, const BulkChange& change)
     auto rewritten = change.before;
     std::ranges::for_each(rewritten, [&](auto& each) { each.row = row; });
     insert_rows(session, table, rewritten);
-    add_rows(session, table, row, change.added);
+    add_rows(session, table, row, change.added, change.count.people());
 }
 
 bool refuse(const core::Office& office, const QString& text)
