@@ -2,7 +2,17 @@
 
 #include "core/entry.h"
 #include "output/decoration.h"
-#include "output/directory.h"
+#include "output/labels/labels.h"
+#include "output/reports/barcode_reports.h"
+#include "output/reports/check_lists.h"
+#include "output/reports/directory.h"
+#include "output/reports/family_data_reports.h"
+#include "output/reports/group_history_reports.h"
+#include "output/reports/group_reports.h"
+#include "output/reports/miscellaneous.h"
+#include "output/reports/names_report.h"
+#include "output/reports/photo_albums.h"
+#include "output/reports/sign_in_sheets.h"
 
 #include <algorithm>
 #include <array>
@@ -17,7 +27,9 @@ namespace {
 
 /// The families in the order of the tree.
 constexpr std::array families{
-    directory_reports,
+    directory_reports,     check_list_reports,  sign_in_reports,          label_reports,
+    family_data_reports,   all_group_reports,   individual_group_reports, group_history_reports,
+    miscellaneous_reports, photo_album_reports, barcode_reports,          names_reports,
 };
 
 std::vector<ReportDefinition> all_reports()
@@ -51,7 +63,7 @@ bool is_called(const ReportDefinition& report, QStringView name)
 /// Everything that can be refused before the first page.
 bool may_run(const ReportDefinition& report, const ReportInput& input)
 {
-    if (!core::permitted(input.office, report.area))
+    if (!core::permitted(input.office, report.area) || (report.also && !core::permitted(input.office, *report.also)))
         return false;
     if (input.list.members.empty())
         input.office.dialogue.show({u"No people found for creating a report"_s});

@@ -24,6 +24,8 @@ struct ReportDefinition
     bool (*write)(const ReportInput&, const void* layout, core::Progress&, pages::Flow&); ///< False when cancelled.
     const void* layout; ///< A row of the family's own table, which begins with a ReportLayout.
     pages::PageSetup (*page)(const ReportInput&) = nullptr; ///< Unset: the layout's, on the paper of the run.
+    std::optional<core::Area> also = {};                    ///< A right that is needed beside `area`.
+    bool (*printable)(const core::Office&) = nullptr; ///< Whether its setup can be printed; says nothing. Unset: yes.
 };
 
 [[nodiscard]] std::span<const ReportDefinition> catalogue();

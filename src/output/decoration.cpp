@@ -16,6 +16,7 @@ constexpr qreal beside_logo = 12;
 constexpr qreal date_width = 130;
 constexpr qreal thin_line = 0.75;
 constexpr qreal thick_line = 2;
+constexpr qreal above_filters = 2;
 constexpr qreal below_header = 8;
 
 /// A vision statement as the church prints it.
@@ -77,7 +78,8 @@ Header header_of(const ReportInput& input, const QString& title, const pages::Ty
     if (parts.filters && !input.list.criteria.isEmpty())
         header.filters = u"Filters in Use = "_s + input.list.criteria;
     if (settings.Include_vision_reports)
-        header.vision = statement(settings, settings.vision, type.body);
+        header.vision =
+            statement(settings, settings.church_vision.isEmpty() ? settings.vision : settings.church_vision, type.body);
     if (settings.vision_line || settings.vision_thick_line)
         header.vision.line = settings.vision_thick_line ? thick_line : thin_line;
     return header;
@@ -139,8 +141,10 @@ void write_vision(pages::Writer& band, const Statement& vision)
 void write_header(pages::Writer& band, const Header& header)
 {
     write_masthead(band, header);
-    if (!header.filters.isEmpty())
+    if (!header.filters.isEmpty()) {
+        band.space(above_filters);
         band.line(header.filters, band.type().small);
+    }
     band.rule({.thickness = thin_line, .colour = pages::ink::hairline, .before = 4, .after = 4});
     write_vision(band, header.vision);
     band.space(below_header);
@@ -152,16 +156,21 @@ void write_footer(pages::Writer& band, const Footer& footer, int number)
     if (footer.line > 0)
         band.rule({.thickness = footer.line, .colour = pages::ink::black, .before = 0, .after = 3});
     write_vision(band, footer.vision);
-    band.spread(footer.title, {}, u"Page %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
+    band.spread(footer.title, {}, u"Page: %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
 }
 
 } // namespace
 
-void decorate(pages::Flow& flow, const QString& title, const ReportInput& input)
+void decorate(pages::Flow& flow, const QString& title, const ReportInput& input, const OwnBands& own)
 {
-    flow.set_header(
-        [header = header_of(input, title, flow.type())](pages::Writer& band, int) { write_header(band, header); });
-    flow.set_footer([footer = footer_of(input, title, flow.type())](pages::Writer& band, int number) {
+    flow.set_header([header = header_of(input, title, flow.type()), own = own.header](pages::Writer& band, int number) {
+        write_header(band, header);
+        if (own)
+            own(band, number);
+    });
+    flow.set_footer([footer = footer_of(input, title, flow.type()), own = own.footer](pages::Writer& band, int number) {
+        if (own)
+            own(band, number);
         write_footer(band, footer, number);
     });
 }

@@ -56,6 +56,9 @@ void add_line(CaptionLines& lines, std::vector<pages::CaptionValue> line)
         lines.push_back(std::move(line));
 }
 
+/// Before a caption that follows a value on its line, as "  Family Fax: " has it by itself.
+constexpr QStringView gap = u"  ";
+
 /// Where an address of one kind lies.
 struct AddressFields
 {
@@ -154,6 +157,10 @@ CaptionLines personal_contacts(const people::DisclosedFamily& family, const peop
     add_line(lines, std::move(first));
     for (const auto& line : personal_lines)
         add_line(lines, values_of(line, person));
+    for (auto& line : lines) {
+        for (auto& pair : std::span(line).subspan(1))
+            pair.caption.prepend(gap);
+    }
     return lines;
 }
 

@@ -16,8 +16,6 @@ namespace {
 constexpr std::size_t first_chunk = 200;
 constexpr std::size_t growth = 4;
 constexpr std::size_t largest_chunk = 3200;
-constexpr std::size_t places_per_step = 100;
-
 std::vector<int> sorted_people(const people::WorkingList& list)
 {
     std::vector<int> people;
@@ -65,18 +63,18 @@ private:
 template <class Key, class Read, class Write>
 bool in_chunks(std::span<const Key> keys, core::Progress& progress, const Read& read, const Write& write)
 {
-    const ReportRun run(progress, static_cast<int>(keys.size() / places_per_step) + 1);
+    const ReportRun run(progress, static_cast<int>(keys.size()));
     std::size_t size = first_chunk;
     for (std::size_t first = 0; first < keys.size(); first += size, size = std::min(size * growth, largest_chunk)) {
         size = std::min(size, keys.size() - first);
         const auto families = read(keys.subspan(first, size));
         for (std::size_t place = first; place < first + size; ++place) {
             write(families, keys[place], place);
-            if ((place + 1) % places_per_step == 0 && !progress.step())
+            if (!progress.step())
                 return false;
         }
     }
-    return progress.step();
+    return true;
 }
 
 people::Disclosure disclosure_of(const ReportInput& input)
@@ -106,6 +104,12 @@ std::vector<const people::Person*> ListedFamily::people() const
     auto all = household.adults;
     std::ranges::copy(household.children, std::back_inserter(all));
     return all;
+}
+
+QString ListedMember::listed_name() const
+{
+    const auto given = name();
+    return surname().isEmpty() || given.isEmpty() ? surname() + given : surname() + u", "_s + given;
 }
 
 bool for_each_family_of(const ReportInput& input, std::span<const int> keys, core::Progress& progress,

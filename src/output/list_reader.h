@@ -39,6 +39,8 @@ struct ListedMember
 
     [[nodiscard]] QString name() const { return family.name(person); }
     [[nodiscard]] const QString& surname() const { return family.family().surname; }
+    /// "Naismith, Ann".
+    [[nodiscard]] QString listed_name() const;
 };
 
 /// Reads the working list's people in its order, one by one, whatever their families.

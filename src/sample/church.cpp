@@ -5,6 +5,7 @@
 #include "sample/family_maker.h"
 #include "sample/group_book.h"
 #include "sample/portrait.h"
+#include "sample/registers.h"
 #include "sample/word_list.h"
 
 namespace kindrel::sample {
@@ -99,6 +100,7 @@ void fill_church(core::Session& session, const ChurchPlan& plan, const QString& 
     }
     groups.write(session, lists);
     age_files(session, plan.today);
+    write_registers(session, plan.today, plan.seed);
     session.execute(u"UPDATE [tbl_startup] SET [pin_auto_number_start]=?;"_s, maker.next_pin());
     if (plan.training)
         write_decoration(session);

@@ -14,14 +14,19 @@ namespace kindrel::sample {
 
 using namespace Qt::StringLiterals;
 
-std::vector<QStringList> read_list(const QString& name)
+QByteArray read_sample(const QString& name)
 {
     load_resources();
-    QFile file(u":/sample/%1.txt"_s.arg(name));
+    QFile file(u":/sample/"_s + name);
     if (!file.open(QIODevice::ReadOnly))
-        throw std::logic_error("no list of this name was compiled in: " + name.toStdString());
+        throw std::logic_error("no file of this name was compiled in: " + name.toStdString());
+    return file.readAll();
+}
+
+std::vector<QStringList> read_list(const QString& name)
+{
     std::vector<QStringList> lines;
-    for (const QString& line : QString::fromUtf8(file.readAll()).split(u'\n')) {
+    for (const QString& line : QString::fromUtf8(read_sample(name + u".txt"_s)).split(u'\n')) {
         if (line.isEmpty() || line.startsWith(u'#'))
             continue;
         auto& columns = lines.emplace_back(line.split(u'|'));

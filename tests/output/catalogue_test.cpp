@@ -1,4 +1,4 @@
-#include "output_fixture.h"
+#include "output/output_fixture.h"
 
 #include <QSet>
 

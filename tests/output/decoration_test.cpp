@@ -1,4 +1,4 @@
-#include "output_fixture.h"
+#include "output/output_fixture.h"
 
 #include <QImage>
 
@@ -164,7 +164,7 @@ TEST_F(DecorationTest, EveryPageTellsItsNumberAndTheTotal)
 
     ASSERT_GT(pages.size(), 1u);
     for (std::size_t i = 0; i < pages.size(); ++i)
-        EXPECT_TRUE(pages[i].contains(u"Page %1 of %2"_s.arg(i + 1).arg(pages.size()))) << i;
+        EXPECT_TRUE(pages[i].contains(u"Page: %1 of %2"_s.arg(i + 1).arg(pages.size()))) << i;
 }
 
 } // namespace kindrel::test

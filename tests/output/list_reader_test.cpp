@@ -1,4 +1,4 @@
-#include "output_fixture.h"
+#include "output/output_fixture.h"
 
 #include "output/list_reader.h"
 #include "people/family_store.h"

@@ -1,7 +1,8 @@
-#include "output_fixture.h"
+#include "output/output_fixture.h"
 
 #include "pages/pdf.h"
 #include "people/family_store.h"
+#include "people/fields.h"
 
 #include <QProcess>
 
@@ -37,7 +38,30 @@ QStringList lines_of(const pages::Page& page, int total)
     return lines;
 }
 
+/// The words that full_family() gives a record's texts.
+template <class Record>
+QStringList texts_of_record(const Record& record, std::span<const people::Field<Record>> fields)
+{
+    QStringList words;
+    for (const auto& field : fields) {
+        if (const auto* text = std::get_if<QString Record::*>(&field.member))
+            words += record.**text;
+    }
+    return words;
+}
+
 } // namespace
+
+QStringList hidden_words(const people::FamilyFile& family)
+{
+    auto words = texts_of_record(family.address, people::address_fields());
+    words += {u"suburb 1"_s, u"suburb 2"_s, u"3999"_s, u"3000"_s, u"1977"_s};
+    for (const auto& person : family.people) {
+        words += texts_of_record(person, people::detail_fields());
+        words += person.preferred_name;
+    }
+    return words;
+}
 
 ReportTest::ReportTest()
     : office{.paths = core::Paths(church.folder() + u'/', church.folder() + u'/', church.folder() + u'/',

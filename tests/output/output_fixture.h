@@ -51,6 +51,9 @@ protected:
     output::ReportDefinition report = *output::find_report(u"k10");
 };
 
+/// Every value of the family that a hidden switch covers, as full_family() fills it.
+[[nodiscard]] QStringList hidden_words(const people::FamilyFile& family);
+
 /// What a program of the PDF tools prints.
 [[nodiscard]] QString output_of(const QString& program, const QStringList& arguments);
 

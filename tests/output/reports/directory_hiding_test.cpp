@@ -1,4 +1,4 @@
-#include "output_fixture.h"
+#include "output/output_fixture.h"
 
 #include "people/fields.h"
 
@@ -8,30 +8,6 @@ using namespace Qt::StringLiterals;
 using people::Address;
 
 namespace {
-
-/// The words that full_family() gives a record's texts.
-template <class Record>
-QStringList texts_of_record(const Record& record, std::span<const people::Field<Record>> fields)
-{
-    QStringList words;
-    for (const auto& field : fields) {
-        if (const auto* text = std::get_if<QString Record::*>(&field.member))
-            words += record.**text;
-    }
-    return words;
-}
-
-/// Every value of the family that a hidden switch covers.
-QStringList hidden_words(const people::FamilyFile& family)
-{
-    auto words = texts_of_record(family.address, people::address_fields());
-    words += {u"suburb 1"_s, u"suburb 2"_s, u"3999"_s, u"3000"_s, u"1977"_s};
-    for (const auto& person : family.people) {
-        words += texts_of_record(person, people::detail_fields());
-        words += person.preferred_name;
-    }
-    return words;
-}
 
 /// What Directory 1 prints of one switch's values.
 struct Switch

@@ -1,6 +1,6 @@
-#include "output_fixture.h"
+#include "output/output_fixture.h"
 
-#include "output/directory.h"
+#include "output/reports/directory.h"
 
 namespace kindrel::test {
 
@@ -28,7 +28,7 @@ protected:
     {
         office.settings.title_church = office.settings.title_date = office.settings.title_filters = false;
         const auto all = texts();
-        EXPECT_EQ(all.value(2), u"Page 1 of 1"_s);
+        EXPECT_EQ(all.value(2), u"Page: 1 of 1"_s);
         return all.sliced(3);
     }
     /// For the tales of failing tests.

@@ -8,8 +8,14 @@
 
 namespace kindrel::output {
 
-/// Names, address and contacts beside each other, or beneath each other where the columns are narrow.
-enum class EntryShape { side_by_side, stacked };
+/// What stands in an entry, and whether beside each other or beneath each other, as narrow columns need it.
+enum class EntryShape {
+    side_by_side, ///< Names, address and contacts.
+    stacked,
+    phones,  ///< Names and address, beside them the phone numbers of the family and its people.
+    details, ///< The family, beside it its people with all their contacts.
+    details_stacked
+};
 /// A band with the letter before the first surname of each letter.
 enum class LetterBands { off, on };
 
@@ -21,10 +27,6 @@ struct DirectoryLayout
     LetterBands bands;
 };
 static_assert(std::is_standard_layout_v<DirectoryLayout>);
-
-inline constexpr std::array directory_layouts{
-    DirectoryLayout{{.title = "Church Directory"}, EntryShape::side_by_side, LetterBands::off},
-};
 
 /// `layout` is a DirectoryLayout.
 [[nodiscard]] bool write_directory(const ReportInput& input, const void* layout, core::Progress& progress,

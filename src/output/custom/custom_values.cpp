@@ -1,0 +1,431 @@
+#include "output/custom/custom_values.h"
+
+#include "output/family_lines.h"
+#include "pages/page.h"
+#include "people/sort_key.h"
+
+#include <algorithm>
+
+namespace kindrel::output::custom {
+
+using namespace Qt::StringLiterals;
+using people::LinkRow;
+using people::MinistryState;
+using people::Person;
+using people::SuburbType;
+
+namespace {
+
+FieldValues single(const QString& text)
+{
+    return {{text}};
+}
+
+FieldValues single(const FieldSource& source, const std::optional<core::Date>& date)
+{
+    return {{shown(*source.family, date)}};
+}
+
+FieldValues listed(const QStringList& texts)
+{
+    FieldValues values;
+    for (const auto& text : texts)
+        values.push_back({text});
+    return values;
+}
+
+FieldValues names(const FieldSource& source, std::span<const Person* const> people)
+{
+    FieldValues values;
+    for (const auto* person : people)
+        values.push_back({source.family->name(*person)});
+    return values;
+}
+
+/// Primary and spouse, as far as they are there.
+std::vector<const Person*> couple(const FieldSource& source)
+{
+    std::vector<const Person*> two{source.household->primary, source.household->spouse};
+    std::erase(two, nullptr);
+    return two;
+}
+
+QString name_of(const FieldSource& source, const Person* person)
+{
+    return person ? source.family->name(*person) : QString();
+}
+
+/// Title and name of both, then the surname; nothing when neither is there.
+QString titled(const FieldSource& source, qsizetype letters)
+{
+    QString text;
+    for (const auto* person : couple(source)) {
+        const auto name = source.family->name(*person);
+        text = joined(u" & ", {text, joined(u" ", {person->Title, letters < 0 ? name : name.left(letters)})});
+    }
+    return text.isEmpty() ? text : joined(u" ", {text, source.family->family().surname});
+}
+
+FieldValues ministries_of(const FieldSource& source, std::optional<MinistryState> only)
+{
+    auto rows = source.person->ministries;
+    if (only)
+        std::erase_if(rows, [&](const LinkRow& row) { return row.type != static_cast<int>(*only); });
+    auto values = values_of_rows(*source.family, rows);
+    for (std::size_t i = 0; !only && i < rows.size(); ++i) {
+        if (rows[i].type == static_cast<int>(MinistryState::potential))
+            values[i].text += u" (potential)"_s;
+    }
+    return values;
+}
+
+QString suburb_name(const people::Suburb* suburb)
+{
+    return suburb ? suburb->suburb : QString();
+}
+
+QString postcode_of(const people::Suburb* suburb)
+{
+    return suburb ? suburb->shown_postcode() : QString();
+}
+
+} // namespace
+
+FieldValues values_of_rows(const people::DisclosedFamily& family, const std::vector<LinkRow>& rows)
+{
+    FieldValues values;
+    for (const auto& row : rows) {
+        FieldValue value{row.text, row.text, row.text, row.item};
+        if (row.date)
+            value = {joined(u" ", {row.text, family.shown(*row.date)}), row.text, family.shown(*row.date), row.item};
+        else if (!row.field.isEmpty())
+            value = {joined(u": ", {row.text, row.field}), row.text, row.field, row.item};
+        values.push_back(std::move(value));
+    }
+    return values;
+}
+
+FieldValues today(const FieldSource& source)
+{
+    return single(source.run.shown_today);
+}
+
+FieldValues church_name(const FieldSource& source)
+{
+    return single(source.run.church_name);
+}
+
+FieldValues report_title(const FieldSource& source)
+{
+    return single(source.run.title);
+}
+
+FieldValues filters(const FieldSource& source)
+{
+    return single(source.run.filters);
+}
+
+FieldValues group(const FieldSource& source)
+{
+    return single(source.run.group);
+}
+
+FieldValues number(const FieldSource& source)
+{
+    return single(QString::number(source.run.number));
+}
+
+FieldValues family_count(const FieldSource& source)
+{
+    return single(QString::number(source.run.family_count));
+}
+
+FieldValues person_count(const FieldSource& source)
+{
+    return single(QString::number(source.run.person_count));
+}
+
+FieldValues page(const FieldSource& source)
+{
+    return single(QString::number(source.run.page));
+}
+
+FieldValues pages(const FieldSource&)
+{
+    return single(QString(pages::page_total_mark));
+}
+
+FieldValues surname(const FieldSource& source)
+{
+    return single(source.family->family().surname);
+}
+
+FieldValues letter(const FieldSource& source)
+{
+    const auto key = people::sort_key(source.family->family().surname);
+    const bool filed = !key.isEmpty() && key.front().isLetter();
+    return {{.text = filed ? QString(key.front()) : u"#"_s, .place = filed ? 1 : 0}};
+}
+
+FieldValues primary_name(const FieldSource& source)
+{
+    return single(name_of(source, source.household->primary));
+}
+
+FieldValues spouse_name(const FieldSource& source)
+{
+    return single(name_of(source, source.household->spouse));
+}
+
+FieldValues both_names(const FieldSource& source)
+{
+    return single(names_of(*source.family, couple(source), u" & "));
+}
+
+FieldValues both_names_and_surname(const FieldSource& source)
+{
+    const auto text = names_of(*source.family, couple(source), u" & ");
+    return single(text.isEmpty() ? text : joined(u" ", {text, source.family->family().surname}));
+}
+
+FieldValues titled_names(const FieldSource& source)
+{
+    return single(titled(source, -1));
+}
+
+FieldValues titled_initials(const FieldSource& source)
+{
+    return single(titled(source, 1));
+}
+
+FieldValues primary_title(const FieldSource& source)
+{
+    return single(source.household->primary ? source.household->primary->Title : QString());
+}
+
+FieldValues spouse_title(const FieldSource& source)
+{
+    return single(source.household->spouse ? source.household->spouse->Title : QString());
+}
+
+FieldValues children(const FieldSource& source)
+{
+    return names(source, source.household->children);
+}
+
+FieldValues adults(const FieldSource& source)
+{
+    return names(source, source.household->adults);
+}
+
+FieldValues everybody(const FieldSource& source)
+{
+    auto all = adults(source);
+    std::ranges::copy(children(source), std::back_inserter(all));
+    return all;
+}
+
+FieldValues and_family(const FieldSource& source)
+{
+    return single(source.household->children.empty() ? QString() : u"& Family"_s);
+}
+
+FieldValues people_in_family(const FieldSource& source)
+{
+    return single(QString::number(source.household->adults.size() + source.household->children.size()));
+}
+
+FieldValues condition(const FieldSource& source)
+{
+    constexpr std::array<QStringView, 4> words{u"Active", u"Privacy", u"Prospect", u"Archive"};
+    const auto status = static_cast<std::size_t>(source.family->family().Condition);
+    return status < words.size() ? single(words[status].toString()) : FieldValues();
+}
+
+FieldValues created(const FieldSource& source)
+{
+    return single(source, source.family->family().created);
+}
+
+FieldValues last_edit(const FieldSource& source)
+{
+    return single(source, source.family->family().last_edit);
+}
+
+FieldValues booked_out_person(const FieldSource& source)
+{
+    return single(source.family->family().booked_out_person);
+}
+
+FieldValues booked_out_date(const FieldSource& source)
+{
+    return single(source, source.family->family().booked_out_date);
+}
+
+FieldValues residential_lines(const FieldSource& source)
+{
+    return listed(address_lines(*source.family, SuburbType::residential));
+}
+
+FieldValues suburb(const FieldSource& source)
+{
+    return single(suburb_name(source.family->residential()));
+}
+
+FieldValues postcode(const FieldSource& source)
+{
+    return single(postcode_of(source.family->residential()));
+}
+
+FieldValues suburb_address(const FieldSource& source)
+{
+    return single(suburb_line(*source.family, SuburbType::residential));
+}
+
+FieldValues postal_lines(const FieldSource& source)
+{
+    return listed(address_lines(*source.family, SuburbType::postal));
+}
+
+FieldValues postal_suburb(const FieldSource& source)
+{
+    return single(suburb_name(source.family->postal()));
+}
+
+FieldValues postal_postcode(const FieldSource& source)
+{
+    return single(postcode_of(source.family->postal()));
+}
+
+FieldValues mailing(const FieldSource& source)
+{
+    return listed(mailing_lines(*source.family));
+}
+
+FieldValues other_contacts(const FieldSource& source)
+{
+    FieldValues values;
+    for (const auto& one : source.family->file().other_contacts)
+        values.push_back({joined(u": ", {one.contact, one.phone}), one.contact, one.phone});
+    return values;
+}
+
+FieldValues events(const FieldSource& source)
+{
+    FieldValues values;
+    for (const auto& one : source.family->file().events) {
+        const auto day = shown(*source.family, one.event_date);
+        values.push_back({joined(u" ", {day, one.event}), one.event, day});
+    }
+    return values;
+}
+
+FieldValues visits(const FieldSource& source)
+{
+    FieldValues values;
+    if (!source.run.visits)
+        return values;
+    for (const auto& one : source.family->file().visits)
+        values.push_back({joined(u" ", {shown(*source.family, one.date), joined(u": ", {one.visitor, one.comments})})});
+    return values;
+}
+
+FieldValues name(const FieldSource& source)
+{
+    return single(source.family->name(*source.person));
+}
+
+FieldValues full_name(const FieldSource& source)
+{
+    return single(
+        joined(u" ", {source.person->Title, source.family->name(*source.person), source.family->family().surname}));
+}
+
+FieldValues person_id(const FieldSource& source)
+{
+    return single(QString::number(source.person->person_id));
+}
+
+FieldValues role(const FieldSource& source)
+{
+    const auto household = people::household_of(source.family->people());
+    const auto* person = source.person;
+    return single(person == household.primary  ? u"Primary"_s
+                  : person == household.spouse ? u"Spouse"_s
+                  : people::is_child(*person)  ? u"Child"_s
+                                               : u"Adult"_s);
+}
+
+FieldValues position(const FieldSource& source)
+{
+    return {{.text = QString::number(source.person->position), .place = source.person->position}};
+}
+
+FieldValues birthdate(const FieldSource& source)
+{
+    return single(source, source.person->birthdate);
+}
+
+FieldValues age(const FieldSource& source)
+{
+    const auto& born = source.person->birthdate;
+    if (!born || !born->year_known())
+        return {};
+    const auto today = core::Date::from(source.run.today);
+    const bool birthday_ahead = std::pair(today.month, today.day) < std::pair(born->month, born->day);
+    const int years = today.year - born->year - (birthday_ahead ? 1 : 0);
+    return years < 0 ? FieldValues() : FieldValues{{.text = QString::number(years), .place = years}};
+}
+
+FieldValues school_year(const FieldSource& source)
+{
+    const auto& year = source.person->school_year;
+    return {{.text = people::school_year_text(year), .place = year.value_or(0)}};
+}
+
+FieldValues ministries(const FieldSource& source)
+{
+    return ministries_of(source, {});
+}
+
+FieldValues active_ministries(const FieldSource& source)
+{
+    return ministries_of(source, MinistryState::active);
+}
+
+FieldValues potential_ministries(const FieldSource& source)
+{
+    return ministries_of(source, MinistryState::potential);
+}
+
+FieldValues project(const FieldSource& source)
+{
+    return single(source.receipt->project);
+}
+
+FieldValues from(const FieldSource& source)
+{
+    return single(source.receipt->from);
+}
+
+FieldValues to(const FieldSource& source)
+{
+    return single(source.receipt->to);
+}
+
+FieldValues total(const FieldSource& source)
+{
+    return single(source.receipt->total);
+}
+
+FieldValues gifts(const FieldSource& source)
+{
+    return single(QString::number(source.receipt->gifts));
+}
+
+FieldValues gift_list(const FieldSource& source)
+{
+    return listed(source.receipt->gift_list);
+}
+
+} // namespace kindrel::output::custom

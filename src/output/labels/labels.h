@@ -1,0 +1,40 @@
+#pragma once
+
+#include "output/labels/label_setup.h"
+#include "output/report_choices.h"
+#include "output/report_layout.h"
+
+#include <type_traits>
+
+namespace kindrel::output {
+
+enum class TagBars { none, bars, bars_and_number };
+
+struct NameTagLayout
+{
+    ReportLayout report;
+    TagBars bars;
+};
+static_assert(std::is_standard_layout_v<NameTagLayout>);
+
+/// A label for each family of the list; one whose address is not known or hidden gets its names alone.
+[[nodiscard]] bool write_mailing_labels(const ReportInput& input, const void* layout, core::Progress& progress,
+                                        pages::Flow& flow);
+/// A tag for each person of the list. `layout` is a NameTagLayout.
+[[nodiscard]] bool write_name_tags(const ReportInput& input, const void* layout, core::Progress& progress,
+                                   pages::Flow& flow);
+/// The sheet of the office's label setup.
+[[nodiscard]] pages::PageSetup mailing_label_page(const ReportInput& input);
+[[nodiscard]] pages::PageSetup name_tag_page(const ReportInput& input);
+
+/// Whether the stored sheets can be printed.
+[[nodiscard]] bool mailing_labels_printable(const core::Office& office);
+[[nodiscard]] bool name_tags_printable(const core::Office& office);
+
+/// The reports on sheets that need not be those of the office, nor saved. They are not part of the report tree.
+[[nodiscard]] ReportChoice mailing_labels_on(const LabelSheet& sheet);
+[[nodiscard]] ReportChoice name_tags_on(const TagSheet& sheet);
+
+[[nodiscard]] std::span<const ReportDefinition> label_reports();
+
+} // namespace kindrel::output

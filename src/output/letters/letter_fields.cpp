@@ -1,0 +1,164 @@
+#include "output/letters/letter_fields.h"
+
+#include "output/family_lines.h"
+
+#include <QStringList>
+
+#include <algorithm>
+
+namespace kindrel::output {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr QStringView conjunction = u" & ";
+
+/// How a joint form of address names a person.
+enum class Called { by_name, by_initial };
+
+bool addressed_by_post(const LetterFamily& to)
+{
+    if (to.address != LetterAddress::mailing)
+        return to.address == LetterAddress::postal;
+    return !address_lines(to.family, people::SuburbType::postal).isEmpty();
+}
+
+QString name_of(const LetterFamily& to, const people::Person* person, Called called = Called::by_name)
+{
+    const auto name = person ? to.family.name(*person) : QString();
+    if (called == Called::by_name || name.isEmpty())
+        return name;
+    return name.first(name.front().isHighSurrogate() && name.size() > 1 ? 2 : 1).toUpper();
+}
+
+QString title_of(const people::Person* person)
+{
+    return person ? person->Title : QString();
+}
+
+QString both_names(const LetterFamily& to, Called called = Called::by_name)
+{
+    const auto& household = to.household;
+    return joined(conjunction, {name_of(to, household.primary, called), name_of(to, household.spouse, called)});
+}
+
+/// Titles stand together before the names when both have one; a single title stays with its own name.
+QString titled(const LetterFamily& to, Called called)
+{
+    const auto& [primary, spouse] = std::pair{to.household.primary, to.household.spouse};
+    const auto first = title_of(primary), second = title_of(spouse);
+    if (!first.isEmpty() && !second.isEmpty())
+        return joined(u" ", {joined(conjunction, {first, second}), both_names(to, called)});
+    return joined(conjunction, {joined(u" ", {first, name_of(to, primary, called)}),
+                                joined(u" ", {second, name_of(to, spouse, called)})});
+}
+
+const QString& surname(const LetterFamily& to)
+{
+    return to.family.family().surname;
+}
+
+QString children_names(const LetterFamily& to)
+{
+    QStringList names;
+    for (const auto* child : to.household.children)
+        names += to.family.name(*child);
+    names.removeAll(QString());
+    const auto last = names.isEmpty() ? QString() : names.takeLast();
+    return joined(conjunction, {names.join(u", "_s), last});
+}
+
+QString street(const LetterFamily& to)
+{
+    const auto& address = to.family.address();
+    return addressed_by_post(to) ? address.post_street : address.res_street;
+}
+
+QString second_street_line(const LetterFamily& to)
+{
+    const auto& address = to.family.address();
+    return addressed_by_post(to) ? address.post_street2 : address.res_street2;
+}
+
+QString suburb(const LetterFamily& to)
+{
+    const bool post = addressed_by_post(to);
+    const auto& address = to.family.address();
+    const auto* const suburb = post ? to.family.postal() : to.family.residential();
+    const auto& state = post ? address.post_state : address.res_state;
+    return suburb ? joined(u" ", {suburb->suburb, state, suburb->shown_postcode()}) : state;
+}
+
+constexpr people::Extent nothing_more{};
+constexpr people::Extent details{people::Part::details};
+constexpr people::Extent address{people::Part::address};
+
+using To = const LetterFamily&;
+
+constexpr LetterField fields[]{
+    {u"[Surname]", nullptr, [](To to) { return surname(to); }, nothing_more},
+    {u"[Primary_Name]", u"[First_Adult_Name]", [](To to) { return name_of(to, to.household.primary); }, nothing_more},
+    {u"[Spouse_Name]", u"[Second_Adult_Name]", [](To to) { return name_of(to, to.household.spouse); }, nothing_more},
+    {u"[Primary_&_Spouse_Name]", u"[First_&_Second_Adult_Name]", [](To to) { return both_names(to); }, nothing_more},
+    {u"[Primary_&_Spouse_Name_&_Surname]", u"[First_&_Second_Adult_Name_&_Surname]",
+     [](To to) {
+         return joined(u" ", {both_names(to), surname(to)});
+     },
+     nothing_more},
+    {u"[Titles_&_Primary_&_Spouse_Name_&_Surname]", u"[Titles_&_First_&_Second_Adult_Name_&_Surname]",
+     [](To to) {
+         return joined(u" ", {titled(to, Called::by_name), surname(to)});
+     },
+     details},
+    {u"[Titles_&_Primary_&_Spouse_initial_&_Surname]", u"[Titles_&_First_&_Second_Adult_initial_&_Surname]",
+     [](To to) {
+         return joined(u" ", {titled(to, Called::by_initial), surname(to)});
+     },
+     details},
+    {u"[Primary_Title]", u"[First_Adult_Title]", [](To to) { return title_of(to.household.primary); }, details},
+    {u"[Spouse_Title]", u"[Second_Adult_Title]", [](To to) { return title_of(to.household.spouse); }, details},
+    {u"[Children_Names]", nullptr, children_names, nothing_more},
+    {u"[____Street_Address____]", nullptr, street, address},
+    {u"[____Street_line_2_____]", nullptr, second_street_line, address},
+    {u"[____Suburb_Address____]", nullptr, suburb, address},
+    {u"[&_Family]", nullptr, [](To) { return u"& Family"_s; }, nothing_more},
+    {u"[Computer_Date]", nullptr, [](To to) { return to.today.toString(u"dd/MM/yy"); }, nothing_more},
+};
+
+} // namespace
+
+LetterFamily LetterFamily::of(const people::DisclosedFamily& family, LetterAddress address, QDate today)
+{
+    auto household = people::household_of(family.people());
+    const auto gone = [](const people::Person* person) {
+        return person->Decease;
+    };
+    std::erase_if(household.adults, gone);
+    std::erase_if(household.children, gone);
+    if (household.spouse && household.spouse->Decease)
+        household.spouse = nullptr;
+    if (household.primary && household.primary->Decease) {
+        household.primary = household.adults.empty() ? nullptr : household.adults.front();
+        household.spouse = nullptr;
+    }
+    return {family, std::move(household), address, today};
+}
+
+std::span<const LetterField> letter_fields()
+{
+    return fields;
+}
+
+std::optional<FoundField> field_at_start(QStringView text)
+{
+    for (std::size_t place = 0; place < std::size(fields); ++place) {
+        for (const auto* spelling : {fields[place].text, fields[place].older}) {
+            if (spelling && text.startsWith(QStringView(spelling)))
+                return FoundField{place, QStringView(spelling).size()};
+        }
+    }
+    return std::nullopt;
+}
+
+} // namespace kindrel::output

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "output/catalogue.h"
+#include "pages/page.h"
+
+#include <array>
+#include <functional>
+#include <optional>
+
+namespace kindrel::output {
+
+/// A leaf of the report tree, whether the program brought it or the church: the catalogue's reports, and what lies in
+/// the folders of custom and plug-in layouts and letters. Leaves of one family follow each other.
+struct ReportChoice
+{
+    QString key; ///< The same as long as its file keeps its name.
+    QString family, leaf, description;
+    /// As run_report().
+    std::function<bool(const ReportInput&, core::Progress&, pages::PageSpool&)> run;
+    /// Whether nothing stands in the way of a run: it would say nothing. Looked at before a picture is drawn.
+    std::function<bool(const core::Office&)> ready;
+    /// The pages alone, without the locks of a run; where it is empty, a run has none.
+    std::function<bool(const ReportInput&, core::Progress&, pages::PageSpool&)> draw = {};
+};
+
+/// The families of what the church brings itself. They stand in the tree even while they are empty.
+inline constexpr std::array own_families{"Custom Reports", "Custom Letters"};
+
+/// All of them, as the folders are now.
+[[nodiscard]] std::vector<ReportChoice> report_choices(const core::Office& office);
+
+/// Writes the first page of the report over the beginning of the list, for a picture of its layout. Nullopt when there
+/// is nothing to show. Throws core::DatabaseError and core::FileError.
+[[nodiscard]] std::optional<pages::Page> first_page(const ReportChoice& report, const ReportInput& input);
+
+} // namespace kindrel::output
