@@ -1,8 +1,11 @@
 #include "desktop/areas.h"
 
+#include "desktop/core/global_variables_page.h"
 #include "desktop/core/network_page.h"
 #include "desktop/core/security_page.h"
+#include "desktop/core/vision_page.h"
 #include "desktop/output/catalogue_page.h"
+#include "desktop/output/label_setup_page.h"
 #include "desktop/people/editor_page.h"
 #include "desktop/people/filters_page.h"
 #include "desktop/people/fusion_page.h"
@@ -10,6 +13,8 @@
 #include "desktop/people/search_page.h"
 #include "desktop/people/setup_page.h"
 #include "desktop/people/tagging_page.h"
+#include "desktop/registers/project_setup_page.h"
+#include "desktop/registers/weekly_page.h"
 
 #include <array>
 
@@ -38,13 +43,21 @@ constexpr std::array areas{
     AreaDefinition{"filters", "Filters", "view-filter", core::AreaId::search, Parked::stay, make<FiltersPage>},
     AreaDefinition{"tagging", "Tagging", "tag", core::AreaId::tagging, Parked::setups_leave, enter<TaggingPage>},
     AreaDefinition{"reports", "Reports", "office-report", core::AreaId::reports, Parked::stay, make<CataloguePage>},
+    AreaDefinition{"weekly", "Weekly", "office-chart-bar", core::AreaId::weekly, Parked::setups_leave,
+                   enter<WeeklyPage>},
     AreaDefinition{"setup", "Setup", "settings-configure", core::AreaId::family_setup, Parked::leave_first,
                    enter<SetupPage>},
     AreaDefinition{"fusions", "Fusions", "merge", core::AreaId::fusions, Parked::stay, enter<FusionPage>},
+    AreaDefinition{"setup_projects", "Project Setup", "project-development", core::AreaId::project_setup,
+                   Parked::leave_first, enter<ProjectSetupPage>},
     AreaDefinition{"security", "Security", "object-locked", core::AreaId::security, Parked::leave_first,
                    enter<SecurityPage>},
     AreaDefinition{"network", "Network", "network-workgroup", core::AreaId::network_setup, Parked::leave_first,
                    enter<NetworkPage>},
+    AreaDefinition{"labels", "Labels", "view-list-icons", core::AreaId::reports, Parked::stay, enter<LabelSetupPage>},
+    AreaDefinition{"vision", "Vision", "flag", core::AreaId::vision_setup, Parked::leave_first, enter<VisionPage>},
+    AreaDefinition{"global_data", "Global Data", "globe", core::AreaId::global_data, Parked::leave_first,
+                   enter<GlobalVariablesPage>},
 };
 
 } // namespace

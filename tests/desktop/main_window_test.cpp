@@ -26,7 +26,11 @@ protected:
             return key == QLatin1StringView(area.key);
         };
         const auto areas = desktop::all_areas();
-        press(in, Qt::Key(Qt::Key_1 + (std::ranges::find_if(areas, is_meant) - areas.begin())), Qt::ControlModifier);
+        const auto place_in_rail = std::ranges::find_if(areas, is_meant) - areas.begin();
+        if (place_in_rail < 9)
+            press(in, Qt::Key(Qt::Key_1 + place_in_rail), Qt::ControlModifier);
+        else
+            QTest::mouseClick(&child<desktop::RailButton>(in, key), Qt::LeftButton);
     }
     [[nodiscard]] QStringList locked_areas()
     {

@@ -1,6 +1,5 @@
 #include "core/locks.h"
 #include "core/security_setup.h"
-#include "desktop/areas.h"
 #include "desktop/desktop_fixture.h"
 #include "desktop/shell/page.h"
 #include "desktop/shell/rail.h"
@@ -57,12 +56,8 @@ protected:
     void SetUp() override { begin(); }
     void open_page()
     {
-        const auto areas = desktop::all_areas();
-        const auto is_security = [](const auto& area) {
-            return QLatin1StringView(area.key) == "security"_L1;
-        };
-        const auto number = std::ranges::find_if(areas, is_security) - areas.begin();
-        press(window(), Qt::Key(int(Qt::Key_1) + int(number)), Qt::ControlModifier);
+        running->open_area(u"security"_s);
+        settle();
     }
     void close_page() { press(window(), Qt::Key_W, Qt::ControlModifier); }
     [[nodiscard]] bool in_page() { return window().page()->objectName() == u"security"_s; }

@@ -1,11 +1,13 @@
 #include "desktop/output/catalogue_page.h"
 
 #include "desktop/output/preview_window.h"
+#include "desktop/output/report_drawing.h"
 #include "desktop/output/report_tree.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
 
+#include <QComboBox>
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPushButton>
@@ -16,47 +18,80 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int tree_width = 320;
+constexpr int tree_width = 340;
+const QString paper_key = u"reports/paper"_s;
 
 } // namespace
 
 CataloguePage::CataloguePage(Desk& desk)
-    : Page(u"Create Reports and Data Analysis"_s), m_desk(desk), m_tree(new ReportTree), m_leaf(make_heading({})),
-      m_description(make_value())
+    : Page(u"Create Reports and Data Analysis"_s), m_desk(desk), m_tree(new ReportTree(desk.office)),
+      m_leaf(make_heading({})), m_description(make_value()), m_paper(new QComboBox), m_drawing(new ReportDrawing(desk))
 {
     setObjectName(u"reports"_s);
     keep_width(*m_tree, tree_width);
     connect(m_tree, &ReportTree::chosen_changed, this, &CataloguePage::show_chosen);
     connect(m_tree, &ReportTree::wanted, this, &CataloguePage::open_chosen);
-    auto* preview = new QPushButton(icon(u"document-print-preview"_s), u"&Preview"_s);
-    preview->setObjectName(u"preview"_s);
-    connect(preview, &QPushButton::clicked, this, &CataloguePage::open_chosen);
-    auto* scope = make_value();
-    scope->setText(u"The report is made of all active families."_s);
-    dress(*scope, TextSize::secondary);
-
-    auto* details = new QVBoxLayout;
-    details->setSpacing(space::margin);
-    for (QLabel* label : {m_leaf, m_description, scope})
-        details->addWidget(label);
-    details->addWidget(preview, 0, Qt::AlignLeft);
-    details->addStretch(1);
     auto* content = new QWidget;
     auto* row = new QHBoxLayout(content);
     row->setContentsMargins(space::group, 0, space::group, space::margin);
     row->setSpacing(2 * space::group);
     row->addWidget(m_tree);
-    row->addLayout(details, 1);
+    row->addLayout(make_details(), 1);
     set_content(content);
-    set_status(m_tree->reports() == 1 ? u"1 report"_s : u"%1 reports"_s.arg(m_tree->reports()));
-    show_chosen();
+}
+
+QLayout* CataloguePage::make_details()
+{
+    auto* scope = make_value();
+    scope->setText(u"The report is made of all active families. To choose who is on it, use Tagging."_s);
+    dress(*scope, TextSize::secondary);
+    auto* column = new QVBoxLayout;
+    column->setSpacing(space::margin);
+    for (QLabel* label : {m_leaf, m_description, scope}) {
+        label->setWordWrap(true);
+        column->addWidget(label);
+    }
+    column->addLayout(make_paper());
+    column->addWidget(m_drawing, 1);
+    return column;
+}
+
+QLayout* CataloguePage::make_paper()
+{
+    auto* preview = new QPushButton(icon(u"document-print-preview"_s), u"&Preview"_s);
+    preview->setObjectName(u"preview"_s);
+    preview->setToolTip(u"Enter, Ctrl+P"_s);
+    connect(preview, &QPushButton::clicked, this, &CataloguePage::open_chosen);
+    m_paper->setObjectName(u"paper"_s);
+    m_paper->addItems({u"A4"_s, u"Letter"_s});
+    m_paper->setCurrentIndex(std::clamp(m_desk.remembered.value(paper_key, 0).toInt(), 0, m_paper->count() - 1));
+    connect(m_paper, &QComboBox::currentIndexChanged, this, [this](int paper) {
+        m_desk.remembered.keep(paper_key, paper);
+        show_chosen();
+    });
+    auto* caption = new QLabel(u"P&aper"_s);
+    caption->setBuddy(m_paper);
+    auto* row = new QHBoxLayout;
+    row->setSpacing(space::field);
+    row->addWidget(preview);
+    row->addSpacing(space::group);
+    row->addWidget(caption);
+    row->addWidget(m_paper);
+    row->addStretch(1);
+    return row;
+}
+
+output::RunOptions CataloguePage::options() const
+{
+    return {.paper = static_cast<pages::Paper>(m_paper->currentIndex())};
 }
 
 void CataloguePage::show_chosen()
 {
     const auto* report = m_tree->chosen();
-    m_leaf->setText(report ? QString::fromLatin1(report->leaf) : QString());
-    m_description->setText(report ? QString::fromLatin1(report->description) : QString());
+    m_leaf->setText(report ? report->leaf : QString());
+    m_description->setText(report ? report->description : u"Choose a report."_s);
+    m_drawing->show_report(report, m_list, options());
 }
 
 void CataloguePage::open_chosen()
@@ -64,16 +99,26 @@ void CataloguePage::open_chosen()
     const auto* report = m_tree->chosen_or_told(m_desk.office.dialogue);
     if (!report)
         return;
-    open_preview(m_desk, QString::fromLatin1(report->leaf),
-                 [report, &office = m_desk.office](core::Progress& progress, pages::PageSpool& spool) {
+    open_preview(m_desk, report->leaf,
+                 [run = report->run, &office = m_desk.office, options = options()](core::Progress& progress,
+                                                                                   pages::PageSpool& spool) {
                      const people::WorkingList list = people::active_families(*office.session);
-                     return output::run_report(*report, {office, list}, progress, spool);
+                     return run({office, list, options}, progress, spool);
                  });
 }
 
 void CataloguePage::entered()
 {
-    m_tree->setFocus();
+    m_tree->reload();
+    m_list = people::active_families(*m_desk.office.session);
+    set_status(m_tree->reports() == 1 ? u"1 report"_s : u"%1 reports"_s.arg(m_tree->reports()));
+    show_chosen();
+    find();
+}
+
+void CataloguePage::find()
+{
+    m_tree->setFocus(Qt::OtherFocusReason);
 }
 
 } // namespace kindrel::desktop

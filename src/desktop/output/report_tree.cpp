@@ -1,6 +1,7 @@
 #include "desktop/output/report_tree.h"
 
 #include <QKeyEvent>
+#include <QTreeWidgetItemIterator>
 
 namespace kindrel::desktop {
 
@@ -8,42 +9,69 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int key_role = Qt::UserRole;
+constexpr int place_role = Qt::UserRole;
 
 } // namespace
 
-ReportTree::ReportTree(QWidget* parent) : QTreeWidget(parent)
+ReportTree::ReportTree(const core::Office& office, QWidget* parent) : QTreeWidget(parent), m_office(office)
 {
     setObjectName(u"catalogue"_s);
     setAccessibleName(u"Reports"_s);
     setHeaderHidden(true);
     connect(this, &QTreeWidget::currentItemChanged, this, &ReportTree::chosen_changed);
-    connect(this, &QTreeWidget::itemDoubleClicked, this, &ReportTree::wanted);
+    connect(this, &QTreeWidget::itemDoubleClicked, this, [this](const QTreeWidgetItem* item) {
+        if (item->data(0, place_role).isValid())
+            Q_EMIT wanted();
+    });
     fill();
+    choose(m_choices.empty() ? QString() : m_choices.front().key);
+}
+
+void ReportTree::reload()
+{
+    const auto* before = chosen();
+    const QString key = before ? before->key : QString();
+    fill();
+    choose(key);
 }
 
 void ReportTree::fill()
 {
+    const QSignalBlocker quiet(this);
+    clear();
+    m_choices = output::report_choices(m_office);
     QTreeWidgetItem* family = nullptr;
-    for (const auto& report : output::catalogue()) {
-        const QString family_name = QString::fromLatin1(report.family);
-        if (!family || family->text(0) != family_name)
-            family = new QTreeWidgetItem(this, {family_name});
-        auto* leaf = new QTreeWidgetItem(family, {QString::fromLatin1(report.leaf)});
-        leaf->setData(0, key_role, QString::fromLatin1(report.key));
-        if (++m_reports == 1)
-            setCurrentItem(leaf);
+    for (std::size_t place = 0; place < m_choices.size(); ++place) {
+        const auto& choice = m_choices[place];
+        if (!family || family->text(0) != choice.family)
+            family = new QTreeWidgetItem(this, {choice.family});
+        auto* leaf = new QTreeWidgetItem(family, {choice.leaf});
+        leaf->setData(0, place_role, int(place));
     }
-    expandAll();
+    for (const char* own : output::own_families) {
+        const auto name = QString::fromLatin1(own);
+        if (findItems(name, Qt::MatchExactly).isEmpty())
+            new QTreeWidgetItem(this, {name});
+    }
 }
 
-const output::ReportDefinition* ReportTree::chosen() const
+void ReportTree::choose(const QString& key)
+{
+    for (QTreeWidgetItemIterator item(this); *item; ++item) {
+        const auto place = (*item)->data(0, place_role);
+        if (place.isValid() && m_choices[place.toUInt()].key == key)
+            return setCurrentItem(*item);
+    }
+}
+
+const output::ReportChoice* ReportTree::chosen() const
 {
     const auto* item = currentItem();
-    return item ? output::find_report(item->data(0, key_role).toString()) : nullptr;
+    const auto place = item ? item->data(0, place_role) : QVariant();
+    return place.isValid() ? &m_choices[place.toUInt()] : nullptr;
 }
 
-const output::ReportDefinition* ReportTree::chosen_or_told(core::Dialogue& dialogue) const
+const output::ReportChoice* ReportTree::chosen_or_told(core::Dialogue& dialogue) const
 {
     const auto* report = chosen();
     if (!report)

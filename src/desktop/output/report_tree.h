@@ -1,29 +1,32 @@
 #pragma once
 
 #include "core/dialogue.h"
-#include "output/catalogue.h"
+#include "output/report_choices.h"
 
 #include <QTreeWidget>
 
 namespace kindrel::desktop {
 
-/// The catalogue's families with their reports, the first one chosen.
+/// The families of reports with their leaves, the first one chosen.
 class ReportTree : public QTreeWidget
 {
     Q_OBJECT
 
 public:
-    explicit ReportTree(QWidget* parent = nullptr);
+    explicit ReportTree(const core::Office& office, QWidget* parent = nullptr);
 
-    [[nodiscard]] int reports() const { return m_reports; }
+    /// Looks again for the church's own layouts; the choice stays.
+    void reload();
+    [[nodiscard]] int reports() const { return int(m_choices.size()); }
     /// Null while none is.
-    [[nodiscard]] const output::ReportDefinition* chosen() const;
+    [[nodiscard]] const output::ReportChoice* chosen() const;
     /// The same, but says so when none is.
-    [[nodiscard]] const output::ReportDefinition* chosen_or_told(core::Dialogue& dialogue) const;
+    [[nodiscard]] const output::ReportChoice* chosen_or_told(core::Dialogue& dialogue) const;
+    void choose(const QString& key);
 
 Q_SIGNALS:
     void chosen_changed();
-    /// Enter or a double click.
+    /// Enter or a double click on a report.
     void wanted();
 
 protected:
@@ -32,7 +35,8 @@ protected:
 private:
     void fill();
 
-    int m_reports = 0;
+    const core::Office& m_office;
+    std::vector<output::ReportChoice> m_choices;
 };
 
 } // namespace kindrel::desktop

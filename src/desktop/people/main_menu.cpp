@@ -45,8 +45,9 @@ struct Task
 std::vector<Task> tasks_of(Desk& desk)
 {
     return {
-        {u"reports"_s, u"Create Reports and Data Analysis"_s, u"Directories of the church's families."_s,
-         u"office-report"_s, core::Area::report_outputs,
+        {u"reports"_s, u"Create Reports and Data Analysis"_s,
+         u"Directories, lists, labels, albums and every other report."_s, u"office-report"_s,
+         core::Area::report_outputs,
          [&desk] {
              desk.navigation.open_area(u"reports"_s);
          }},
@@ -84,16 +85,14 @@ QWidget* MainMenu::make_side()
 {
     m_totals = new FamilyTotals;
     connect(m_totals, &FamilyTotals::chosen, this, [this](FamilyList list) { m_families->choose(list); });
-    auto* vision = make_value();
-    vision->setObjectName(u"vision"_s);
-    vision->setText(m_desk.office.settings.vision);
-    vision->setVisible(!vision->text().isEmpty());
-    vision->setContentsMargins(space::field, 0, 0, 0);
+    m_vision = make_value();
+    m_vision->setObjectName(u"vision"_s);
+    m_vision->setContentsMargins(space::field, 0, 0, 0);
 
     auto* column = new QVBoxLayout;
     column->setContentsMargins(space::field, 0, 0, 0);
     column->setSpacing(space::group);
-    column->addWidget(vision);
+    column->addWidget(m_vision);
     column->addWidget(m_totals);
     add_tasks(*column);
     column->addStretch(1);
@@ -142,8 +141,15 @@ void MainMenu::add_list_actions()
     });
 }
 
+void MainMenu::show_vision()
+{
+    m_vision->setText(m_desk.office.settings.vision);
+    m_vision->setVisible(!m_vision->text().isEmpty());
+}
+
 void MainMenu::load()
 {
+    show_vision();
     m_change_mark = m_desk.office.session->change_mark();
     m_totals->show_totals(people::family_totals(*m_desk.office.session));
     m_families->reload();

@@ -3,6 +3,7 @@
 #include "desktop/shell/desk.h"
 #include "desktop/shell/page.h"
 
+class QLabel;
 class QVBoxLayout;
 
 namespace kindrel::desktop {
@@ -32,6 +33,7 @@ private:
     [[nodiscard]] QWidget* make_list();
     void add_tasks(QVBoxLayout& column);
     void add_list_actions();
+    void show_vision();
     void load();
     void load_if_changed();
     void open(int row);
@@ -40,6 +42,7 @@ private:
     void offer_draft();
 
     Desk& m_desk;
+    QLabel* m_vision = nullptr;
     FamilyTotals* m_totals = nullptr;
     FamilyListWidget* m_families = nullptr;
     bool m_drafts_offered = false;

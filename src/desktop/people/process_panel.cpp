@@ -1,6 +1,7 @@
 #include "desktop/people/process_panel.h"
 
 #include "desktop/output/preview_window.h"
+#include "desktop/output/report_drawing.h"
 #include "desktop/output/report_tree.h"
 #include "desktop/people/bulk_panel.h"
 #include "desktop/shell/icons.h"
@@ -23,8 +24,9 @@ const QString tab_key = u"tagging/process"_s;
 } // namespace
 
 ProcessPanel::ProcessPanel(Desk& desk, TaggingSheet& sheet)
-    : StepPanel(sheet, u"Process"_s), m_desk(desk), m_tree(new ReportTree), m_description(make_value()),
-      m_bulk(new BulkPanel(desk)), m_tabs(new QTabWidget)
+    : StepPanel(sheet, u"Process"_s), m_desk(desk), m_tree(new ReportTree(desk.office)),
+      m_drawing(new ReportDrawing(desk)), m_description(make_value()), m_bulk(new BulkPanel(desk)),
+      m_tabs(new QTabWidget)
 {
     m_tabs->setObjectName(u"process_tabs"_s);
     m_tabs->setDocumentMode(true);
@@ -53,8 +55,9 @@ QWidget* ProcessPanel::make_reports()
     auto* column = new QVBoxLayout(reports);
     column->setContentsMargins(0, space::field, 0, 0);
     column->setSpacing(space::field);
-    column->addWidget(m_tree, 1);
+    column->addWidget(m_tree, 3);
     column->addWidget(m_description);
+    column->addWidget(m_drawing, 2);
     column->addWidget(preview, 0, Qt::AlignLeft);
     show_chosen();
     return reports;
@@ -63,12 +66,15 @@ QWidget* ProcessPanel::make_reports()
 void ProcessPanel::show_chosen()
 {
     const auto* report = m_tree->chosen();
-    m_description->setText(report ? QString::fromLatin1(report->description) : QString());
+    m_description->setText(report ? report->description : QString());
+    m_drawing->show_report(report, m_list, sheet().options);
 }
 
 void ProcessPanel::reload()
 {
     m_bulk->reload();
+    m_tree->reload();
+    show_chosen();
 }
 
 void ProcessPanel::focus_first()
@@ -83,6 +89,7 @@ void ProcessPanel::set_list(const people::WorkingList& list)
 {
     m_list = list;
     m_bulk->set_list(list);
+    show_chosen();
 }
 
 void ProcessPanel::open_report()
@@ -91,12 +98,12 @@ void ProcessPanel::open_report()
     if (!report)
         return;
     const auto& options = sheet().options;
-    const QString title = options.title.isEmpty() ? QString::fromLatin1(report->leaf) : options.title;
-    open_preview(
-        m_desk, title,
-        [report, &office = m_desk.office, list = m_list, options](core::Progress& progress, pages::PageSpool& spool) {
-            return output::run_report(*report, {office, list, options}, progress, spool);
-        });
+    const QString title = options.title.isEmpty() ? report->leaf : options.title;
+    open_preview(m_desk, title,
+                 [run = report->run, &office = m_desk.office, list = m_list, options](core::Progress& progress,
+                                                                                      pages::PageSpool& spool) {
+                     return run({office, list, options}, progress, spool);
+                 });
 }
 
 } // namespace kindrel::desktop

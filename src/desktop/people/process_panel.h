@@ -10,6 +10,7 @@ class QTabWidget;
 namespace kindrel::desktop {
 
 class BulkPanel;
+class ReportDrawing;
 class ReportTree;
 
 /// The last step: a report over the list, or a bulk change of its people.
@@ -36,6 +37,7 @@ private:
     Desk& m_desk;
     people::WorkingList m_list;
     ReportTree* m_tree;
+    ReportDrawing* m_drawing;
     QLabel* m_description;
     BulkPanel* m_bulk;
     QTabWidget* m_tabs;

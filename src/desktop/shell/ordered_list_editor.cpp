@@ -87,9 +87,11 @@ void OrderedListEditor::add_commands()
     add({"move_up", "Move &up", "go-up", Qt::ALT | Qt::Key_Up}, &OrderedListEditor::move_up);
     add({"move_down", "Move &down", "go-down", Qt::ALT | Qt::Key_Down}, &OrderedListEditor::move_down);
     m_side->start_group();
-    add({"sort", "&Sort", "view-sort-ascending-name"}, &OrderedListEditor::sort);
-    add({"import", "&Import", "document-import"}, &OrderedListEditor::import);
-    m_side->start_group();
+    if (m_list->has_tools()) {
+        add({"sort", "&Sort", "view-sort-ascending-name"}, &OrderedListEditor::sort);
+        add({"import", "&Import", "document-import"}, &OrderedListEditor::import);
+        m_side->start_group();
+    }
     auto* insert = new QShortcut(Qt::Key_Insert, this);
     insert->setContext(Qt::WidgetWithChildrenShortcut);
     connect(insert, &QShortcut::activated, this, &OrderedListEditor::focus_add_line);

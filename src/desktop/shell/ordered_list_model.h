@@ -43,9 +43,12 @@ public:
     [[nodiscard]] virtual bool remove(int index) = 0;
     [[nodiscard]] virtual bool move_up(int index) = 0;
     [[nodiscard]] virtual bool move_down(int index) = 0;
-    [[nodiscard]] virtual bool sort() = 0;
+
+    /// Whether the list can be sorted and imported into.
+    [[nodiscard]] virtual bool has_tools() const { return true; }
+    [[nodiscard]] virtual bool sort() { return false; }
     /// What the import brought, in words; nothing when there was none.
-    [[nodiscard]] virtual std::optional<QString> import() = 0;
+    [[nodiscard]] virtual std::optional<QString> import() { return {}; }
 };
 
 /// Shows an ordered list as a table: its fields, which can be edited in place, then remark and users.

@@ -1,0 +1,195 @@
+#include "desktop/registers/weekly_page.h"
+
+#include "desktop/registers/weekly_entry.h"
+#include "desktop/registers/weekly_output.h"
+#include "desktop/shell/chip.h"
+#include "desktop/shell/empty_panel.h"
+#include "desktop/shell/icons.h"
+#include "desktop/shell/look.h"
+#include "desktop/shell/note_bar.h"
+
+#include <QAction>
+#include <QPushButton>
+#include <QShortcut>
+#include <QStackedWidget>
+#include <QTabWidget>
+#include <QVBoxLayout>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int entry_tab = 0;
+constexpr int output_tab = 1;
+
+} // namespace
+
+WeeklyPage* WeeklyPage::open(Desk& desk)
+{
+    auto entry = core::enter(desk.office, core::AreaId::weekly);
+    return entry ? new WeeklyPage(desk, std::move(*entry)) : nullptr;
+}
+
+WeeklyPage::WeeklyPage(Desk& desk, core::AreaEntry entry)
+    : Page(u"Weekly Statistics"_s), m_desk(desk), m_entry(std::move(entry)), m_weekly(desk.office),
+      m_tabs(new QTabWidget), m_content(new QStackedWidget), m_figures(new WeeklyEntry(desk, m_weekly)),
+      m_output(new WeeklyOutput(desk))
+{
+    setObjectName(u"weekly"_s);
+    m_tabs->setObjectName(u"weekly_tabs"_s);
+    m_tabs->setDocumentMode(true);
+    m_tabs->addTab(m_figures, u"Entry"_s);
+    m_tabs->addTab(m_output, u"Output"_s);
+    m_content->addWidget(m_tabs);
+    m_content->addWidget(make_empty());
+    set_content(m_content);
+    add_actions();
+    connect(m_figures, &WeeklyEntry::changed, this, &WeeklyPage::show_state);
+    connect(m_figures, &WeeklyEntry::remarked, this, [this](const QString& words) {
+        if (words.isEmpty())
+            note().clear();
+        else
+            note().say(words);
+    });
+    connect(m_tabs, &QTabWidget::currentChanged, this, &WeeklyPage::turn_to);
+}
+
+WeeklyPage::~WeeklyPage() = default;
+
+QWidget* WeeklyPage::make_empty()
+{
+    auto* words = new EmptyPanel;
+    words->say(u"There is no weekly project yet"_s,
+               u"A weekly project is a list of what you count each week. Set one up, then come back."_s);
+    auto* setup = new QPushButton(icon(u"settings-configure"_s), u"&Set up a weekly project"_s);
+    setup->setObjectName(u"open_setup"_s);
+    setup->setEnabled(core::may_enter(m_desk.office, core::AreaId::project_setup));
+    connect(setup, &QPushButton::clicked, this, [this] { m_desk.navigation.open_area(u"setup_projects"_s); });
+    words->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Maximum);
+    auto* panel = new QWidget;
+    auto* column = new QVBoxLayout(panel);
+    column->addStretch(1);
+    column->addWidget(words);
+    column->addWidget(setup, 0, Qt::AlignHCenter);
+    column->addStretch(2);
+    return panel;
+}
+
+void WeeklyPage::add_actions()
+{
+    auto* keep = add_action(u"Save"_s, u"document-save"_s, u"Save the figures of the open date (Ctrl+S)"_s);
+    connect(keep, &QAction::triggered, this, &WeeklyPage::save);
+    auto* print_figures = add_action(u"Print"_s, u"document-print"_s,
+                                     u"Print the figures of the open date, or the chosen report (Ctrl+P)"_s);
+    connect(print_figures, &QAction::triggered, this, &WeeklyPage::print);
+    auto* csv = add_action(u"Save as CSV"_s, u"document-save"_s,
+                           u"Save the figures of the open date as comma-separated text"_s);
+    connect(csv, &QAction::triggered, m_figures, &WeeklyEntry::save_csv);
+    const auto key = [this](const QKeySequence& keys, auto run) {
+        auto* made = new QShortcut(keys, this);
+        made->setContext(Qt::WidgetWithChildrenShortcut);
+        connect(made, &QShortcut::activated, this, run);
+    };
+    key(Qt::CTRL | Qt::Key_PageUp, [this] { m_tabs->setCurrentIndex(entry_tab); });
+    key(Qt::CTRL | Qt::Key_PageDown, [this] { m_tabs->setCurrentIndex(output_tab); });
+    key(Qt::Key_Insert, [this] {
+        m_tabs->setCurrentIndex(entry_tab);
+        m_figures->focus_new_date();
+    });
+}
+
+bool WeeklyPage::at_entry() const
+{
+    return m_tabs->currentIndex() == entry_tab;
+}
+
+void WeeklyPage::entered()
+{
+    if (!m_figures->finish_typing())
+        return;
+    // Projects and dates may have come or gone while no date was open here.
+    const bool usable = m_weekly.open_date() || m_weekly.enter();
+    m_content->setCurrentIndex(usable ? 0 : 1);
+    if (!usable) {
+        if (auto* setup = findChild<QPushButton*>(u"open_setup"_s))
+            setup->setFocus();
+        return;
+    }
+    m_figures->show_register();
+    turn_to(m_tabs->currentIndex());
+}
+
+void WeeklyPage::turn_to(int tab)
+{
+    if (tab == entry_tab) {
+        m_figures->focus_work();
+        return;
+    }
+    m_output->reload();
+    m_output->focus_reports();
+}
+
+void WeeklyPage::find()
+{
+    if (at_entry())
+        m_figures->focus_dates();
+    else
+        m_output->focus_reports();
+}
+
+void WeeklyPage::print()
+{
+    if (at_entry())
+        m_figures->print();
+    else
+        m_output->run();
+}
+
+bool WeeklyPage::altered() const
+{
+    return m_weekly.altered() || m_figures->typing();
+}
+
+bool WeeklyPage::save()
+{
+    if (!m_figures->finish_typing())
+        return false;
+    if (!m_weekly.open_date())
+        return true;
+    bool saved = false;
+    try {
+        saved = m_weekly.save();
+    } catch (const core::DatabaseError& error) {
+        m_desk.office.dialogue.show({u"Unable to save the figures of this date"_s, error.text()});
+    }
+    m_saved = saved;
+    show_state();
+    return saved;
+}
+
+bool WeeklyPage::leave()
+{
+    if (!m_figures->finish_typing())
+        return false;
+    const bool left = m_weekly.leave();
+    m_figures->show_register();
+    m_figures->focus_work();
+    return left;
+}
+
+void WeeklyPage::show_state()
+{
+    const bool unsaved = altered();
+    m_saved = m_saved && !unsaved && m_weekly.open_date();
+    chip().set(unsaved        ? u"not saved"_s
+               : holds_lock() ? u"date open"_s
+                              : QString(),
+               unsaved ? State::altered : State::plain);
+    const auto count = m_weekly.dates().size();
+    set_status(m_saved ? u"Saved"_s : count == 1 ? u"1 date"_s : u"%1 dates"_s.arg(count));
+    Q_EMIT state_changed();
+}
+
+} // namespace kindrel::desktop

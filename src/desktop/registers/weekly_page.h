@@ -1,0 +1,55 @@
+#pragma once
+
+#include "core/entry.h"
+#include "desktop/shell/desk.h"
+#include "desktop/shell/page.h"
+#include "registers/weekly_register.h"
+
+class QStackedWidget;
+class QTabWidget;
+
+namespace kindrel::desktop {
+
+class WeeklyEntry;
+class WeeklyOutput;
+
+/// Weekly statistics: the figures of one date at a time, and the reports on them. The project is locked for others
+/// while one of its dates is open.
+class WeeklyPage : public Page
+{
+    Q_OBJECT
+
+public:
+    /// Null, after saying why, when the area cannot be entered.
+    [[nodiscard]] static WeeklyPage* open(Desk& desk);
+    ~WeeklyPage() override;
+
+    [[nodiscard]] QString help() const override { return QStringLiteral("weekly"); }
+    void entered() override;
+    void find() override;
+    void print() override;
+    bool save() override;
+    [[nodiscard]] bool altered() const override;
+    [[nodiscard]] bool holds_lock() const override { return m_weekly.open_date().has_value(); }
+    [[nodiscard]] bool leave() override;
+
+private:
+    WeeklyPage(Desk& desk, core::AreaEntry entry);
+
+    [[nodiscard]] QWidget* make_empty();
+    void add_actions();
+    void turn_to(int tab);
+    [[nodiscard]] bool at_entry() const;
+    void show_state();
+
+    Desk& m_desk;
+    core::AreaEntry m_entry;
+    registers::WeeklyRegister m_weekly;
+    QTabWidget* m_tabs;
+    QStackedWidget* m_content;
+    WeeklyEntry* m_figures;
+    WeeklyOutput* m_output;
+    bool m_saved = false;
+};
+
+} // namespace kindrel::desktop

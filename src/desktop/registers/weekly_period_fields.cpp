@@ -1,0 +1,174 @@
+#include "desktop/registers/weekly_period_fields.h"
+
+#include "desktop/shell/date_field.h"
+#include "desktop/shell/look.h"
+
+#include <QComboBox>
+#include <QGridLayout>
+#include <QLabel>
+#include <QLineEdit>
+
+namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
+using registers::PeriodKind;
+using registers::ReportPeriod;
+
+namespace {
+
+const QString period_key = u"weekly/period_"_s;
+constexpr int years_proposed = 5;
+constexpr int year_width = 96;
+
+struct KindName
+{
+    PeriodKind kind;
+    const char* name;
+};
+constexpr std::array all_kinds{
+    KindName{PeriodKind::date_range, "Date range"},
+    KindName{PeriodKind::calendar_year, "Calendar year"},
+    KindName{PeriodKind::financial_year, "Financial year"},
+    KindName{PeriodKind::year_span, "Several years"},
+};
+
+bool fits(PeriodKind kind, ReportPeriod report)
+{
+    const bool year = kind == PeriodKind::calendar_year || kind == PeriodKind::financial_year;
+    switch (report) {
+    case ReportPeriod::any_days:
+        return kind != PeriodKind::year_span;
+    case ReportPeriod::one_year:
+        return year;
+    case ReportPeriod::years:
+        return kind == PeriodKind::year_span;
+    }
+    return false;
+}
+
+} // namespace
+
+WeeklyPeriodFields::WeeklyPeriodFields(Desk& desk, QWidget* parent)
+    : QWidget(parent), m_desk(desk), m_kind(new QComboBox), m_first(new QLabel), m_second(new QLabel(u"&To"_s))
+{
+    const QDate today = desk.office.clock.today();
+    m_kind->setObjectName(u"period_kind"_s);
+    m_from = make_date(u"from"_s, {today.year(), 1, 1}, m_from_date);
+    m_to = make_date(u"to"_s, core::Date::from(today), m_to_date);
+    m_year = make_year(u"year"_s, today.year());
+    m_from_year = make_year(u"from_year"_s, today.year() - years_proposed + 1);
+    m_to_year = make_year(u"to_year"_s, today.year());
+    auto* caption = new QLabel(u"P&eriod"_s);
+    caption->setBuddy(m_kind);
+    auto* grid = new QGridLayout(this);
+    grid->setContentsMargins(0, 0, 0, 0);
+    grid->setHorizontalSpacing(space::field);
+    grid->setVerticalSpacing(space::field);
+    grid->addWidget(caption, 0, 0);
+    grid->addWidget(m_kind, 0, 1, 1, 3);
+    grid->addWidget(m_first, 1, 0);
+    grid->addWidget(m_from, 1, 1);
+    grid->addWidget(m_year, 1, 1);
+    grid->addWidget(m_from_year, 1, 1);
+    grid->addWidget(m_second, 1, 2);
+    grid->addWidget(m_to, 1, 3);
+    grid->addWidget(m_to_year, 1, 3);
+    grid->setColumnStretch(1, 1);
+    grid->setColumnStretch(3, 1);
+    keep_width(*caption, caption_width);
+    connect(m_kind, &QComboBox::currentIndexChanged, this, &WeeklyPeriodFields::show_fields);
+    connect(m_kind, &QComboBox::currentIndexChanged, this, &WeeklyPeriodFields::keep_kind);
+    fit(m_report);
+}
+
+DateField* WeeklyPeriodFields::make_date(const QString& name, const core::Date& proposed,
+                                         std::optional<core::Date>& date)
+{
+    const auto kept = core::Date::from_stored(m_desk.remembered.value(period_key + name).toString());
+    date = kept.value_or(proposed);
+    auto* field = new DateField(m_desk.office);
+    field->setObjectName(name);
+    field->show_date(date);
+    connect(field, &DateField::entered, this, [&date](std::optional<core::Date> typed) { date = typed; });
+    return field;
+}
+
+QComboBox* WeeklyPeriodFields::make_year(const QString& name, int proposed)
+{
+    auto* field = new QComboBox;
+    field->setObjectName(name);
+    field->setEditable(true);
+    field->setInsertPolicy(QComboBox::NoInsert);
+    field->setCompleter(nullptr);
+    field->addItems(registers::offered_years());
+    field->lineEdit()->setPlaceholderText(u"YYYY"_s);
+    field->setCurrentText(m_desk.remembered.value(period_key + name, proposed).toString());
+    keep_width(*field, year_width);
+    return field;
+}
+
+void WeeklyPeriodFields::fit(ReportPeriod report)
+{
+    m_report = report;
+    {
+        const QSignalBlocker quiet(m_kind);
+        m_kind->clear();
+        for (const auto& each : all_kinds)
+            if (fits(each.kind, report))
+                m_kind->addItem(QString::fromLatin1(each.name), int(each.kind));
+        m_kind->setCurrentIndex(
+            std::max(m_kind->findData(m_desk.remembered.value(period_key + u"kind_%1"_s.arg(int(report)))), 0));
+    }
+    show_fields();
+}
+
+PeriodKind WeeklyPeriodFields::kind() const
+{
+    return static_cast<PeriodKind>(m_kind->currentData().toInt());
+}
+
+void WeeklyPeriodFields::show_fields()
+{
+    const bool range = kind() == PeriodKind::date_range;
+    const bool span = kind() == PeriodKind::year_span;
+    m_from->setVisible(range);
+    m_to->setVisible(range);
+    m_year->setVisible(!range && !span);
+    m_from_year->setVisible(span);
+    m_to_year->setVisible(span);
+    m_second->setVisible(range || span);
+    m_first->setText(range || span ? u"&From"_s : u"&Year"_s);
+    m_first->setBuddy(range ? static_cast<QWidget*>(m_from) : span ? m_from_year : m_year);
+    m_second->setBuddy(range ? static_cast<QWidget*>(m_to) : m_to_year);
+}
+
+std::optional<registers::PeriodChoice> WeeklyPeriodFields::choice()
+{
+    if (kind() == PeriodKind::date_range && !(m_from->finish() && m_to->finish()))
+        return {};
+    return registers::PeriodChoice{.kind = kind(),
+                                   .from = m_from_date,
+                                   .to = m_to_date,
+                                   .year = (kind() == PeriodKind::year_span ? m_from_year : m_year)->currentText(),
+                                   .to_year = m_to_year->currentText()};
+}
+
+void WeeklyPeriodFields::keep(const QString& name, const QVariant& value)
+{
+    m_desk.remembered.keep(period_key + name, value);
+}
+
+void WeeklyPeriodFields::keep_kind()
+{
+    keep(u"kind_%1"_s.arg(int(m_report)), int(kind()));
+}
+
+void WeeklyPeriodFields::remember()
+{
+    keep(u"from"_s, m_from_date ? m_from_date->stored() : QString());
+    keep(u"to"_s, m_to_date ? m_to_date->stored() : QString());
+    for (const QComboBox* year : {m_year, m_from_year, m_to_year})
+        keep(year->objectName(), year->currentText());
+}
+
+} // namespace kindrel::desktop
