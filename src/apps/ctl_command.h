@@ -80,5 +80,9 @@ struct Command
 [[nodiscard]] Status run_people(Context& context);
 [[nodiscard]] Status run_reports(Context& context);
 [[nodiscard]] Status run_report(Context& context);
+[[nodiscard]] Status run_backup(Context& context);
+[[nodiscard]] Status run_backups(Context& context);
+[[nodiscard]] Status run_show_backup(Context& context);
+[[nodiscard]] Status run_restore(Context& context);
 
 } // namespace kindrel::apps

@@ -19,7 +19,7 @@ constexpr std::array program_options{
     Option{"help", nullptr, "show this help, or that of the command"},
 };
 
-constexpr int option_column = 24;
+constexpr int option_column = 31;
 
 void add(QCommandLineParser& parser, std::span<const Option> options)
 {

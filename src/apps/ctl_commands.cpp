@@ -7,6 +7,7 @@ namespace kindrel::apps {
 namespace {
 
 constexpr Option json{"json", nullptr, "write the result as JSON"};
+constexpr Option backup_password{"backup-password-file", "FILE", "the file of the backup's password, its first line"};
 
 constexpr std::array list_options{json};
 constexpr std::array make_church_options{
@@ -42,6 +43,17 @@ constexpr std::array report_options{
     Option{"pdf", "FILE", "the file to write; one that is there is replaced once the report is complete"},
     Option{"paper", "SIZE", "a4 or letter (default a4)"},
 };
+constexpr std::array backup_options{
+    Option{"to", "FOLDER", "where to put it (default: the next of the church's own folders Backup1 to Backup5)"},
+    Option{"encrypt", nullptr, "encrypt it; without its password nobody can read it again"},
+    backup_password,
+    Option{"without", "LIST", "what to leave out: pictures, documents, letters"},
+};
+constexpr std::array show_backup_options{backup_password};
+constexpr std::array restore_options{
+    backup_password,
+    Option{"yes", nullptr, "replace the present state without asking; it is kept as a backup all the same"},
+};
 
 constexpr std::array command_table{
     Command{"install",
@@ -73,18 +85,27 @@ constexpr std::array command_table{
             "Lists the people whom all criteria choose, with the fields asked for.\n"
             "What is unlisted, or what your rights do not cover, is left out.",
             Needs::church, core::Area::export_text, 0, people_options, run_people},
-    Command{"reports",
-            "[--json]",
-            "list the reports",
-            "Lists the catalogue: key, family, name and content.",
-            Needs::nothing,
-            {},
-            0,
-            list_options,
-            run_reports},
+    Command{"reports", "[--json]", "list the reports",
+            "Lists the catalogue and the church's own layouts: key, family, name and content.", Needs::church,
+            core::Area::report_outputs, 0, list_options, run_reports},
     Command{"report", "KEY|NAME --pdf FILE [--paper SIZE]", "write a report of the active families to a PDF file",
             "Runs the report with this key or name (see \"reports\") over the active families.",
             Needs::church_and_fonts, core::Area::report_outputs, 1, report_options, run_report},
+    Command{"backup", "[--to FOLDER] [--encrypt --backup-password-file FILE] [--without LIST]", "back the church up",
+            "Backs the church up, with its pictures, documents and letters, and compares everything in the backup.\n"
+            "In the church's own folders it takes the place of the backup made five times before.",
+            Needs::church, core::Area::backup_data, 0, backup_options, run_backup},
+    Command{"backups", "[--json]", "list the backups",
+            "Lists the church's backups, the newest first. A verified one was compared after it was written and has\n"
+            "not changed since.",
+            Needs::church, core::Area::backup_data, 0, list_options, run_backups},
+    Command{"show-backup", "FILE [--backup-password-file FILE]", "show what is in a backup",
+            "Shows what is in a backup beside what it would replace. Nothing changes.", Needs::church,
+            core::Area::restore_data, 1, show_backup_options, run_show_backup},
+    Command{"restore", "FILE [--backup-password-file FILE] [--yes]", "replace the church by a backup",
+            "Replaces the church by a backup of it, once everything in the backup was compared. The state before is\n"
+            "kept as a backup first. Asks on the terminal; where nobody sits at it, nothing changes without --yes.",
+            Needs::church, core::Area::restore_data, 1, restore_options, run_restore},
 };
 
 } // namespace

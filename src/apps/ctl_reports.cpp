@@ -1,7 +1,7 @@
 #include "apps/ctl_command.h"
 #include "apps/ctl_listing.h"
 
-#include "output/catalogue.h"
+#include "output/report_choices.h"
 #include "pages/pdf.h"
 
 namespace kindrel::apps {
@@ -18,18 +18,28 @@ std::optional<pages::Paper> paper_from(const QString& word)
     return word == "letter"_L1 ? std::optional(pages::Paper::letter) : std::nullopt;
 }
 
-Status write_report(Context& context, const output::ReportDefinition& report, pages::Paper paper, const QString& file)
+Status write_report(Context& context, const output::ReportChoice& report, pages::Paper paper, const QString& file)
 {
     const auto list = people::active_families(*context.office->session);
     core::SilentProgress progress;
     pages::PageSpool spool;
-    if (!output::run_report(report, {*context.office, list, {.paper = paper}}, progress, spool))
+    if (!report.run({*context.office, list, {.paper = paper}}, progress, spool))
         return Status::refused;
-    const pages::PdfProperties properties{QString::fromUtf8(report.leaf), context.office->church_name};
+    const pages::PdfProperties properties{report.leaf, context.office->church_name};
     if (!pages::write_pdf(spool, file, properties))
         return Status::refused;
     context.out << u"%1: %2 pages in %3\n"_s.arg(properties.title).arg(spool.page_count()).arg(file);
     return Status::done;
+}
+
+/// By key or by name, without regard to case.
+std::optional<output::ReportChoice> find_choice(const core::Office& office, const QString& name)
+{
+    for (auto& choice : output::report_choices(office)) {
+        if (choice.key.compare(name, Qt::CaseInsensitive) == 0 || choice.leaf.compare(name, Qt::CaseInsensitive) == 0)
+            return std::move(choice);
+    }
+    return std::nullopt;
 }
 
 } // namespace
@@ -40,9 +50,8 @@ Status run_reports(Context& context)
                      {u"family"_s, u"Family"_s},
                      {u"report"_s, u"Report"_s},
                      {u"description"_s, u"Content"_s}});
-    for (const auto& report : output::catalogue())
-        listing.add({QString::fromUtf8(report.key), QString::fromUtf8(report.family), QString::fromUtf8(report.leaf),
-                     QString::fromUtf8(report.description)});
+    for (const auto& report : output::report_choices(*context.office))
+        listing.add({report.key, report.family, report.leaf, report.description});
     listing.print(context.out, context.arguments.has(u"json"_s));
     return Status::done;
 }
@@ -56,7 +65,7 @@ Status run_report(Context& context)
         context.dialogue.show({file.isEmpty() ? u"--pdf names the file to write."_s : u"--paper is a4 or letter."_s});
         return Status::wrong_usage;
     }
-    const auto* report = output::find_report(name);
+    const auto report = find_choice(*context.office, name);
     if (!report) {
         context.dialogue.show({u"There is no report \"%1\", see \"kindrelctl reports\"."_s.arg(name)});
         return Status::refused;

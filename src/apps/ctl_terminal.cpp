@@ -47,8 +47,9 @@ private:
 
 } // namespace
 
-TerminalDialogue::TerminalDialogue(QString password_file)
-    : m_in(stdin), m_err(stderr), m_attended(isatty(STDIN_FILENO) != 0), m_password_file(std::move(password_file))
+TerminalDialogue::TerminalDialogue(QString password_file, Questions questions)
+    : m_in(stdin), m_err(stderr), m_attended(isatty(STDIN_FILENO) != 0), m_password_file(std::move(password_file)),
+      m_questions(questions)
 {
 }
 
@@ -72,6 +73,8 @@ std::optional<QString> TerminalDialogue::ask(const QString& prompt)
 bool TerminalDialogue::confirm(const core::Message& message, core::Answer safe)
 {
     show(message);
+    if (m_questions == Questions::answered_yes && message.icon == core::Icon::question)
+        return true;
     const bool safe_answer = safe == core::Answer::yes;
     const auto answer = ask(safe_answer ? u"[Y/n] "_s : u"[y/N] "_s);
     return answer ? yes_or_no(*answer).value_or(safe_answer) : safe_answer;

@@ -6,13 +6,16 @@
 
 namespace kindrel::apps {
 
+/// Whether the person said yes beforehand: to questions, not to cautions.
+enum class Questions { asked, answered_yes };
+
 /// Speaks on standard error and listens on standard input. Where nobody sits at it, every question gets the answer
 /// that loses nothing, but for a password: that is read from the given file, else as a line of standard input.
 class TerminalDialogue final : public core::Dialogue
 {
 public:
     /// No password file: empty.
-    explicit TerminalDialogue(QString password_file = {});
+    explicit TerminalDialogue(QString password_file = {}, Questions questions = Questions::asked);
     void show(const core::Message& message) override;
     [[nodiscard]] bool confirm(const core::Message& message, core::Answer safe) override;
     [[nodiscard]] std::optional<bool> confirm_or_cancel(const core::Message& message) override;
@@ -30,6 +33,7 @@ private:
     QTextStream m_err;
     bool m_attended;
     QString m_password_file;
+    Questions m_questions;
 };
 
 } // namespace kindrel::apps

@@ -78,9 +78,11 @@ int main(int count, char** words)
     QTextStream out(stdout);
     if (line.fault.isEmpty() && line.help) {
         out << (line.command ? apps::help_text(*line.command) : apps::help_text());
-        return 0;
+        out.flush();
+        return static_cast<int>(out.status() == QTextStream::Ok ? apps::Status::done : apps::Status::refused);
     }
-    apps::TerminalDialogue dialogue(line.arguments.value(u"password-file"_s));
+    const auto questions = line.arguments.has(u"yes"_s) ? apps::Questions::answered_yes : apps::Questions::asked;
+    apps::TerminalDialogue dialogue(line.arguments.value(u"password-file"_s), questions);
     auto status = apps::Status::wrong_usage;
     if (line.fault.isEmpty()) {
         const auto application = application_for(line.command->needs, count, words);

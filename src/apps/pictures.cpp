@@ -2,15 +2,19 @@
 
 #include "core/files.h"
 #include "desktop/output/preview_window.h"
+#include "desktop/output/report_drawing.h"
 #include "desktop/people/family_card.h"
 #include "desktop/people/group_details_dialog.h"
 #include "desktop/people/quick_add_dialogs.h"
 #include "desktop/people/speed_find.h"
 #include "desktop/shell/main_window.h"
+#include "desktop/shell/page.h"
 #include "people/address_book.h"
 
 #include <QApplication>
+#include <QDialog>
 #include <QLineEdit>
+#include <QListWidget>
 #include <QPushButton>
 #include <QTabWidget>
 #include <QTextStream>
@@ -36,6 +40,8 @@ public:
         for (const auto appearance : {Appearance::light, Appearance::dark}) {
             m_look.apply(appearance, 100);
             QApplication::processEvents();
+            for (auto* drawing : window.findChildren<desktop::ReportDrawing*>())
+                drawing->draw_now();
             const QString shade = appearance == Appearance::light ? u"light"_s : u"dark"_s;
             m_failed |= !window.grab().save(u"%1%2-%3.png"_s.arg(m_folder, name, shade));
         }
@@ -90,6 +96,7 @@ void take_reports(desktop::Running& running, Camera& camera)
     if (auto* preview = running.window()->findChild<QPushButton*>(u"preview"_s))
         preview->click();
     QApplication::processEvents();
+    QApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete); // A report of nobody closes its window.
     for (auto* window : running.desk()->windows.all<desktop::PreviewWindow>())
         camera.take(*window, u"preview"_s);
 }
@@ -100,6 +107,34 @@ void take_areas(desktop::Running& running, Camera& camera, const QStringList& ke
         open_area(running, key);
         camera.take(*running.window(), key);
     }
+}
+
+void take_tabs(QWidget& window, const QString& name, Camera& camera)
+{
+    auto* tabs = window.findChild<QTabWidget*>(name);
+    for (int tab = 0; tabs && tab < tabs->count(); ++tab) {
+        tabs->setCurrentIndex(tab);
+        camera.take(window, u"%1-%2"_s.arg(name).arg(tab + 1));
+    }
+}
+
+void take_registers(desktop::Running& running, Camera& camera)
+{
+    auto& window = *running.window();
+    open_area(running, u"weekly"_s);
+    if (auto* dates = window.page()->findChild<QListWidget*>(u"dates"_s); dates && dates->count() > 0) {
+        Q_EMIT dates->itemActivated(dates->item(0));
+        QApplication::processEvents();
+    }
+    take_tabs(window, u"weekly_tabs"_s, camera);
+    if (auto* notes = window.findChild<QPushButton*>(u"notes"_s))
+        notes->click();
+    if (auto* dialog = window.findChild<QDialog*>(u"Roll_notes"_s)) {
+        camera.take(*dialog, u"notes"_s);
+        dialog->reject();
+    }
+    open_area(running, u"setup_projects"_s);
+    take_tabs(window, u"registers"_s, camera);
 }
 
 void take_speed_find(desktop::Running& running, Camera& camera)
@@ -176,7 +211,11 @@ int take_pictures(desktop::Running& running, desktop::Look& look, const QString&
     take_editor(running, camera);
     take_reports(running, camera);
     take_areas(running, camera,
-               {u"search"_s, u"filters"_s, u"tagging"_s, u"setup"_s, u"fusions"_s, u"security"_s, u"network"_s});
+               {u"search"_s, u"filters"_s, u"tagging"_s, u"setup"_s, u"fusions"_s, u"security"_s, u"network"_s,
+                u"vision"_s, u"global_data"_s});
+    open_area(running, u"labels"_s);
+    take_tabs(*running.window(), u"label_tabs"_s, camera);
+    take_registers(running, camera);
     take_speed_find(running, camera);
     take_dialogs(running.desk()->office, camera);
     open_area(running, u"main_menu"_s);

@@ -1,0 +1,116 @@
+#include "apps/ctl_terminal.h"
+#include "apps/mender_commands.h"
+
+#include "core/mender_place.h"
+#include "core/system_workstation.h"
+
+#include <QCommandLineParser>
+#include <QCoreApplication>
+
+using namespace kindrel;
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr int done = 0, findings = 1, wrong_usage = 2;
+
+QString help_text()
+{
+    return u"Usage: kindrel-mender [OPTIONS] check|mend|unlock|recover FILE\n\n"
+           "Looks after a church's records that Kindrel cannot or must not open.\n\n"
+           "  check         tell what is wrong; nothing is changed\n"
+           "  mend          put it right, after a copy of the database was laid into the church's folder 'mended'\n"
+           "  unlock        remove every lock and marker that keeps people out; make sure first that nobody is inside\n"
+           "  recover FILE  write what can be read of a damaged church file into FILE, a new church file\n\n"
+           "Options:\n"
+           "  --data-drive DIR  the folder that holds Kindrel_10_Data (default: the workstation's own)\n"
+           "  --church N        the church: 1 to 7, 8 for training data, 9 for booked-out data\n"
+           "  --from FILE       the damaged church file (recover only; default: the church's own)\n"
+           "  --json            the findings for programs (check only)\n"
+           "  --remove-locks    unlock the church before mending it\n"
+           "  --yes             ask nothing\n"
+           "  --help            show this help\n\n"
+           "The status is 0 when the church is sound, 1 when something is wrong, was refused or failed, 2 for wrong\n"
+           "usage.\n"_s;
+}
+
+void declare_options(QCommandLineParser& parser)
+{
+    parser.addOptions({{u"data-drive"_s, {}, u"DIR"_s},
+                       {u"church"_s, {}, u"N"_s},
+                       {u"from"_s, {}, u"FILE"_s},
+                       {u"json"_s, {}},
+                       {u"yes"_s, {}},
+                       {u"remove-locks"_s, {}},
+                       {u"help"_s, {}}});
+}
+
+/// Nullopt where the command line cannot be understood; `fault` says why.
+std::optional<apps::MenderOrder> order_of(const QCommandLineParser& parser, QString& fault)
+{
+    const auto words = parser.positionalArguments();
+    apps::MenderOrder order{.command = apps::mender_command(words.value(0)),
+                            .target = words.value(1),
+                            .damaged = parser.value(u"from"_s),
+                            .json = parser.isSet(u"json"_s),
+                            .ask = !parser.isSet(u"yes"_s),
+                            .remove_locks = parser.isSet(u"remove-locks"_s)};
+    bool number = true;
+    order.request = {core::Purpose::command_line, 0, parser.value(u"data-drive"_s)};
+    if (parser.isSet(u"church"_s))
+        order.request.church = parser.value(u"church"_s).toInt(&number);
+    const int expected = order.command == apps::recover_command() ? 2 : 1;
+    const bool in_range = order.request.church >= 1 && order.request.church <= core::booked_out_church;
+    if (!order.command)
+        fault = u"Say what to do: check, mend, unlock or recover FILE."_s;
+    else if (words.size() != expected)
+        fault = words.size() < expected ? u"The name of the new church file is missing."_s
+                                        : u"There are too many arguments."_s;
+    else if (parser.isSet(u"church"_s) && !(number && in_range))
+        fault = u"The church is a number from 1 to %1."_s.arg(core::booked_out_church);
+    return fault.isEmpty() ? std::optional(order) : std::nullopt;
+}
+
+/// The edge at which every failure turns into a message and a status.
+int run(const apps::MenderOrder& order, core::Dialogue& dialogue, QTextStream& out)
+{
+    core::SystemWorkstation workstation;
+    core::SystemClock clock;
+    try {
+        auto place = core::find_church_to_mend(order.request, workstation, clock);
+        const bool sound = order.command({order, place, dialogue, out});
+        out.flush();
+        return sound ? done : findings;
+    } catch (const core::DatabaseError& error) {
+        dialogue.show({u"The database could not be read or written."_s, error.text()});
+    } catch (const core::FileError& error) {
+        dialogue.show({error.text()});
+    } catch (const std::exception& error) {
+        dialogue.show({QString::fromUtf8(error.what())});
+    }
+    out.flush();
+    return findings;
+}
+
+} // namespace
+
+int main(int count, char** words)
+{
+    const QCoreApplication application(count, words);
+    QCommandLineParser parser;
+    declare_options(parser);
+    QTextStream out(stdout);
+    apps::TerminalDialogue dialogue;
+    QString fault;
+    if (!parser.parse(QCoreApplication::arguments()))
+        fault = parser.errorText();
+    else if (parser.isSet(u"help"_s)) {
+        out << help_text();
+        return done;
+    }
+    const auto order = fault.isEmpty() ? order_of(parser, fault) : std::nullopt;
+    if (order)
+        return run(*order, dialogue, out);
+    dialogue.show({fault, u"See: kindrel-mender --help"_s});
+    return wrong_usage;
+}

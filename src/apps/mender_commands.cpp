@@ -1,0 +1,191 @@
+#include "apps/mender_commands.h"
+
+#include "core/church_recovery.h"
+#include "people/mender_people.h"
+
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+
+#include <algorithm>
+#include <array>
+
+namespace kindrel::apps {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+using core::Cure;
+using core::Finding;
+using core::Findings;
+
+QString word_of(Cure cure)
+{
+    switch (cure) {
+    case Cure::mend:
+        return u"mend"_s;
+    case Cure::unlock:
+        return u"unlock"_s;
+    case Cure::recover:
+        return u"recover"_s;
+    case Cure::by_hand:
+        return u"by hand"_s;
+    }
+    return {};
+}
+
+void print_json(QTextStream& out, const Findings& findings)
+{
+    QJsonArray list;
+    for (const auto& finding : findings)
+        list.append(QJsonObject{{u"kind"_s, finding.kind},
+                                {u"words"_s, finding.words},
+                                {u"count"_s, finding.count},
+                                {u"cure"_s, word_of(finding.cure)},
+                                {u"remedy"_s, finding.remedy}});
+    out << QJsonDocument(list).toJson();
+}
+
+void print(QTextStream& out, const Findings& findings)
+{
+    for (const auto& finding : findings)
+        out << "- " << finding.words << "\n  " << word_of(finding.cure) << ": " << finding.remedy << '\n';
+}
+
+QString church_in_words(const core::MenderPlace& place)
+{
+    return u"Church %1 (%2)"_s.arg(QString::number(place.church), place.paths.folder(core::Folder::church));
+}
+
+bool agreed(const MenderContext& context, const QString& question)
+{
+    return !context.order.ask || context.dialogue.confirm({question}, core::Answer::no);
+}
+
+bool refuse(const MenderContext& context, const QString& why)
+{
+    context.dialogue.show({why});
+    return false;
+}
+
+bool check(const MenderContext& context)
+{
+    const auto findings = core::examine_church(context.place, people::mender_checks());
+    if (context.order.json) {
+        print_json(context.out, findings);
+    } else if (findings.empty()) {
+        context.out << church_in_words(context.place) << " is sound.\n";
+    } else {
+        context.out << church_in_words(context.place) << ": "
+                    << core::counted(static_cast<int>(findings.size()), u"finding"_s, u"findings"_s) << "\n\n";
+        print(context.out, findings);
+    }
+    return findings.empty();
+}
+
+/// Nobody may be at work on this workstation while its church is mended.
+bool free_to_work(const MenderContext& context)
+{
+    return context.place.workstation.claim_single_instance(context.place.paths.folder(core::Folder::local_settings));
+}
+
+/// The number of locks and markers.
+qsizetype unlock_and_tell(const MenderContext& context)
+{
+    const auto removed = core::unlock_church(context.place);
+    for (const auto& line : removed)
+        context.out << "Removed: " << line << '\n';
+    return removed.size();
+}
+
+QString mending_question(const MenderContext& context)
+{
+    const QString question = u"Mend church %1? A copy of its database is kept."_s.arg(context.place.church);
+    return context.order.remove_locks
+               ? question + u" Every lock and marker is removed first: nobody may be inside or at work on it."_s
+               : question;
+}
+
+bool mend(const MenderContext& context)
+{
+    if (!free_to_work(context))
+        return refuse(context, u"Kindrel is running on this workstation: leave it first."_s);
+    if (!agreed(context, mending_question(context)))
+        return refuse(context, u"Nothing was changed."_s);
+    if (context.order.remove_locks)
+        unlock_and_tell(context);
+    const auto mending = core::mend_church(context.place, people::mender_checks());
+    if (!mending.refusal.isEmpty())
+        return refuse(context, mending.refusal);
+    if (!mending.copy.isEmpty())
+        context.out << "The database as it was before: " << mending.copy << "\n";
+    if (!mending.mended.empty()) {
+        context.out << "Mended:\n";
+        print(context.out, mending.mended);
+    }
+    if (mending.left.empty()) {
+        context.out << church_in_words(context.place) << " is sound.\n";
+    } else {
+        context.out << "Left:\n";
+        print(context.out, mending.left);
+    }
+    return mending.left.empty();
+}
+
+bool unlock(const MenderContext& context)
+{
+    if (!agreed(context, u"Remove every lock and marker of church %1? Nobody may be inside or at work on it."_s.arg(
+                             context.place.church)))
+        return refuse(context, u"Nothing was changed."_s);
+    if (unlock_and_tell(context) == 0)
+        context.out << church_in_words(context.place) << " was not locked.\n";
+    return true;
+}
+
+bool recover(const MenderContext& context)
+{
+    const auto& order = context.order;
+    const QString damaged = order.damaged.isEmpty() ? context.place.paths.database() : order.damaged;
+    context.place.session.reset();
+    if (!agreed(context, u"Write what can be read of '%1' into '%2'?"_s.arg(damaged, order.target)))
+        return refuse(context, u"Nothing was written."_s);
+    const auto tables = core::recover_church(damaged, order.target);
+    bool whole = true;
+    for (const auto& table : tables) {
+        const bool lost = !table.whole || table.refused > 0;
+        whole = whole && !lost;
+        if (table.rows == 0 && !lost)
+            continue;
+        context.out << table.table << ": " << core::counted(table.rows, u"row"_s, u"rows"_s)
+                    << (table.refused > 0 ? u", %1 refused"_s.arg(table.refused) : QString())
+                    << (table.whole ? QString() : u", a part could not be read"_s) << '\n';
+    }
+    context.out << "The new church file is '" << order.target << "'; '" << damaged << "' was left as it is.\n"
+                << "To work with it, move the damaged file away, give the new one its name, then mend the church.\n";
+    return whole;
+}
+
+struct Named
+{
+    const char16_t* word;
+    MenderCommand command;
+};
+constexpr std::array commands{Named{u"check", check}, Named{u"mend", mend}, Named{u"unlock", unlock},
+                              Named{u"recover", recover}};
+
+} // namespace
+
+MenderCommand mender_command(const QString& word)
+{
+    const auto found =
+        std::ranges::find_if(commands, [&](const Named& named) { return QStringView(named.word) == word; });
+    return found == commands.end() ? nullptr : found->command;
+}
+
+MenderCommand recover_command()
+{
+    return recover;
+}
+
+} // namespace kindrel::apps

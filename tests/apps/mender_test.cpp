@@ -1,0 +1,141 @@
+#include "kindrelctl_fixture.h"
+
+#include "core/locks.h"
+#include "core/sqlite_session.h"
+
+namespace kindrel::test {
+
+using namespace core;
+
+/// The real program on a church that the command line made.
+class MenderProgramTest : public KindrelctlTest
+{
+protected:
+    void SetUp() override { make_church(30); }
+
+    [[nodiscard]] Ended mender(const QStringList& words)
+    {
+        QProcess program;
+        program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrel-mender"_s,
+                      QStringList{u"--data-drive"_s, drive.path()} + words);
+        program.closeWriteChannel();
+        if (!program.waitForFinished(120'000) || program.exitStatus() != QProcess::NormalExit)
+            return {-1, {}, program.errorString().toUtf8()};
+        return {program.exitCode(), program.readAllStandardOutput(), program.readAllStandardError()};
+    }
+    [[nodiscard]] QString church() const { return drive.filePath(u"Kindrel_10_Data/church1/"_s); }
+    [[nodiscard]] QString database() const { return church() + u"KR10_records.kdl"_s; }
+    void in_church(const QString& statement) { open_sqlite(database())->execute(statement); }
+    [[nodiscard]] int families()
+    {
+        const auto session = open_sqlite(database());
+        auto rows = session->select(u"SELECT COUNT(*) FROM [tbl_surname];"_s);
+        return rows.first()->integer(Column{0});
+    }
+};
+
+TEST_F(MenderProgramTest, AChurchAndTheTrainingChurchAreSound)
+{
+    for (const auto& church : {u"1"_s, u"8"_s}) {
+        const auto ended = mender({u"--church"_s, church, u"check"_s});
+        EXPECT_EQ(ended.status, 0) << ended;
+        EXPECT_TRUE(ended.out.contains("is sound.")) << ended;
+        EXPECT_EQ(QJsonDocument::fromJson(mender({u"--church"_s, church, u"check"_s, u"--json"_s}).out).array(),
+                  QJsonArray());
+    }
+}
+
+TEST_F(MenderProgramTest, FindingsAreToldMendedWhenAgreedAndGoneAfterwards)
+{
+    in_church(u"DELETE FROM [tbl_address];"_s);
+    const auto found = mender({u"check"_s, u"--json"_s});
+    EXPECT_EQ(found.status, 1) << found;
+    const auto findings = QJsonDocument::fromJson(found.out).array();
+    ASSERT_EQ(findings.size(), 1) << found;
+    EXPECT_EQ(findings[0][u"kind"_s], u"companions"_s);
+    EXPECT_EQ(findings[0][u"count"_s], 30);
+    EXPECT_EQ(findings[0][u"cure"_s], u"mend"_s);
+
+    const auto unasked = mender({u"mend"_s}); // Nobody is there to say yes.
+    EXPECT_EQ(unasked.status, 1) << unasked;
+    EXPECT_EQ(mender({u"check"_s}).status, 1);
+
+    const auto mended = mender({u"mend"_s, u"--yes"_s});
+    EXPECT_EQ(mended.status, 0) << mended;
+    EXPECT_TRUE(mended.out.contains("KR10_records before mending")) << mended;
+    EXPECT_TRUE(mended.out.contains("30 families without an address record.")) << mended;
+    EXPECT_EQ(mender({u"check"_s}).status, 0);
+}
+
+TEST_F(MenderProgramTest, UnlockLetsPeopleIntoAChurchThatStartUpRefuses)
+{
+    FakeWorkstation other;
+    other.machine = u"office-2"_s;
+    FixedClock clock;
+    ASSERT_TRUE(Locks(*open_sqlite(database()), other, clock).take(LockKind::area, AreaCode::setup));
+    DataFolder::write(church() + u"lock.dat"_s, "1234567890");
+    EXPECT_EQ(run({u"totals"_s}).status, 1);
+    EXPECT_EQ(mender({u"check"_s}).status, 1);
+    EXPECT_EQ(mender({u"unlock"_s}).status, 1);
+    EXPECT_TRUE(QFile::exists(church() + u"lock.dat"_s));
+
+    const auto unlocked = mender({u"unlock"_s, u"--yes"_s});
+    EXPECT_EQ(unlocked.status, 0) << unlocked;
+    EXPECT_TRUE(unlocked.out.contains("office-2")) << unlocked;
+    EXPECT_TRUE(unlocked.out.contains("'lock.dat'")) << unlocked;
+    EXPECT_EQ(run({u"totals"_s}).status, 0);
+    EXPECT_EQ(mender({u"check"_s}).status, 0);
+}
+
+TEST_F(MenderProgramTest, MendingWaitsForTheLocksOfOthersUnlessToldToRemoveThem)
+{
+    in_church(u"DELETE FROM [tbl_address];"_s);
+    in_church(u"INSERT INTO [tbl_locked_family_files] ([surname_id],[workstation]) VALUES (1,'office-2');"_s);
+    const auto refused = mender({u"mend"_s, u"--yes"_s});
+    EXPECT_EQ(refused.status, 1) << refused;
+    EXPECT_TRUE(refused.err.contains("office-2")) << refused;
+    const auto mended = mender({u"mend"_s, u"--yes"_s, u"--remove-locks"_s});
+    EXPECT_EQ(mended.status, 0) << mended;
+    EXPECT_TRUE(mended.out.contains("Removed: ")) << mended;
+}
+
+TEST_F(MenderProgramTest, ADatabaseThatCannotBeOpenedIsRecoveredIntoANewFileAndTakenUpAgain)
+{
+    QByteArray content = DataFolder::read(database());
+    content.chop(content.size() / 20);
+    DataFolder::write(database(), content);
+    EXPECT_EQ(run({u"totals"_s}).status, 1);
+    const auto found = mender({u"check"_s, u"--json"_s});
+    EXPECT_EQ(found.status, 1) << found;
+    EXPECT_EQ(QJsonDocument::fromJson(found.out).array()[0][u"cure"_s], u"recover"_s) << found;
+    EXPECT_EQ(mender({u"mend"_s, u"--yes"_s}).status, 1);
+
+    const QString fresh = drive.filePath(u"fresh.kdl"_s);
+    const auto recovered = mender({u"recover"_s, fresh, u"--yes"_s});
+    ASSERT_TRUE(QFile::exists(fresh)) << recovered;
+    EXPECT_TRUE(recovered.out.contains("tbl_surname: ")) << recovered;
+    EXPECT_EQ(DataFolder::read(database()), content);
+
+    ASSERT_TRUE(QFile::rename(database(), database() + u".damaged"_s) && QFile::rename(fresh, database()));
+    const auto mended = mender({u"mend"_s, u"--yes"_s});
+    EXPECT_EQ(mended.status, 0) << mended;
+    EXPECT_EQ(run({u"totals"_s}).status, 0);
+    EXPECT_GT(families(), 0);
+}
+
+TEST_F(MenderProgramTest, WrongUsageIsToldAndNothingIsDone)
+{
+    for (const QStringList& words : {QStringList{},
+                                     {u"heal"_s},
+                                     {u"recover"_s},
+                                     {u"check"_s, u"more"_s},
+                                     {u"--church"_s, u"10"_s, u"check"_s},
+                                     {u"--nonsense"_s, u"check"_s}}) {
+        const auto ended = mender(words);
+        EXPECT_EQ(ended.status, 2) << words.join(u' ').toStdString() << ended;
+        EXPECT_TRUE(ended.err.contains("kindrel-mender --help")) << ended;
+    }
+    EXPECT_EQ(mender({u"--help"_s}).status, 0);
+}
+
+} // namespace kindrel::test
