@@ -1,9 +1,12 @@
 // Search and speed find: the text search to its end against SQLite's C interface reading the same cells, the family
-// list of one group, a key of speed find in processor time, and reading the families into its memory.
+// list of one group, a key of speed find in processor time, and reading the families into its memory. On PostgreSQL the
+// times stand alone.
 
 #include "bare_sqlite.h"
 #include "measure.h"
+#include "quiet_dialogue.h"
 
+#include "core/postgres_session.h"
 #include "core/schema.h"
 #include "core/sqlite_session.h"
 #include "core/system_workstation.h"
@@ -36,17 +39,26 @@ constexpr auto all_text =
     "[res_street2],[res_state],[res_country],[res_map],[post_street],[post_street2],[post_state],[post_country] "
     "FROM [qry_search_all] ORDER BY [sort_key],[Primary_name],[Surname_ID],[position];";
 
-/// Nobody answers.
-class NoDialogue : public core::Dialogue
+/// An office on an empty church of the session, then filled.
+struct Church
 {
-public:
-    void show(const core::Message&) override {}
-    bool confirm(const core::Message&, core::Answer) override { return false; }
-    std::optional<bool> confirm_or_cancel(const core::Message&) override { return {}; }
-    std::optional<QString> ask_text(const core::Message&, bool) override { return {}; }
-    std::optional<int> choose(const core::Message&, const QStringList&) override { return {}; }
-    std::optional<QString> choose_file(const core::FileQuestion&) override { return {}; }
-    void play(const QString&) override {}
+    Church(std::unique_ptr<core::Session> session, const QString& folder, int people)
+        : office{.paths = core::Paths(folder, folder, folder, core::Mode::normal, 1),
+                 .session = std::move(session),
+                 .rights = core::Rights::all(),
+                 .workstation = workstation,
+                 .dialogue = dialogue,
+                 .clock = clock}
+    {
+        core::create_schema(*office.session);
+        sample::fill_church(*office.session,
+                            {.families = people * 10 / 28, .seed = 7, .training = false, .today = today}, {}, {});
+    }
+
+    core::SystemWorkstation workstation;
+    QuietDialogue dialogue;
+    core::SystemClock clock;
+    core::Office office;
 };
 
 std::vector<int> all_families(core::Session& session)
@@ -65,27 +77,32 @@ double processor_milliseconds_of(const Work& work)
     return 1000.0 * double(std::clock() - start) / CLOCKS_PER_SEC;
 }
 
-void bench_text_search(core::Office& office, const BareDatabase& database, int people)
+/// On a server, where there is no bare file to read, the times stand alone.
+void bench_text_search(core::Office& office, const BareDatabase* database, int people)
 {
     const auto families = all_families(*office.session);
-    const auto to_the_end = [&](people::SearchFields fields) {
-        people::TextSearch search(office);
-        while (search.next(u"smi"_s, fields, families)) {
-        }
-    };
     for (const auto& [what, fields, text] :
          {std::tuple("text search, names", people::SearchFields::names, names_text),
           std::tuple("text search, all fields", people::SearchFields::all, all_text)}) {
-        const BareStatement bare(database.get(), text);
+        const auto to_the_end = [&] {
+            people::TextSearch search(office);
+            while (search.next(u"smi"_s, fields, families)) {
+            }
+        };
+        if (!database) {
+            Times times;
+            for (int round = 0; round < 5; ++round)
+                times.add(milliseconds_of(to_the_end));
+            std::printf("| %-34s | %6d | %9.3f |\n", what, people, times.median());
+            continue;
+        }
+        const BareStatement bare(database->get(), text);
         std::vector<std::string> cells;
-        print(what, people,
-              compare([&] { to_the_end(fields); },
-                      [&] {
-                          cells.clear();
-                          bare.read(cells);
-                      },
-                      9),
-              2);
+        const auto read = [&] {
+            cells.clear();
+            bare.read(cells);
+        };
+        print(what, people, compare(to_the_end, read, 9), 2);
     }
 }
 
@@ -117,32 +134,35 @@ void bench_data_search(core::Office& office, int people)
     std::printf("| %-34s | %6d | %9.3f | %s\n", "data search: the slowest part", people, slowest.first, slowest.second);
 }
 
+void bench_postgres(const QString& server, const QString& folder, int people)
+{
+    const auto schema = u"bench_search_%1"_s.arg(people);
+    core::open_postgres(server)->execute(u"CREATE SCHEMA [%1]"_s.arg(schema));
+    Church church(core::open_postgres(u"%1 options=-csearch_path=%2"_s.arg(server, schema)), folder, people);
+    church.office.session->execute(u"ANALYZE"_s);
+    std::printf("PostgreSQL:\n");
+    bench_text_search(church.office, nullptr, people);
+    bench_speed_find(church.office, people);
+    bench_data_search(church.office, people);
+}
+
 } // namespace
 
 int main(int count, char** arguments)
 {
     const QCoreApplication application(count, arguments);
+    const auto server = qEnvironmentVariable("KINDREL_TEST_SERVER");
     std::printf("| %-34s | people |   ours ms |   bare ms | ratio | goal |\n", "work");
     for (const int people : sizes) {
         QTemporaryDir folder;
-        const QString here = folder.path() + u'/';
         const auto file = folder.filePath(u"church.kdl"_s);
-        core::SystemWorkstation workstation;
-        NoDialogue dialogue;
-        core::SystemClock clock;
-        core::Office office{.paths = core::Paths(here, here, here, core::Mode::normal, 1),
-                            .rights = core::Rights::all(),
-                            .workstation = workstation,
-                            .dialogue = dialogue,
-                            .clock = clock};
-        office.session = core::create_sqlite(file);
-        core::create_schema(*office.session);
-        sample::fill_church(*office.session,
-                            {.families = people * 10 / 28, .seed = 7, .training = false, .today = today}, {}, {});
+        Church church(core::create_sqlite(file), folder.path() + u'/', people);
         const BareDatabase bare(file.toStdString());
-        bench_text_search(office, bare, people);
-        bench_speed_find(office, people);
-        bench_data_search(office, people);
+        bench_text_search(church.office, &bare, people);
+        bench_speed_find(church.office, people);
+        bench_data_search(church.office, people);
+        if (!server.isEmpty())
+            bench_postgres(server, folder.path() + u'/', people);
     }
     return 0;
 }
