@@ -1,0 +1,98 @@
+#include "core/files.h"
+#include "desktop/desktop_fixture.h"
+#include "desktop/output/preview_window.h"
+#include "desktop/output/report_drawing.h"
+#include "desktop/output/report_tree.h"
+#include "desktop/shell/page.h"
+#include "support/families.h"
+
+#include <QComboBox>
+
+namespace kindrel::test {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+class CataloguePageTest : public DesktopTest
+{
+protected:
+    void open(const QByteArray& own_layout = {})
+    {
+        begin({family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s})});
+        const auto folder = desk().office.paths.folder(core::Folder::custom);
+        core::make_folder(folder);
+        if (!own_layout.isEmpty())
+            core::write_file(folder + u"who.rpy"_s, own_layout);
+        running->open_area(u"reports"_s);
+        settle();
+    }
+    [[nodiscard]] desktop::ReportTree& tree() { return child<desktop::ReportTree>(window(), u"catalogue"_s); }
+    /// Whether something is drawn once the picture had its moment.
+    [[nodiscard]] bool drawn()
+    {
+        auto& drawing = child<desktop::ReportDrawing>(window(), u"drawing"_s);
+        drawing.draw_now();
+        return !drawing.empty();
+    }
+    [[nodiscard]] QStringList families()
+    {
+        QStringList names;
+        for (int row = 0; row < tree().topLevelItemCount(); ++row)
+            names += tree().topLevelItem(row)->text(0);
+        return names;
+    }
+};
+
+} // namespace
+
+TEST_F(CataloguePageTest, TheFamiliesStandInTheirOrderWithTheChurchsOwnAtTheEnd)
+{
+    open();
+
+    EXPECT_EQ(families(),
+              QStringList({u"Church Directories"_s, u"Check Lists"_s, u"Duty of Care"_s, u"Labels"_s,
+                           u"Family Data Reports"_s, u"All Group Reports"_s, u"Individual Group Reports"_s,
+                           u"Individual Group History"_s, u"Miscellaneous Report"_s, u"Photo Albums"_s,
+                           u"BarCode Reports"_s, u"Names Report"_s, u"Custom Reports"_s, u"Custom Letters"_s}));
+}
+
+TEST_F(CataloguePageTest, BesideTheChosenReportStandsItsFirstPage)
+{
+    open();
+    EXPECT_TRUE(drawn());
+
+    press(window(), Qt::Key_Up); // To the family of reports, which is none itself.
+    EXPECT_FALSE(drawn());
+
+    press(window(), Qt::Key_Down);
+    press(window(), Qt::Key_Down);
+    EXPECT_TRUE(visible_texts(window()).contains(u"Directory 2"_s));
+    EXPECT_TRUE(drawn());
+}
+
+TEST_F(CataloguePageTest, AnOwnLayoutIsFoundOnEnteringAndOpensInAPreviewOnTheChosenPaper)
+{
+    open("report per person\ntitle \"Who\"\neach person\nline [surname]\n");
+    child<QComboBox>(window(), u"paper"_s).setCurrentIndex(1);
+    tree().choose(u"custom report/who.rpy"_s);
+    tree().setFocus();
+    press(window(), Qt::Key_Return);
+    settle();
+
+    const auto previews = desk().windows.all<desktop::PreviewWindow>();
+    ASSERT_EQ(previews.size(), 1u);
+    const auto page = previews.front()->document().page(1);
+    EXPECT_TRUE(pages::texts_of(page, 1).contains(u"Naismith"_s));
+    EXPECT_EQ(page.size.toSize(), QSize(612, 792));
+}
+
+TEST_F(CataloguePageTest, AFaultyLayoutIsToldWhenItIsRunAndNotBefore)
+{
+    open("report per person\ntitle \"Broken\"\neach person\nline [no such field]\n");
+    tree().choose(u"custom report/who.rpy"_s);
+    EXPECT_FALSE(drawn());
+    EXPECT_TRUE(visible_texts(window()).contains(u"Run a custom report made within Kindrel"_s));
+}
+
+} // namespace kindrel::test
