@@ -87,12 +87,17 @@ TEST_F(CataloguePageTest, AnOwnLayoutIsFoundOnEnteringAndOpensInAPreviewOnTheCho
     EXPECT_EQ(page.size.toSize(), QSize(612, 792));
 }
 
-TEST_F(CataloguePageTest, AFaultyLayoutIsToldWhenItIsRunAndNotBefore)
+TEST_F(CataloguePageTest, AFaultyLayoutIsToldWhenItIsRunWithoutAPreviewAndNotBefore)
 {
     open("report per person\ntitle \"Broken\"\neach person\nline [no such field]\n");
     tree().choose(u"custom report/who.rpy"_s);
     EXPECT_FALSE(drawn());
     EXPECT_TRUE(visible_texts(window()).contains(u"Run a custom report made within Kindrel"_s));
+
+    place.dialogue.expect_box(u"The layout \"who.rpy\" cannot be used until this is put right:"_s);
+    tree().setFocus();
+    press(window(), Qt::Key_Return);
+    EXPECT_TRUE(desk().windows.all<desktop::PreviewWindow>().empty());
 }
 
 } // namespace kindrel::test

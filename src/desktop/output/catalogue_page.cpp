@@ -1,7 +1,7 @@
 #include "desktop/output/catalogue_page.h"
 
-#include "desktop/output/preview_window.h"
 #include "desktop/output/report_drawing.h"
+#include "desktop/output/report_run.h"
 #include "desktop/output/report_tree.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
@@ -96,15 +96,8 @@ void CataloguePage::show_chosen()
 
 void CataloguePage::open_chosen()
 {
-    const auto* report = m_tree->chosen_or_told(m_desk.office.dialogue);
-    if (!report)
-        return;
-    open_preview(m_desk, report->leaf,
-                 [run = report->run, &office = m_desk.office, options = options()](core::Progress& progress,
-                                                                                   pages::PageSpool& spool) {
-                     const people::WorkingList list = people::active_families(*office.session);
-                     return run({office, list, options}, progress, spool);
-                 });
+    if (const auto* report = m_tree->chosen_or_told(m_desk.office.dialogue))
+        open_report(m_desk, *report, people::active_families(*m_desk.office.session), options());
 }
 
 void CataloguePage::entered()

@@ -1,7 +1,7 @@
 #include "desktop/people/process_panel.h"
 
-#include "desktop/output/preview_window.h"
 #include "desktop/output/report_drawing.h"
+#include "desktop/output/report_run.h"
 #include "desktop/output/report_tree.h"
 #include "desktop/people/bulk_panel.h"
 #include "desktop/shell/icons.h"
@@ -94,16 +94,8 @@ void ProcessPanel::set_list(const people::WorkingList& list)
 
 void ProcessPanel::open_report()
 {
-    const auto* report = m_tree->chosen_or_told(m_desk.office.dialogue);
-    if (!report)
-        return;
-    const auto& options = sheet().options;
-    const QString title = options.title.isEmpty() ? report->leaf : options.title;
-    open_preview(m_desk, title,
-                 [run = report->run, &office = m_desk.office, list = m_list, options](core::Progress& progress,
-                                                                                      pages::PageSpool& spool) {
-                     return run({office, list, options}, progress, spool);
-                 });
+    if (const auto* report = m_tree->chosen_or_told(m_desk.office.dialogue))
+        desktop::open_report(m_desk, *report, m_list, sheet().options);
 }
 
 } // namespace kindrel::desktop
