@@ -2,6 +2,8 @@
 
 #include "sample/word_list.h"
 
+#include <QHash>
+
 #include <algorithm>
 #include <stdexcept>
 
@@ -75,6 +77,17 @@ SetupItem item_from(const QStringList& columns, bool has_audience)
         .text = columns[0], .audience = audience_of(columns[1]), .share = columns[2].toInt(), .more = columns.mid(3)};
 }
 
+/// The keys of what the list holds already: a new church comes with titles.
+QHash<QString, int> stored_items(core::Session& session, const ListTable& list)
+{
+    auto rows = session.select(u"SELECT [%1],[%2] FROM [%3];"_s.arg(
+        QString::fromLatin1(list.key), QString::fromLatin1(list.text), QString::fromLatin1(list.table)));
+    QHash<QString, int> stored;
+    for (const core::Row& row : rows)
+        stored.insert(row.text(core::Column{1}), row.integer(core::Column{0}));
+    return stored;
+}
+
 std::vector<SetupItem> write_list(core::Session& session, const ListTable& list)
 {
     std::vector<SetupItem> items;
@@ -83,11 +96,18 @@ std::vector<SetupItem> write_list(core::Session& session, const ListTable& list)
     QStringList fields{QString::fromLatin1(list.key), QString::fromLatin1(list.text), u"position"_s};
     if (list.extra)
         fields += QString::fromLatin1(list.extra);
-    int key = session.allocate(list.entity, static_cast<int>(items.size()));
+    const auto stored = stored_items(session, list);
+    const auto is_stored = [&](const SetupItem& item) {
+        return stored.contains(item.text);
+    };
+    const auto fresh = items.size() - static_cast<std::size_t>(std::ranges::count_if(items, is_stored));
+    int key = fresh > 0 ? session.allocate(list.entity, static_cast<int>(fresh)) : 0;
     std::vector<std::vector<core::Value>> rows;
     for (auto& item : items) {
-        item.key = key++;
-        rows.push_back({to_value(item.key), to_value(item.text), to_value(rows.size() + 1)});
+        item.key = is_stored(item) ? stored[item.text] : key++;
+        if (is_stored(item))
+            continue;
+        rows.push_back({to_value(item.key), to_value(item.text), to_value(stored.size() + qsizetype(rows.size()) + 1)});
         if (list.extra)
             rows.back().push_back(list.extra_of(item));
     }

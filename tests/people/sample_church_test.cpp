@@ -1,4 +1,5 @@
 #include "sample/church.h"
+#include "sample/setup_lists.h"
 
 #include "core/files.h"
 #include "core/references.h"
@@ -417,6 +418,10 @@ TEST(MasterDatabase, HoldsTheUsualTitlesAndNoFamily)
     EXPECT_EQ(number_of(*session, u"SELECT COUNT(*) FROM [tbl_surname];"_s), 0);
     EXPECT_GT(session->allocate(core::Entity::title),
               number_of(*session, u"SELECT MAX([title_id]) FROM [tbl_title];"_s));
+
+    sample::write_titles(*session);
+    EXPECT_EQ(number_of(*session, u"SELECT COUNT(*) FROM [tbl_title];"_s),
+              number_of(*session, u"SELECT COUNT(DISTINCT [Title]) FROM [tbl_title];"_s));
 }
 
 } // namespace kindrel::test
