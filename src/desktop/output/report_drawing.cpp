@@ -1,6 +1,6 @@
 #include "desktop/output/report_drawing.h"
 
-#include "desktop/shell/look.h"
+#include "core/files.h"
 
 #include <QPainter>
 #include <QTimer>
@@ -39,10 +39,22 @@ void ReportDrawing::show_report(const output::ReportChoice* report, const people
 void ReportDrawing::draw_now()
 {
     m_pause->stop();
+    if (!isVisible())
+        return;
     m_page.reset();
-    if (m_report && !m_list.members.empty())
-        m_page = output::first_page(*m_report, {m_desk.office, m_list, m_options});
+    try {
+        if (m_report)
+            m_page = output::first_page(*m_report, {m_desk.office, m_list, m_options});
+    } catch (const core::DatabaseError&) {
+    } catch (const core::FileError&) {
+    }
     update();
+}
+
+void ReportDrawing::showEvent(QShowEvent* event)
+{
+    QWidget::showEvent(event);
+    m_pause->start();
 }
 
 void ReportDrawing::paintEvent(QPaintEvent*)

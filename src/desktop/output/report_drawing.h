@@ -19,15 +19,16 @@ class ReportDrawing : public QWidget
 public:
     explicit ReportDrawing(Desk& desk, QWidget* parent = nullptr);
 
-    /// `report` must be run-able for as long as it is drawn; null draws nothing.
+    /// Null draws nothing. A drawing that is out of sight waits until it is seen.
     void show_report(const output::ReportChoice* report, const people::WorkingList& list,
                      const output::RunOptions& options);
-    /// Draws at once what waits.
+    /// Draws at once what waits. A report that cannot be drawn leaves no picture: its run will say why.
     void draw_now();
     [[nodiscard]] bool empty() const { return !m_page; }
 
 protected:
     void paintEvent(QPaintEvent* event) override;
+    void showEvent(QShowEvent* event) override;
 
 private:
     Desk& m_desk;
