@@ -288,7 +288,8 @@ std::vector<Membership> memberships(const std::vector<int>& people, int group)
     return all;
 }
 
-void carry_out(core::Session& session, const BulkChange& change)
+/// `whole_list` is the number of members of the list, those who are gone among them.
+void carry_out(core::Session& session, const BulkChange& change, int whole_list)
 {
     const LinkTable& table = table_of(change.item.kind);
     const LinkRow row = row_of(change.item);
@@ -298,13 +299,13 @@ void carry_out(core::Session& session, const BulkChange& change)
         write_group_history(session, giving ? memberships(change.added, row.item) : std::vector<Membership>{},
                             giving ? std::vector<Membership>{} : memberships(had, row.item), change.day);
     }
-    delete_rows(session, table, row, had, change.count.people());
+    delete_rows(session, table, row, had, whole_list);
     if (change.act == TagAct::take)
         return;
     auto rewritten = change.before;
     std::ranges::for_each(rewritten, [&](auto& each) { each.row = row; });
     insert_rows(session, table, rewritten);
-    add_rows(session, table, row, change.added, change.count.people());
+    add_rows(session, table, row, change.added, whole_list);
 }
 
 bool refuse(const core::Office& office, const QString& text)
@@ -395,7 +396,7 @@ std::optional<BulkChange> tag(core::Office& office, const std::optional<WorkingL
         return std::nullopt;
     core::Transaction transaction(*office.session);
     const auto change = plan(office, *list, item, act);
-    carry_out(*office.session, change);
+    carry_out(*office.session, change, static_cast<int>(list->members.size()));
     transaction.commit();
     if (change.count.people() == 0) {
         office.dialogue.show({u"No people have been found for tagging"_s});

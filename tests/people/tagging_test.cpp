@@ -101,6 +101,17 @@ TEST_P(TaggingTest, EachKindIsGivenAndTakenWithAwayAndClosedFamiliesSkipped)
     }
 }
 
+TEST_P(TaggingTest, WhoHasLeftTheRegisterMeanwhileGetsNoRow)
+{
+    list->members.resize(2);
+    list->members.push_back({99999, open_family});
+
+    const auto given = run({.kind = TagKind::status, .item = 2}, TagAct::give);
+
+    EXPECT_EQ(given.count, (people::TagCount{2, 0, 0, 0}));
+    EXPECT_EQ(count(u"[tbl_status] WHERE [status_id]=2;"_s), 2);
+}
+
 TEST_P(TaggingTest, APotentialMinistryStandsBesideAnActiveOne)
 {
     TagItem item{.kind = TagKind::ministry, .item = 2};
