@@ -91,11 +91,8 @@ QString names_of(const people::DisclosedFamily& family, std::span<const people::
                  QStringView separator)
 {
     QString text;
-    for (const auto* person : people) {
-        if (!text.isEmpty())
-            text += separator;
-        text += family.name(*person);
-    }
+    for (const auto* person : people)
+        text = joined(separator, {text, family.name(*person)});
     return text;
 }
 

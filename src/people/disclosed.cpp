@@ -126,7 +126,12 @@ Disclosure Disclosure::of(const core::Office& office)
 {
     using core::Area;
     const bool pins = office.may(Area::full_financial) || office.may(Area::pin_financial_only);
-    return {office.settings.use_preferred_names, office.may(Area::birth_dates), pins, office.day_order(), {}};
+    return {office.settings.use_preferred_names,
+            office.may(Area::birth_dates),
+            pins,
+            office.may(Area::visitation_tab),
+            office.day_order(),
+            {}};
 }
 
 QString DisclosedFamily::name(const Person& person) const
@@ -142,6 +147,8 @@ DisclosedFamily disclose(FamilyFile file, const Disclosure& disclosure)
     hide(file.address, withheld_of_families, disclosure.withheld);
     if (disclosure.withheld[static_cast<std::size_t>(Detail::phones)])
         std::ranges::for_each(file.other_contacts, [](OtherContact& contact) { contact.phone.clear(); });
+    if (!disclosure.visits)
+        file.visits.clear();
     blank_address(file);
     for (auto& person : file.people)
         blank_person(person, disclosure);

@@ -18,6 +18,7 @@ struct Disclosure
     bool use_preferred_names = false;
     bool birth_dates = true;
     bool pins = true;
+    bool visits = true;
     core::DayOrder day_order = core::DayOrder::day_first;
     Details withheld = {};
 

@@ -160,8 +160,7 @@ private:
     {
         pages::Table table(cell, {{.width = m_widths[0] - 2 * padding}, {.width = 2 * padding}, {}}, inner_style());
         while (!rows.empty()) {
-            const auto next =
-                std::find_if(rows.begin() + 1, rows.end(), [](const auto& row) { return !row.who.isEmpty(); });
+            const auto next = std::find_if(rows.begin() + 1, rows.end(), [](const auto& row) { return row.begins; });
             const auto block = rows.first(static_cast<std::size_t>(next - rows.begin()));
             rows = rows.subspan(block.size());
             table.row({block.front().who, QString(),
@@ -252,7 +251,8 @@ constexpr ReportDefinition definition(const char* key, const FamilyDataLayout& l
 }
 
 constexpr std::array reports{
-    definition("k70", layouts[0], "Birth dates, family by family. People without one are left out"),
+    definition("k70", layouts[0], "Birth dates, family by family. People without one are left out",
+               core::Area::birth_dates),
     definition("k71", layouts[1], "Occupations, family by family. People without one are left out"),
     definition("k72", layouts[2], "Statuses, family by family. People without one are left out"),
     definition("k73", layouts[3], "Groups, family by family. People without one are left out"),

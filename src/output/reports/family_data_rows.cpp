@@ -17,8 +17,10 @@ using Values = std::vector<QStringList>;
 
 void append(DataRows& rows, const QString& who, const Values& values)
 {
-    for (const auto& line : values)
-        rows.push_back({&line == &values.front() ? who : QString(), line});
+    for (const auto& line : values) {
+        const bool begins = &line == &values.front();
+        rows.push_back({begins ? who : QString(), line, begins});
+    }
 }
 
 /// `values_of(family, person)` gives a person's lines.

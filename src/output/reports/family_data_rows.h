@@ -6,12 +6,12 @@
 
 namespace kindrel::output {
 
-/// A line of a family data report: who it is about, blank where that is who the line above is about, and a value for
-/// each column.
+/// A line of a family data report.
 struct DataRow
 {
-    QString who;
-    QStringList values;
+    QString who;        ///< Whom it is about; blank on their further lines.
+    QStringList values; ///< One for each column.
+    bool begins = true; ///< The first line of somebody, whose name may be blank.
 };
 using DataRows = std::vector<DataRow>;
 

@@ -1,5 +1,7 @@
 #include "output/output_fixture.h"
 
+#include <map>
+
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
@@ -124,7 +126,30 @@ TEST_F(FamilyDataTest, BirthDatesNeedTheirRightAndCanBeWithheld)
     expect_none({u"k70"_s});
     options.withheld.reset();
     office.rights.set(core::Area::birth_dates, false);
-    expect_none({u"k70"_s});
+    dialogue.expect_box(u"Your password does not give access to \"Birth Dates Access\""_s);
+    report = *output::find_report(u"k70");
+    pages::PageSpool spool;
+    EXPECT_FALSE(run(spool));
+}
+
+TEST_F(FamilyDataTest, WhatAPersonWithoutANameHasIsNotPutDownToTheOneAbove)
+{
+    auto one = family(u"Abel"_s, {u"Niels"_s, u"Ida"_s});
+    for (auto& person : one.people)
+        person.school_year = person.Name == u"Ida" ? 4 : 3;
+    one.people.back().Name.clear();
+    add({one});
+
+    report = *output::find_report(u"k85");
+    pages::PageSpool spool;
+    ASSERT_TRUE(run(spool));
+    std::map<QString, qreal> heights;
+    for (const auto& item : spool.page(1).items) {
+        if (const auto* text = std::get_if<pages::TextItem>(&item))
+            heights[text->text] = text->at.y();
+    }
+    EXPECT_EQ(heights[u"Niels"_s], heights[u"3"_s]);
+    EXPECT_GT(heights[u"4"_s], heights[u"3"_s] + 12) << "a row of its own";
 }
 
 TEST_F(FamilyDataTest, APreferredNameStandsBesideTheGivenOneEvenWherePeopleAreListedByIt)
