@@ -1,5 +1,9 @@
 #include "people/editor_fixture.h"
 #include "people/tagging.h"
+#include "support/processes.h"
+
+#include <map>
+#include <random>
 
 namespace kindrel::test {
 
@@ -208,6 +212,37 @@ TEST_P(TaggingTest, BookedOutWorkTagsTheFamiliesThatAreHereToBeChanged)
     session().execute(u"UPDATE [tbl_surname] SET [active_in_book]=-1 WHERE [booked_out]=-1;"_s);
     office().mode = core::Mode::booked_out;
     EXPECT_EQ(run({.kind = TagKind::status, .item = 1}, TagAct::give).count, (people::TagCount{1, 0, 3, 0}));
+}
+
+TEST_P(TaggingTest, AKillWhileTaggingLeavesEverybodyOrNobodyTaggedAndTheHistoryWithThem)
+{
+    for (int more = 0; more < 60; ++more) {
+        const auto file = people::save_family(session(), family(u"Holm"_s, {u"Ada"_s, u"Bo"_s}), desk->clock.today());
+        for (const auto& person : file.people)
+            list->members.push_back({person.person_id, file.family.Surname_ID});
+    }
+    const qint64 all = 122;
+    desk.reset();
+    std::mt19937 random(20261123);
+    std::map<qint64, int> found;
+    for (int round = 0; round < 20; ++round) {
+        church->close();
+        run_and_kill(
+            [&](const Ready& ready) {
+                WorkingOffice own(*church);
+                ready();
+                for (;;) {
+                    for (const auto act : {TagAct::give, TagAct::take})
+                        (void)people::tag(own.office, list, {.kind = TagKind::group, .item = 2}, act);
+                }
+            },
+            std::chrono::microseconds(random() % 60000));
+        church->reopen();
+        const auto members = count(u"[tbl_group];"_s);
+        ++found[members];
+        EXPECT_EQ(count(u"[tbl_group_history] WHERE [date_out] IS NULL;"_s), members);
+    }
+    EXPECT_EQ(found[0] + found[all], 20);
 }
 
 } // namespace kindrel::test
