@@ -16,31 +16,6 @@ namespace {
 constexpr std::size_t first_chunk = 200;
 constexpr std::size_t growth = 4;
 constexpr std::size_t largest_chunk = 3200;
-std::vector<int> sorted_people(const people::WorkingList& list)
-{
-    std::vector<int> people;
-    people.reserve(list.members.size());
-    for (const auto& member : list.members)
-        people.push_back(member.person_id);
-    std::ranges::sort(people);
-    return people;
-}
-
-/// `listed` is sorted.
-people::Household listed_household(const people::DisclosedFamily& family, std::span<const int> listed)
-{
-    const auto is_absent = [&](const people::Person* person) {
-        return !person || !std::ranges::binary_search(listed, person->person_id);
-    };
-    auto household = people::household_of(family.people());
-    std::erase_if(household.adults, is_absent);
-    std::erase_if(household.children, is_absent);
-    if (is_absent(household.primary))
-        household.primary = nullptr;
-    if (is_absent(household.spouse))
-        household.spouse = nullptr;
-    return household;
-}
 
 /// Ends the progress however the run ends.
 class ReportRun
@@ -98,6 +73,31 @@ Families read_families(const ReportInput& input, std::span<const int> keys, cons
 }
 
 } // namespace
+
+std::vector<int> sorted_people(const people::WorkingList& list)
+{
+    std::vector<int> people;
+    people.reserve(list.members.size());
+    for (const auto& member : list.members)
+        people.push_back(member.person_id);
+    std::ranges::sort(people);
+    return people;
+}
+
+people::Household listed_household(const people::DisclosedFamily& family, std::span<const int> listed)
+{
+    const auto is_absent = [&](const people::Person* person) {
+        return !person || !std::ranges::binary_search(listed, person->person_id);
+    };
+    auto household = people::household_of(family.people());
+    std::erase_if(household.adults, is_absent);
+    std::erase_if(household.children, is_absent);
+    if (is_absent(household.primary))
+        household.primary = nullptr;
+    if (is_absent(household.spouse))
+        household.spouse = nullptr;
+    return household;
+}
 
 std::vector<const people::Person*> ListedFamily::people() const
 {

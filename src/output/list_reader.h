@@ -20,6 +20,11 @@ struct ListedFamily
     [[nodiscard]] std::vector<const people::Person*> people() const;
 };
 
+/// The numbers of those on the list, in rising order.
+[[nodiscard]] std::vector<int> sorted_people(const people::WorkingList& list);
+/// The household of those of the family who are among the `listed`, which are sorted.
+[[nodiscard]] people::Household listed_household(const people::DisclosedFamily& family, std::span<const int> listed);
+
 /// Reads the working list's families in its order, some hundreds at a time, and hands each to `write`, as far as
 /// `extent` goes. False when cancelled. Throws core::DatabaseError.
 [[nodiscard]] bool for_each_family(const ReportInput& input, core::Progress& progress,

@@ -2,6 +2,7 @@
 
 #include "core/files.h"
 #include "output/custom/custom_reports.h"
+#include "output/custom/custom_run.h"
 #include "output/letters/letter_run.h"
 
 #include <QFileInfo>
@@ -40,15 +41,21 @@ void add_catalogue(std::vector<ReportChoice>& choices)
                            }});
 }
 
-/// Whether a layout can be run; says nothing.
-bool is_sound(const QString& file)
+/// The report's layout when it can be run; says nothing.
+std::optional<CustomLayout> sound_layout(const CustomReport& report)
 {
     try {
-        const auto parsed = load_layout(file);
-        return parsed.faults.empty() && parsed.layout.kind != LayoutKind::receipts;
+        auto parsed = load_layout(report.file);
+        const bool sound = parsed.faults.empty() && parsed.layout.kind != LayoutKind::receipts;
+        return sound ? std::optional(titled(std::move(parsed.layout), report)) : std::nullopt;
     } catch (const core::FileError&) {
-        return false;
+        return std::nullopt;
     }
+}
+
+bool may_print(const core::Office& office)
+{
+    return office.may(core::Area::report_outputs);
 }
 
 void add_custom_reports(std::vector<ReportChoice>& choices, const core::Office& office)
@@ -56,14 +63,17 @@ void add_custom_reports(std::vector<ReportChoice>& choices, const core::Office& 
     for (const auto& report : custom_reports(office)) {
         const auto name = QFileInfo(report.file).fileName();
         choices.push_back({(report.plugin ? u"plugin report/"_s : u"custom report/"_s) + name,
-                           QString::fromLatin1(own_families[0]), report.title,
+                           QString::fromLatin1(own_families[0]),
+                           report.plugin ? report.title + u" (Plugin Reports)"_s : report.title,
                            report.plugin ? u"Run a plugin custom report"_s
                                          : u"Run a custom report made within "_s + core::product.toString(),
                            [report](const ReportInput& input, core::Progress& progress, pages::PageSpool& spool) {
                                return run_custom_report(report, input, progress, spool);
                            },
-                           [file = report.file](const core::Office& run_by) {
-                               return run_by.may(core::Area::report_outputs) && is_sound(file);
+                           [report](const core::Office& run_by) { return may_print(run_by) && sound_layout(report); },
+                           [report](const ReportInput& input, core::Progress& progress, pages::PageSpool& spool) {
+                               const auto sound = may_print(input.office) ? sound_layout(report) : std::nullopt;
+                               return sound && write_custom_report(*sound, input, progress, spool);
                            }});
     }
 }
@@ -82,7 +92,6 @@ std::optional<LetterForm> sound_letter(const QString& file)
 
 void add_custom_letters(std::vector<ReportChoice>& choices, const core::Office& office)
 {
-    constexpr auto address = LetterAddress::mailing;
     for (const auto& letter : custom_letters(office)) {
         const auto& file = letter.file;
         choices.push_back(
@@ -91,15 +100,14 @@ void add_custom_letters(std::vector<ReportChoice>& choices, const core::Office& 
              letter.plugin ? u"Run a plugin custom letter"_s
                            : u"Run a report using a custom letter made within "_s + core::product.toString(),
              [file](const ReportInput& input, core::Progress& progress, pages::PageSpool& spool) {
-                 return run_letter(file, input, address, progress, spool);
+                 return run_letter(file, input, progress, spool);
              },
-             [file](const core::Office& run_by) {
-                 return run_by.may(core::Area::report_outputs) && sound_letter(file);
-             },
+             [file](const core::Office& run_by) { return may_print(run_by) && sound_letter(file); },
              [file](const ReportInput& input, core::Progress& progress, pages::PageSpool& spool) {
-                 const auto sound = sound_letter(file);
-                 return sound && write_letter(*sound, input, address, progress, spool);
-             }});
+                 const auto sound = may_print(input.office) ? sound_letter(file) : std::nullopt;
+                 return sound && write_letter(*sound, input, progress, spool);
+             },
+             letters_printed()});
     }
 }
 
@@ -117,7 +125,8 @@ std::vector<ReportChoice> report_choices(const core::Office& office)
 std::optional<pages::Page> first_page(const ReportChoice& report, const ReportInput& input)
 {
     people::WorkingList sample{input.list.members, input.list.criteria};
-    if (sample.members.empty() || !report.ready || !report.ready(input.office))
+    // What draws itself looks itself whether it can.
+    if (sample.members.empty() || (!report.draw && !(report.ready && report.ready(input.office))))
         return std::nullopt;
     sample.members.resize(std::min(sample.members.size(), sample_size));
     pages::PageSpool spool;

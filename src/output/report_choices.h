@@ -17,10 +17,12 @@ struct ReportChoice
     QString family, leaf, description;
     /// As run_report().
     std::function<bool(const ReportInput&, core::Progress&, pages::PageSpool&)> run;
-    /// Whether nothing stands in the way of a run: it would say nothing. Looked at before a picture is drawn.
+    /// Whether nothing stands in the way of a run: it would say nothing.
     std::function<bool(const core::Office&)> ready;
-    /// The pages alone, without the locks of a run; where it is empty, a run has none.
+    /// The pages alone, without the locks and the boxes of a run: false where something stands in its way. Empty where
+    /// a run that is ready has neither.
     std::function<bool(const ReportInput&, core::Progress&, pages::PageSpool&)> draw = {};
+    QString printed = {}; ///< Said when it has been printed; empty: nothing of its own.
 };
 
 /// The families of what the church brings itself. They stand in the tree even while they are empty.

@@ -23,6 +23,10 @@ struct HeadParts
     friend bool operator==(const HeadParts&, const HeadParts&) = default;
 };
 
+/// Which address a run puts into its letters. `mailing` is the postal one, or the residential one where a family has
+/// no postal one.
+enum class LetterAddress { residential, postal, mailing };
+
 /// How one run of a report differs from what the report and the church have set.
 struct RunOptions
 {
@@ -31,6 +35,7 @@ struct RunOptions
     QString title = {};                 ///< Empty: the report's own.
     std::optional<HeadParts> head = {}; ///< Unset: as the church has it.
     people::Details withheld = {};      ///< Left out beyond what is hidden anyway.
+    LetterAddress address = LetterAddress::mailing;
 
     friend bool operator==(const RunOptions&, const RunOptions&) = default;
 };

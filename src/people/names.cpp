@@ -100,6 +100,23 @@ Household household_of(std::span<const Person> people)
     return household;
 }
 
+Household living_household(std::span<const Person> people)
+{
+    auto household = household_of(people);
+    const auto gone = [](const Person* person) {
+        return person->Decease;
+    };
+    std::erase_if(household.adults, gone);
+    std::erase_if(household.children, gone);
+    if (household.spouse && gone(household.spouse))
+        household.spouse = nullptr;
+    if (household.primary && gone(household.primary)) {
+        household.primary = household.adults.empty() ? nullptr : household.adults.front();
+        household.spouse = nullptr;
+    }
+    return household;
+}
+
 int next_school_year(int year)
 {
     return year == -1 ? 1 : year + 1;

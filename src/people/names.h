@@ -26,6 +26,8 @@ struct Household
 
 /// The pointers live as long as `people`.
 [[nodiscard]] Household household_of(std::span<const Person> people);
+/// The household of the living, to whom post goes. Where the primary adult has died, the next adult stands there alone.
+[[nodiscard]] Household living_household(std::span<const Person> people);
 [[nodiscard]] bool is_child(const Person& person);
 
 /// The year after `year`: zero is skipped, so -1 is followed by 1.

@@ -182,6 +182,7 @@ TEST_F(PreviewTest, TheWholeDocumentGoesToThePrinter)
     press(preview, Qt::Key_P, Qt::ControlModifier);
     EXPECT_EQ(printing.titles, QStringList({u"Directory 1"_s}));
     EXPECT_EQ(printing.pages, 3);
+    EXPECT_EQ(preview.note().text(), u"Sent to the printer."_s);
 }
 
 TEST_F(PreviewTest, TheDocumentIsSavedAsPdfOrTheReasonIsTold)

@@ -1,5 +1,7 @@
+#include "core/files.h"
 #include "desktop/desktop_fixture.h"
 #include "desktop/output/preview_window.h"
+#include "desktop/output/report_tree.h"
 #include "desktop/shell/note_bar.h"
 #include "desktop/shell/page.h"
 #include "pages/find.h"
@@ -293,6 +295,34 @@ TEST_F(TaggingPageTest, DetailsThatAreTickedAreLeftOutOfTheReport)
     press(window(), Qt::Key_Return);
     EXPECT_TRUE(preview_holds(u"Naismith"_s));
     EXPECT_FALSE(preview_holds(u"3 Mill Lane"_s));
+}
+
+TEST_F(TaggingPageTest, LettersGoToTheAddressThatTheFormatStepChoseAndTellWhenTheyArePrinted)
+{
+    place.in_database(u"UPDATE [tbl_address] SET [post_street]='PO Box 7';"_s);
+    core::make_folder(desk().office.paths.folder(core::Folder::letter));
+    core::write_file(desk().office.paths.folder(core::Folder::letter) + u"Welcome.ltr"_s,
+                     "{\\rtf1 [____Street_Address____]}");
+    push(u"format"_s);
+    choose(u"letter_address"_s, 1);
+    push(u"process"_s);
+    auto& tree = child<desktop::ReportTree>(bench(), u"catalogue"_s);
+    tree.reload();
+    tree.choose(u"letter/Welcome.ltr"_s);
+    press(window(), Qt::Key_Return);
+    ASSERT_EQ(desk().windows.all<desktop::PreviewWindow>().size(), 1);
+    EXPECT_TRUE(preview_holds(u"3 Mill Lane"_s));
+    EXPECT_FALSE(preview_holds(u"PO Box 7"_s));
+
+    auto& preview = *desk().windows.all<desktop::PreviewWindow>().back();
+    press(preview, Qt::Key_P, Qt::ControlModifier);
+    EXPECT_EQ(printing.pages, 3);
+    EXPECT_EQ(preview.note().text(), u"Letter Printing is now completed"_s);
+
+    begin_again();
+    running->open_area(u"tagging"_s);
+    settle();
+    EXPECT_EQ(child<QComboBox>(bench(), u"letter_address"_s).currentText(), u"Residential"_s);
 }
 
 TEST_F(TaggingPageTest, EveryStepFitsTheSmallestWindow)

@@ -56,6 +56,19 @@ TEST_F(ReportChoicesTest, TheChurchsOwnLayoutsAndLettersFollowTheCatalogueUnderT
     EXPECT_EQ(own[2].description, u"Run a plugin custom letter"_s);
 }
 
+TEST_F(ReportChoicesTest, APlugInIsMarkedAsOneInTheTreeAndNotOnItsPages)
+{
+    lay(core::Folder::plugin_reports, u"who.rpy"_s, "report per person\neach person\nline [report_title]\n");
+    office.plugins.reports = {{u"who.rpy"_s, u"Who is who"_s}};
+
+    const auto page = first_page(u"Who is who (Plugin Reports)"_s);
+
+    ASSERT_TRUE(page);
+    const auto texts = pages::texts_of(*page, 1);
+    EXPECT_TRUE(texts.contains(u"Who is who"_s)) << texts.join(u'|').toStdString();
+    EXPECT_FALSE(texts.join(u'|').contains(u"Plugin"_s)) << texts.join(u'|').toStdString();
+}
+
 TEST_F(ReportChoicesTest, EveryReportAndOwnLayoutHasAPictureOfItsFirstPage)
 {
     lay(core::Folder::custom, u"who.rpy"_s, sound_layout);
@@ -73,6 +86,12 @@ TEST_F(ReportChoicesTest, WhatWouldBeRefusedHasNoPictureAndShowsNoBox)
 {
     lay(core::Folder::custom, u"broken.rpy"_s, faulty_layout);
     EXPECT_FALSE(first_page(u"Broken"_s));
+    lay(core::Folder::custom, u"who.rpy"_s, sound_layout);
+    const auto who = choice(u"Who"_s);
+    EXPECT_TRUE(output::first_page(who, {office, list, options}));
+    lay(core::Folder::custom, u"who.rpy"_s, faulty_layout); // It broke while the tree was open.
+    EXPECT_FALSE(output::first_page(who, {office, list, options}));
+    lay(core::Folder::custom, u"who.rpy"_s, sound_layout);
 
     office.rights.set(core::Area::visitation_tab, false);
     EXPECT_FALSE(first_page(u"Visitation Report"_s));
@@ -80,6 +99,7 @@ TEST_F(ReportChoicesTest, WhatWouldBeRefusedHasNoPictureAndShowsNoBox)
 
     office.rights.set(core::Area::report_outputs, false);
     EXPECT_FALSE(first_page(u"Directory 1"_s));
+    EXPECT_FALSE(first_page(u"Who"_s));
     list.members.clear();
     office.rights = core::Rights::all();
     EXPECT_FALSE(first_page(u"Directory 1"_s));

@@ -38,9 +38,10 @@ void keep(Remembered& remembered, Zoom zoom)
 
 } // namespace
 
-PreviewWindow::PreviewWindow(Desk& desk, const QString& title)
+PreviewWindow::PreviewWindow(Desk& desk, const QString& title, const QString& printed)
     : m_desk(desk), m_bar(new PreviewBar), m_note(new NoteBar), m_thumbnails(new Thumbnails(m_spool)),
-      m_view(new PageView(m_spool)), m_strip(new RunStrip(desk.office.dialogue))
+      m_view(new PageView(m_spool)), m_strip(new RunStrip(desk.office.dialogue)),
+      m_printed(printed.isEmpty() ? u"Sent to the printer."_s : printed)
 {
     setObjectName(u"preview"_s);
     setWindowTitle(title);
@@ -167,7 +168,7 @@ void PreviewWindow::find(const QString& text, bool backwards)
 void PreviewWindow::print()
 {
     if (!m_running && m_desk.printing.print({m_spool, windowTitle(), m_view->number()}, *this))
-        m_note->say(u"Sent to the printer."_s);
+        m_note->say(m_printed);
 }
 
 void PreviewWindow::save_pdf()
@@ -198,9 +199,9 @@ void PreviewWindow::closeEvent(QCloseEvent* event)
     event->ignore();
 }
 
-void open_preview(Desk& desk, const QString& title, const Producer& produce)
+void open_preview(Desk& desk, const QString& title, const Producer& produce, const QString& printed)
 {
-    auto* window = new PreviewWindow(desk, title);
+    auto* window = new PreviewWindow(desk, title, printed);
     desk.windows.open(window, first_size);
     QMetaObject::invokeMethod(
         window, [window, produce] { window->run(produce); }, Qt::QueuedConnection);

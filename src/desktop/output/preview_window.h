@@ -24,7 +24,8 @@ class PreviewWindow : public QWidget
     Q_OBJECT
 
 public:
-    PreviewWindow(Desk& desk, const QString& title);
+    /// `printed` is said when the document has been printed.
+    PreviewWindow(Desk& desk, const QString& title, const QString& printed);
 
     /// Fills the window; one without a document closes itself.
     void run(const Producer& produce);
@@ -53,11 +54,12 @@ private:
     Thumbnails* m_thumbnails;
     PageView* m_view;
     RunStrip* m_strip;
-    QString m_sought;
+    QString m_printed, m_sought;
     bool m_running = false;
 };
 
-/// Opens a preview and fills it once the caller has returned.
-void open_preview(Desk& desk, const QString& title, const Producer& produce);
+/// Opens a preview and fills it once the caller has returned. `printed` is said when the document has been printed;
+/// where it is empty, that it went to the printer.
+void open_preview(Desk& desk, const QString& title, const Producer& produce, const QString& printed = {});
 
 } // namespace kindrel::desktop

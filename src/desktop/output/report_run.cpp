@@ -25,7 +25,8 @@ void open_report(Desk& desk, const output::ReportChoice& report, const people::W
         desk, options.title.isEmpty() ? report.leaf : options.title,
         [run = report.run, &office = desk.office, list, options](core::Progress& progress, pages::PageSpool& spool) {
             return run({office, list, options}, progress, spool);
-        });
+        },
+        report.printed);
 }
 
 } // namespace kindrel::desktop

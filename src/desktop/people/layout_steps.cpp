@@ -21,6 +21,7 @@ namespace {
 constexpr int longest_title = 80;
 const QString paper_key = u"tagging/paper"_s;
 const QString text_key = u"tagging/text_percent"_s;
+const QString address_key = u"tagging/letter_address"_s;
 
 struct PartRow
 {
@@ -59,6 +60,18 @@ struct TextRow
 
 constexpr std::array text_rows{TextRow{85, "Small"}, TextRow{100, "As the report has it"}, TextRow{120, "Large"},
                                TextRow{140, "Very large"}};
+
+struct AddressRow
+{
+    output::LetterAddress address;
+    const char* text;
+};
+
+constexpr std::array address_rows{
+    AddressRow{output::LetterAddress::mailing, "Postal, or residential where there is no other"},
+    AddressRow{output::LetterAddress::residential, "Residential"},
+    AddressRow{output::LetterAddress::postal, "Postal"},
+};
 
 } // namespace
 
@@ -129,7 +142,8 @@ void TitlePanel::take()
 }
 
 FormatPanel::FormatPanel(Desk& desk, TaggingSheet& sheet)
-    : StepPanel(sheet, u"Format"_s), m_desk(desk), m_paper(new QComboBox), m_text(new QComboBox)
+    : StepPanel(sheet, u"Format"_s), m_desk(desk), m_paper(new QComboBox), m_text(new QComboBox),
+      m_address(new QComboBox)
 {
     m_paper->setObjectName(u"paper"_s);
     m_paper->addItems({u"A4"_s, u"Letter"_s});
@@ -138,6 +152,11 @@ FormatPanel::FormatPanel(Desk& desk, TaggingSheet& sheet)
     for (const auto& row : text_rows)
         m_text->addItem(QString::fromLatin1(row.text), row.percent);
     m_text->setCurrentIndex(std::max(0, m_text->findData(desk.remembered.value(text_key, 100).toInt())));
+    m_address->setObjectName(u"letter_address"_s);
+    for (const auto& row : address_rows)
+        m_address->addItem(QString::fromLatin1(row.text), int(row.address));
+    m_address->setCurrentIndex(std::max(
+        0, m_address->findData(desk.remembered.value(address_key, int(output::LetterAddress::mailing)).toInt())));
     auto* column = make_step_column(*this, u"Format"_s);
     auto* rows = new QGridLayout;
     rows->setSpacing(space::field);
@@ -145,9 +164,10 @@ FormatPanel::FormatPanel(Desk& desk, TaggingSheet& sheet)
     column->addLayout(rows);
     add_step_row(*rows, u"P&aper"_s, m_paper);
     add_step_row(*rows, u"Te&xt"_s, m_text);
+    add_step_row(*rows, u"A&ddress in letters"_s, m_address);
     column->addStretch(1);
     take();
-    for (QComboBox* choice : {m_paper, m_text})
+    for (QComboBox* choice : {m_paper, m_text, m_address})
         connect(choice, &QComboBox::currentIndexChanged, this, &FormatPanel::take);
 }
 
@@ -158,7 +178,9 @@ void FormatPanel::focus_first()
 
 bool FormatPanel::is_set() const
 {
-    return sheet().options.paper != pages::Paper::a4 || sheet().options.text_percent != 100;
+    const auto& options = sheet().options;
+    return options.paper != pages::Paper::a4 || options.text_percent != 100 ||
+           options.address != output::LetterAddress::mailing;
 }
 
 void FormatPanel::take()
@@ -166,8 +188,10 @@ void FormatPanel::take()
     auto& options = sheet().options;
     options.paper = pages::Paper(m_paper->currentIndex());
     options.text_percent = m_text->currentData().toInt();
+    options.address = output::LetterAddress(m_address->currentData().toInt());
     m_desk.remembered.keep(paper_key, m_paper->currentIndex());
     m_desk.remembered.keep(text_key, options.text_percent);
+    m_desk.remembered.keep(address_key, int(options.address));
     Q_EMIT changed();
 }
 

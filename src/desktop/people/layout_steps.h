@@ -41,7 +41,7 @@ private:
     std::vector<QCheckBox*> m_parts;
 };
 
-/// Paper and text size.
+/// Paper, text size and the address that letters go to.
 class FormatPanel : public StepPanel
 {
     Q_OBJECT
@@ -55,7 +55,7 @@ private:
     void take();
 
     Desk& m_desk;
-    QComboBox *m_paper, *m_text;
+    QComboBox *m_paper, *m_text, *m_address;
 };
 
 } // namespace kindrel::desktop

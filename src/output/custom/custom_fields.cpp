@@ -1,6 +1,7 @@
 #include "output/custom/custom_fields.h"
 
 #include "output/custom/custom_values.h"
+#include "output/letters/letter_fields.h"
 
 #include <QHash>
 
@@ -52,9 +53,9 @@ constexpr CustomField listed(CustomField field, std::optional<SetupKind> list = 
     return field;
 }
 
-constexpr CustomField numeric(CustomField field)
+constexpr CustomField with_and(CustomField field)
 {
-    field.numeric = true;
+    field.with_and = true;
     return field;
 }
 
@@ -81,13 +82,13 @@ const std::array fields{
     of_family("Spouse_Name", "First name of the spouse", custom::spouse_name),
     of_family("Primary_&_Spouse_Name", "Both first names: \"Ann & Ben\"", custom::both_names),
     of_family("Primary_&_Spouse_Name_&_Surname", "\"Ann & Ben Naismith\"", custom::both_names_and_surname),
-    of_family("Titles_&_Primary_&_Spouse_Name_&_Surname", "\"Mrs Ann & Mr Ben Naismith\"", custom::titled_names,
+    of_family("Titles_&_Primary_&_Spouse_Name_&_Surname", "\"Mrs & Mr Ann & Ben Naismith\"", custom::titled_names,
               Part::details),
-    of_family("Titles_&_Primary_&_Spouse_initial_&_Surname", "\"Mrs A & Mr B Naismith\"", custom::titled_initials,
+    of_family("Titles_&_Primary_&_Spouse_initial_&_Surname", "\"Mrs & Mr A & B Naismith\"", custom::titled_initials,
               Part::details),
     of_family("Primary_Title", "Title of the primary person", custom::primary_title, Part::details),
     of_family("Spouse_Title", "Title of the spouse", custom::spouse_title, Part::details),
-    of_family("Children_Names", "First names of the children", custom::children),
+    with_and(of_family("Children_Names", "First names of the children", custom::children)),
     of_family("adults", "First names of all adults", custom::adults),
     of_family("names", "First names of everybody", custom::everybody),
     of_family("&_Family", "\"& Family\" where there are children", custom::and_family),
@@ -134,7 +135,7 @@ const std::array fields{
     of_person("full_name", "Title, name and surname", custom::full_name, Part::details),
     of_person("person_id", "The person's number in the register", custom::person_id),
     of_person("role", "Primary, Spouse, Adult or Child", custom::role),
-    numeric(of_person("position", "Place in the family", custom::position)),
+    of_person("position", "Place in the family", custom::position),
     of_person("preferred_name", "Preferred name", &Person::preferred_name),
     of_person("Active", "\"Yes\" for an active person", &Person::Active),
     of_person("Decease", "\"Yes\" for a deceased person", &Person::Decease),
@@ -144,8 +145,8 @@ const std::array fields{
     of_person("contact", "\"Yes\" for a contact", &Person::contact),
     of_details("Title", "Title", &Person::Title),
     of_details("birthdate", "Birth date", custom::birthdate),
-    numeric(of_details("age", "Age in years", custom::age)),
-    numeric(of_details("school_year", "School year", custom::school_year)),
+    of_details("age", "Age in years", custom::age),
+    of_details("school_year", "School year", custom::school_year),
     of_details("middle_name", "Middle name", &Person::middle_name),
     of_details("other_surname", "Other surname", &Person::other_surname),
     of_details("mobile_phone", "Mobile phone", &Person::mobile_phone),
@@ -304,7 +305,9 @@ QString text_of(const LayoutField& field, const FieldSource& source)
     QStringList texts;
     for (const auto& value : values_of(*known, field.item, source))
         texts += value.text;
-    return texts.join(field.joint);
+    if (field.joint)
+        return texts.join(*field.joint);
+    return known->with_and ? listed_with_and(texts) : texts.join(u", "_s);
 }
 
 } // namespace kindrel::output

@@ -44,9 +44,10 @@ struct FieldSource
 struct FieldValue
 {
     QString text;
-    QString item = {}; ///< Of a list's value: what it stands under.
-    QString bare = {}; ///< What stands there, without the item.
-    int place = 0;     ///< Orders groups by value: the item's key, or a number.
+    QString item = {};                  ///< Of a list's value: what it stands under.
+    QString bare = {};                  ///< What stands there, without the item.
+    int place = 0;                      ///< Orders groups by value: the item's key, or a number.
+    std::optional<core::Date> day = {}; ///< Orders groups of one place.
 };
 using FieldValues = std::vector<FieldValue>;
 
@@ -67,7 +68,7 @@ struct CustomField
     Reader read;
     bool items = false;                         ///< Whether one item of the list can be asked for.
     std::optional<people::SetupKind> list = {}; ///< Orders the groups by this list.
-    bool numeric = false;                       ///< Orders the groups by number.
+    bool with_and = false;                      ///< Several values are joined as "Cid, Dot & Eve".
 };
 
 [[nodiscard]] std::span<const CustomField> custom_fields();

@@ -16,12 +16,14 @@ namespace {
 struct GroupPlace
 {
     int rank = 0;
+    std::optional<core::Date> day;
     QString sort_key;
     QString heading;
 
     friend auto operator<=>(const GroupPlace& one, const GroupPlace& other)
     {
-        return std::tie(one.rank, one.sort_key, one.heading) <=> std::tie(other.rank, other.sort_key, other.heading);
+        return std::tie(one.rank, one.day, one.sort_key, one.heading) <=>
+               std::tie(other.rank, other.day, other.sort_key, other.heading);
     }
     friend bool operator==(const GroupPlace&, const GroupPlace&) = default;
 };
@@ -54,11 +56,11 @@ public:
     {
         std::vector<GroupPlace> groups;
         for (const auto& value : values_of(m_field, m_grouping.field.item, source))
-            groups.push_back({rank_of(value), people::sort_key(value.text), value.text});
+            groups.push_back({rank_of(value), value.day, people::sort_key(value.text), value.text});
         std::ranges::sort(groups);
         groups.erase(std::ranges::unique(groups).begin(), groups.end());
         if (groups.empty() && !m_grouping.leave_out_others)
-            groups.push_back({std::numeric_limits<int>::max(), {}, u"Others"_s});
+            groups.push_back({std::numeric_limits<int>::max(), {}, {}, u"Others"_s});
         return groups;
     }
 
@@ -110,8 +112,9 @@ std::optional<GroupedKeys<people::Member>> groups_of_people(const CustomLayout& 
 {
     const Grouping grouping(*layout.grouping, *input.office.session);
     std::vector<Entry<people::Member>> entries;
+    const auto on_list = sorted_people(input.list);
     const auto note = [&](const ListedMember& listed) {
-        const auto household = people::household_of(listed.family.people());
+        const auto household = listed_household(listed.family, on_list);
         const people::Member member{listed.person.person_id, listed.family.family().Surname_ID};
         for (auto& group : grouping.groups_of({facts, &listed.family, &household, &listed.person}))
             entries.push_back({std::move(group), member});

@@ -38,7 +38,8 @@ struct LayoutField
 {
     QString name;
     QString item = {}; ///< Of a list kind: only what stands under this item; empty for all.
-    QString joint = QStringLiteral(", ");
+    std::optional<QString> joint =
+        {}; ///< Between several values; unset: as the field's values are listed in a sentence.
 
     friend bool operator==(const LayoutField&, const LayoutField&) = default;
 };

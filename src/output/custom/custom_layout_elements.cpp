@@ -1,6 +1,8 @@
 #include "output/custom/custom_layout_parser.h"
+#include "output/reports/barcode_place.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace kindrel::output {
 
@@ -14,9 +16,17 @@ using Kind = LayoutElement::Kind;
 constexpr LayoutRange thickness_range{0.1, 10};
 constexpr LayoutRange space_range{0.5, 500};
 constexpr LayoutRange picture_range{8, 400};
-constexpr LayoutRange barcode_widths{40, 400};
 constexpr LayoutRange barcode_heights{8, 200};
 constexpr double usual_thickness = 0.5;
+
+/// Wide enough for scanners whoever it is.
+LayoutRange barcode_widths()
+{
+    constexpr qreal least_module = 0.7;
+    constexpr int longest_id = 9999999;
+    constexpr double most = 400;
+    return {std::ceil(barcode_width(barcode_content(longest_id), least_module)), most};
+}
 
 /// Reads what one section's line holds.
 class ElementReader
@@ -84,7 +94,10 @@ public:
     {
         if (!is_entry())
             m_statement.fault(u"a barcode is a person's and cannot stand in \"%1\""_s.arg(words_of(m_place)));
-        read_size(element, u"barcode", barcode_widths, barcode_heights);
+        read_size(element, u"barcode", barcode_widths(), barcode_heights);
+        if (const auto room = column_room(m_layout).width(); element.width > room)
+            m_statement.fault(
+                u"the barcode is wider than the columns, which have room for %1 points"_s.arg(std::floor(room)));
     }
 
 private:

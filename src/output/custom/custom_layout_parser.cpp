@@ -2,6 +2,7 @@
 
 #include "core/files.h"
 #include "output/custom/custom_fields.h"
+#include "output/custom/custom_pages.h"
 
 #include <QFileInfo>
 #include <QStringDecoder>
@@ -137,26 +138,53 @@ void read_line(int number, QStringView line, LayoutText& text)
         read_statement(statement, text);
 }
 
-double height_of(const CustomLayout& layout, const LayoutElement& element)
+double height_of(const LayoutElement& element, const CustomLooks& looks)
 {
     constexpr double line_height = 1.2;
     if (element.kind != LayoutElement::Kind::line)
         return element.height;
-    double size = layout.text_size;
+    double size = looks.type().body.size;
     for (const auto& part : element.parts) {
-        const auto style = std::ranges::find(layout.styles, part.text, &LayoutStyle::name);
-        if (part.kind == LayoutPart::Kind::style && style != layout.styles.end())
-            size = std::max(size, style->size.value_or(size));
+        if (part.kind == LayoutPart::Kind::style)
+            size = std::max(size, looks.style(part.text).size);
     }
     return size * line_height;
 }
 
-/// What only the whole shows.
-void check_whole(ParsedLayout& parsed)
+/// What headers and footers leave of the pages.
+void check_room(LayoutText& text)
 {
-    const auto& layout = parsed.layout;
-    const auto tell = [&](const QString& text) {
-        parsed.faults.push_back({0, text});
+    auto& [layout, faults] = text.parsed;
+    const CustomLooks looks(layout, 100);
+    const auto room = column_room(layout);
+    double bands = 0;
+    int line = 0;
+    for (const auto place : {LayoutPlace::page_header, LayoutPlace::page_footer}) {
+        const auto said = std::ranges::find(text.said, words_of(place), &std::pair<QString, int>::first);
+        if (said == text.said.end())
+            continue;
+        double height = 0;
+        for (const auto& element : layout.section(place))
+            height += height_of(element, looks);
+        if (height > most_band_height)
+            faults.push_back(
+                {said->second, u"the section \"%1\" is too high: it leaves no room on the pages"_s.arg(said->first)});
+        line = std::max(line, said->second);
+        bands += std::min(height, most_band_height);
+    }
+    if (room.width() < least_column || room.height() < least_height)
+        faults.push_back({0, u"The margins and columns leave no room to print in"_s});
+    else if (room.height() - bands < least_height)
+        faults.push_back({line, u"page header and page footer leave no room between them on the pages"_s});
+}
+
+/// What only the whole shows.
+void check_whole(LayoutText& text)
+{
+    const auto& layout = text.parsed.layout;
+    auto& faults = text.parsed.faults;
+    const auto tell = [&](const QString& fault) {
+        faults.push_back({0, fault});
     };
     std::size_t elements = 0;
     for (const auto& section : layout.sections)
@@ -167,22 +195,12 @@ void check_whole(ParsedLayout& parsed)
     const auto prints = [&](LayoutPlace place) {
         return !layout.section(place).empty();
     };
-    if (parsed.faults.empty() && !prints(LayoutPlace::family) && !prints(LayoutPlace::person) &&
-        !prints(LayoutPlace::giver))
+    if (faults.empty() && !prints(LayoutPlace::family) && !prints(LayoutPlace::person) && !prints(LayoutPlace::giver))
         tell(u"The layout prints nobody: it needs a section \"%1\" with lines in it"_s.arg(
             words_of(layout.kind == LayoutKind::families ? LayoutPlace::family
                      : layout.kind == LayoutKind::people ? LayoutPlace::person
                                                          : LayoutPlace::giver)));
-    for (const auto place : {LayoutPlace::page_header, LayoutPlace::page_footer}) {
-        double height = 0;
-        for (const auto& element : layout.section(place))
-            height += height_of(layout, element);
-        if (height > most_band_height)
-            tell(u"The section \"%1\" is too high: it leaves no room on the pages"_s.arg(words_of(place)));
-    }
-    const auto room = layout.page.size().height() - layout.page.margins.top() - layout.page.margins.bottom();
-    if (layout.page.column_width() < least_column || room < least_height)
-        tell(u"The margins and columns leave no room to print in"_s);
+    check_room(text);
 }
 
 ParsedLayout refused(LayoutKind kind, const QString& text)
@@ -200,6 +218,18 @@ QString words_of(LayoutKind kind)
 QString words_of(LayoutPlace place)
 {
     return word_of(layout_place_words(), place);
+}
+
+QSizeF column_room(const CustomLayout& layout)
+{
+    auto page = layout.page;
+    QSizeF room = page.size();
+    for (const auto paper : {pages::Paper::a4, pages::Paper::letter}) {
+        page.paper = paper;
+        const auto height = page.size().height() - page.margins.top() - page.margins.bottom();
+        room = room.boundedTo({page.column_width(), height});
+    }
+    return room;
 }
 
 void note_once(LayoutStatement& statement, LayoutText& text, const QString& what)
@@ -244,7 +274,7 @@ ParsedLayout parse_layout(const QString& text, LayoutKind kind)
     int number = 0;
     for (const auto line : QStringView(plain).split(u'\n'))
         read_line(++number, line, state);
-    check_whole(state.parsed);
+    check_whole(state);
     std::ranges::stable_sort(state.parsed.faults, {}, [](const auto& fault) {
         return fault.line == 0 ? std::numeric_limits<int>::max() : fault.line;
     });

@@ -22,6 +22,8 @@ struct LayoutText
 
 /// Puts the field's name into its own spelling; tells what is wrong with it where it stands in `place`.
 void check_field(LayoutStatement& statement, LayoutField& field, LayoutPlace place);
+/// A column between the margins, without headers and footers, on the smaller of the papers.
+[[nodiscard]] QSizeF column_room(const CustomLayout& layout);
 /// "report per person", "receipt" …: what the whole layout is, for messages.
 [[nodiscard]] QString words_of(LayoutKind kind);
 [[nodiscard]] QString words_of(LayoutPlace place);

@@ -47,8 +47,8 @@ QString text_of(const LayoutField& field)
     words.when(!field.item.isEmpty(), quoted(field.item));
     if (field.joint == u"\n")
         words << u"lines"_s;
-    else if (field.joint != LayoutField().joint)
-        words << u"joined"_s << quoted(field.joint);
+    else if (field.joint)
+        words << u"joined"_s << quoted(*field.joint);
     return u'[' + words.text() + u']';
 }
 

@@ -1,6 +1,7 @@
 #include "output/custom/custom_pages.h"
 
 #include "output/custom/custom_layout_words.h"
+#include "output/reports/barcode_place.h"
 #include "people/person_files.h"
 
 #include <algorithm>
@@ -352,8 +353,7 @@ void CustomPages::write_portrait(pages::Writer& place, const LayoutElement& elem
 
 void CustomPages::write_barcode(pages::Writer& place, const LayoutElement& element, const FieldSource& source) const
 {
-    const auto code = QString::number(source.person->person_id) + u'$';
-    place.barcode(code, {element.width, element.height}, element.align);
+    place.barcode(barcode_content(source.person->person_id), {element.width, element.height}, element.align);
 }
 
 } // namespace kindrel::output

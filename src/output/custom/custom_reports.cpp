@@ -68,8 +68,7 @@ std::vector<CustomReport> custom_reports(const core::Office& office)
     auto reports = own_layouts(office, {u"*.rpt"_s, u"*.rpy"_s});
     for (const auto& plugin : office.plugins.reports) {
         if (is_report(plugin))
-            reports.push_back({office.paths.file(core::Folder::plugin_reports, plugin.file),
-                               plugin.title + u" (Plugin Reports)"_s, true});
+            reports.push_back({office.paths.file(core::Folder::plugin_reports, plugin.file), plugin.title, true});
     }
     sort(reports);
     return reports;
@@ -80,6 +79,13 @@ std::vector<CustomReport> custom_receipts(const core::Office& office)
     auto receipts = own_layouts(office, {u"*.rct"_s});
     sort(receipts);
     return receipts;
+}
+
+CustomLayout titled(CustomLayout layout, const CustomReport& report)
+{
+    if (layout.title.isEmpty())
+        layout.title = report.title;
+    return layout;
 }
 
 std::optional<CustomLayout> usable_layout(core::Dialogue& dialogue, const QString& file)
@@ -109,9 +115,7 @@ bool run_custom_report(const CustomReport& report, const ReportInput& input, cor
         dialogue.show({u"\"%1\" is a receipt. Receipts are made from what people gave."_s.arg(report.title)});
         return false;
     }
-    if (layout->title.isEmpty())
-        layout->title = report.title;
-    return write_custom_report(*layout, input, progress, spool);
+    return write_custom_report(titled(std::move(*layout), report), input, progress, spool);
 }
 
 } // namespace kindrel::output

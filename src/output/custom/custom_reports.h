@@ -25,6 +25,9 @@ struct CustomReport
 [[nodiscard]] bool run_custom_report(const CustomReport& report, const ReportInput& input, core::Progress& progress,
                                      pages::PageSpool& spool);
 
+/// The report's layout; where it has no title of its own, under that of the report.
+[[nodiscard]] CustomLayout titled(CustomLayout layout, const CustomReport& report);
+
 /// The layout of the file; nullopt after telling what is wrong with it.
 [[nodiscard]] std::optional<CustomLayout> usable_layout(core::Dialogue& dialogue, const QString& file);
 

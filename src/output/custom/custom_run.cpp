@@ -3,8 +3,6 @@
 #include "output/custom/custom_groups.h"
 #include "output/decoration.h"
 
-#include <QSet>
-
 namespace kindrel::output {
 
 using namespace Qt::StringLiterals;
@@ -25,19 +23,14 @@ void add_extent(people::Extent& extent, const LayoutParts& parts)
     }
 }
 
-/// The families and people that were printed.
-struct Counts
-{
-    QSet<int> families, people;
-};
-
 /// Writes one report from its start to its end.
 class CustomRun
 {
 public:
     CustomRun(const CustomLayout& layout, const ReportInput& input, pages::Flow& flow, CustomPages& pages,
               const RunFacts& facts)
-        : m_layout(layout), m_input(input), m_flow(flow), m_pages(pages), m_facts(facts)
+        : m_layout(layout), m_input(input), m_flow(flow), m_pages(pages), m_facts(facts),
+          m_listed(sorted_people(input.list))
     {
     }
 
@@ -47,7 +40,7 @@ public:
         if (!(m_layout.kind == LayoutKind::families ? write_families(progress) : write_people(progress)))
             return false;
         end_group();
-        show(m_all);
+        m_all.show_in(m_facts);
         m_pages.write(m_flow, LayoutPlace::end, {m_facts});
         m_pages.close_table();
         return true;
@@ -108,15 +101,17 @@ private:
     {
         begin_entry();
         const pages::Keep together(m_flow);
-        const auto household = people::household_of(listed.family.people());
+        const auto household = listed_household(listed.family, m_listed);
         m_pages.write(m_flow, LayoutPlace::person, {m_facts, &listed.family, &household, &listed.person});
         count(listed.family.family().Surname_ID, listed.person.person_id);
     }
 
     void begin_entry()
     {
-        if (m_layout.one_to_a_page && m_entries > 0 && m_facts.number > 0)
+        if (m_layout.one_to_a_page && m_entries > 0 && m_facts.number > 0) {
+            m_pages.close_table();
             m_flow.next_page();
+        }
         ++m_entries;
         ++m_facts.number;
     }
@@ -141,7 +136,7 @@ private:
     void end_group()
     {
         if (m_group) {
-            show(m_in_group);
+            m_in_group.show_in(m_facts);
             m_pages.write(m_flow, LayoutPlace::end_of_group, {m_facts});
         }
         m_pages.close_table();
@@ -150,16 +145,8 @@ private:
 
     void count(int family, int person)
     {
-        for (auto* counts : {&m_in_group, &m_all}) {
-            counts->families.insert(family);
-            counts->people.insert(person);
-        }
-    }
-
-    void show(const Counts& counts)
-    {
-        m_facts.family_count = int(counts.families.size());
-        m_facts.person_count = int(counts.people.size());
+        m_in_group.add(family, person);
+        m_all.add(family, person);
     }
 
     const CustomLayout& m_layout;
@@ -167,10 +154,11 @@ private:
     pages::Flow& m_flow;
     CustomPages& m_pages;
     RunFacts m_facts;
+    std::vector<int> m_listed; ///< Everybody on the list.
     std::optional<pages::Group> m_group;
     int m_group_place = -1;
     int m_entries = 0;
-    Counts m_in_group, m_all;
+    PrintedCounts m_in_group, m_all;
 };
 
 } // namespace

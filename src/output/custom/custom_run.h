@@ -2,7 +2,28 @@
 
 #include "output/custom/custom_pages.h"
 
+#include <QSet>
+
 namespace kindrel::output {
+
+/// The families and people that were printed, each counted once.
+class PrintedCounts
+{
+public:
+    void add(int family, int person)
+    {
+        m_families.insert(family);
+        m_people.insert(person);
+    }
+    void show_in(RunFacts& facts) const
+    {
+        facts.family_count = int(m_families.size());
+        facts.person_count = int(m_people.size());
+    }
+
+private:
+    QSet<int> m_families, m_people;
+};
 
 /// What all that the layout prints asks the register for, and no more.
 [[nodiscard]] people::Extent extent_of(const CustomLayout& layout);

@@ -1,6 +1,7 @@
 #include "output/custom/custom_values.h"
 
 #include "output/family_lines.h"
+#include "output/letters/letter_fields.h"
 #include "pages/page.h"
 #include "people/sort_key.h"
 
@@ -23,7 +24,12 @@ FieldValues single(const QString& text)
 
 FieldValues single(const FieldSource& source, const std::optional<core::Date>& date)
 {
-    return {{shown(*source.family, date)}};
+    return {{.text = shown(*source.family, date), .day = date}};
+}
+
+FieldValues single(int number)
+{
+    return {{.text = QString::number(number), .place = number}};
 }
 
 FieldValues listed(const QStringList& texts)
@@ -42,28 +48,14 @@ FieldValues names(const FieldSource& source, std::span<const Person* const> peop
     return values;
 }
 
-/// Primary and spouse, as far as they are there.
-std::vector<const Person*> couple(const FieldSource& source)
-{
-    std::vector<const Person*> two{source.household->primary, source.household->spouse};
-    std::erase(two, nullptr);
-    return two;
-}
-
 QString name_of(const FieldSource& source, const Person* person)
 {
     return person ? source.family->name(*person) : QString();
 }
 
-/// Title and name of both, then the surname; nothing when neither is there.
-QString titled(const FieldSource& source, qsizetype letters)
+FieldValues with_surname(const FieldSource& source, const QString& names)
 {
-    QString text;
-    for (const auto* person : couple(source)) {
-        const auto name = source.family->name(*person);
-        text = joined(u" & ", {text, joined(u" ", {person->Title, letters < 0 ? name : name.left(letters)})});
-    }
-    return text.isEmpty() ? text : joined(u" ", {text, source.family->family().surname});
+    return single(joined(u" ", {names, source.family->family().surname}));
 }
 
 FieldValues ministries_of(const FieldSource& source, std::optional<MinistryState> only)
@@ -95,11 +87,14 @@ FieldValues values_of_rows(const people::DisclosedFamily& family, const std::vec
 {
     FieldValues values;
     for (const auto& row : rows) {
-        FieldValue value{row.text, row.text, row.text, row.item};
-        if (row.date)
-            value = {joined(u" ", {row.text, family.shown(*row.date)}), row.text, family.shown(*row.date), row.item};
-        else if (!row.field.isEmpty())
-            value = {joined(u": ", {row.text, row.field}), row.text, row.field, row.item};
+        FieldValue value{row.text, row.text, row.text, row.item, row.date};
+        if (row.date) {
+            value.bare = family.shown(*row.date);
+            value.text = joined(u" ", {row.text, value.bare});
+        } else if (!row.field.isEmpty()) {
+            value.bare = row.field;
+            value.text = joined(u": ", {row.text, row.field});
+        }
         values.push_back(std::move(value));
     }
     return values;
@@ -132,22 +127,22 @@ FieldValues group(const FieldSource& source)
 
 FieldValues number(const FieldSource& source)
 {
-    return single(QString::number(source.run.number));
+    return single(source.run.number);
 }
 
 FieldValues family_count(const FieldSource& source)
 {
-    return single(QString::number(source.run.family_count));
+    return single(source.run.family_count);
 }
 
 FieldValues person_count(const FieldSource& source)
 {
-    return single(QString::number(source.run.person_count));
+    return single(source.run.person_count);
 }
 
 FieldValues page(const FieldSource& source)
 {
-    return single(QString::number(source.run.page));
+    return single(source.run.page);
 }
 
 FieldValues pages(const FieldSource&)
@@ -179,23 +174,22 @@ FieldValues spouse_name(const FieldSource& source)
 
 FieldValues both_names(const FieldSource& source)
 {
-    return single(names_of(*source.family, couple(source), u" & "));
+    return single(couple_names(*source.family, *source.household));
 }
 
 FieldValues both_names_and_surname(const FieldSource& source)
 {
-    const auto text = names_of(*source.family, couple(source), u" & ");
-    return single(text.isEmpty() ? text : joined(u" ", {text, source.family->family().surname}));
+    return with_surname(source, couple_names(*source.family, *source.household));
 }
 
 FieldValues titled_names(const FieldSource& source)
 {
-    return single(titled(source, -1));
+    return with_surname(source, titled_couple(*source.family, *source.household));
 }
 
 FieldValues titled_initials(const FieldSource& source)
 {
-    return single(titled(source, 1));
+    return with_surname(source, titled_couple(*source.family, *source.household, Called::by_initial));
 }
 
 FieldValues primary_title(const FieldSource& source)
@@ -232,7 +226,7 @@ FieldValues and_family(const FieldSource& source)
 
 FieldValues people_in_family(const FieldSource& source)
 {
-    return single(QString::number(source.household->adults.size() + source.household->children.size()));
+    return single(int(source.household->adults.size() + source.household->children.size()));
 }
 
 FieldValues condition(const FieldSource& source)
@@ -315,7 +309,7 @@ FieldValues events(const FieldSource& source)
     FieldValues values;
     for (const auto& one : source.family->file().events) {
         const auto day = shown(*source.family, one.event_date);
-        values.push_back({joined(u" ", {day, one.event}), one.event, day});
+        values.push_back({joined(u" ", {day, one.event}), one.event, day, 0, one.event_date});
     }
     return values;
 }
@@ -343,7 +337,7 @@ FieldValues full_name(const FieldSource& source)
 
 FieldValues person_id(const FieldSource& source)
 {
-    return single(QString::number(source.person->person_id));
+    return single(source.person->person_id);
 }
 
 FieldValues role(const FieldSource& source)
@@ -358,7 +352,7 @@ FieldValues role(const FieldSource& source)
 
 FieldValues position(const FieldSource& source)
 {
-    return {{.text = QString::number(source.person->position), .place = source.person->position}};
+    return single(source.person->position);
 }
 
 FieldValues birthdate(const FieldSource& source)
@@ -374,7 +368,7 @@ FieldValues age(const FieldSource& source)
     const auto today = core::Date::from(source.run.today);
     const bool birthday_ahead = std::pair(today.month, today.day) < std::pair(born->month, born->day);
     const int years = today.year - born->year - (birthday_ahead ? 1 : 0);
-    return years < 0 ? FieldValues() : FieldValues{{.text = QString::number(years), .place = years}};
+    return years < 0 ? FieldValues() : single(years);
 }
 
 FieldValues school_year(const FieldSource& source)
@@ -420,7 +414,7 @@ FieldValues total(const FieldSource& source)
 
 FieldValues gifts(const FieldSource& source)
 {
-    return single(QString::number(source.receipt->gifts));
+    return single(source.receipt->gifts);
 }
 
 FieldValues gift_list(const FieldSource& source)

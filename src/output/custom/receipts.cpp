@@ -18,12 +18,14 @@ bool write_receipts(const CustomLayout& layout, std::span<const ReceiptGiver> gi
     CustomPages pages(layout, looks, input.office.paths);
     set_bands(flow, layout, pages, facts, input);
     pages.write(flow, LayoutPlace::start, {facts});
+    PrintedCounts printed;
     const auto write = [&](const ListedMember& listed, std::size_t place) {
         if (layout.one_to_a_page && facts.number > 0)
             flow.next_page();
         ++facts.number;
+        printed.add(listed.family.family().Surname_ID, listed.person.person_id);
         const pages::Keep together(flow);
-        const auto household = people::household_of(listed.family.people());
+        const auto household = people::living_household(listed.family.people());
         pages.write(flow, LayoutPlace::giver,
                     {facts, &listed.family, &household, &listed.person, &givers[place].facts});
         if (layout.one_to_a_page)
@@ -31,7 +33,7 @@ bool write_receipts(const CustomLayout& layout, std::span<const ReceiptGiver> gi
     };
     const bool whole = for_each_person_of(input, input.list.members, progress, write, extent_of(layout));
     if (whole) {
-        facts.family_count = facts.person_count = facts.number;
+        printed.show_in(facts);
         pages.write(flow, LayoutPlace::end, {facts});
     }
     pages.close_table();
@@ -58,12 +60,10 @@ bool run_receipts(core::Office& office, const CustomReport& receipt, std::span<c
         office.dialogue.show({u"\"%1\" is a report and no receipt."_s.arg(receipt.title)});
         return false;
     }
-    if (layout->title.isEmpty())
-        layout->title = receipt.title;
     people::WorkingList list;
     for (const auto& one : givers)
         list.members.push_back(one.giver);
-    return write_receipts(*layout, givers, {office, list, options}, progress, spool);
+    return write_receipts(titled(std::move(*layout), receipt), givers, {office, list, options}, progress, spool);
 }
 
 } // namespace kindrel::output

@@ -2,8 +2,6 @@
 
 #include "output/family_lines.h"
 
-#include <QStringList>
-
 #include <algorithm>
 
 namespace kindrel::output {
@@ -14,9 +12,6 @@ namespace {
 
 constexpr QStringView conjunction = u" & ";
 
-/// How a joint form of address names a person.
-enum class Called { by_name, by_initial };
-
 bool addressed_by_post(const LetterFamily& to)
 {
     if (to.address != LetterAddress::mailing)
@@ -24,9 +19,9 @@ bool addressed_by_post(const LetterFamily& to)
     return !address_lines(to.family, people::SuburbType::postal).isEmpty();
 }
 
-QString name_of(const LetterFamily& to, const people::Person* person, Called called = Called::by_name)
+QString name_of(const people::DisclosedFamily& family, const people::Person* person, Called called = Called::by_name)
 {
-    const auto name = person ? to.family.name(*person) : QString();
+    const auto name = person ? family.name(*person) : QString();
     if (called == Called::by_name || name.isEmpty())
         return name;
     return name.first(name.front().isHighSurrogate() && name.size() > 1 ? 2 : 1).toUpper();
@@ -35,23 +30,6 @@ QString name_of(const LetterFamily& to, const people::Person* person, Called cal
 QString title_of(const people::Person* person)
 {
     return person ? person->Title : QString();
-}
-
-QString both_names(const LetterFamily& to, Called called = Called::by_name)
-{
-    const auto& household = to.household;
-    return joined(conjunction, {name_of(to, household.primary, called), name_of(to, household.spouse, called)});
-}
-
-/// Titles stand together before the names when both have one; a single title stays with its own name.
-QString titled(const LetterFamily& to, Called called)
-{
-    const auto& [primary, spouse] = std::pair{to.household.primary, to.household.spouse};
-    const auto first = title_of(primary), second = title_of(spouse);
-    if (!first.isEmpty() && !second.isEmpty())
-        return joined(u" ", {joined(conjunction, {first, second}), both_names(to, called)});
-    return joined(conjunction, {joined(u" ", {first, name_of(to, primary, called)}),
-                                joined(u" ", {second, name_of(to, spouse, called)})});
 }
 
 const QString& surname(const LetterFamily& to)
@@ -65,8 +43,7 @@ QString children_names(const LetterFamily& to)
     for (const auto* child : to.household.children)
         names += to.family.name(*child);
     names.removeAll(QString());
-    const auto last = names.isEmpty() ? QString() : names.takeLast();
-    return joined(conjunction, {names.join(u", "_s), last});
+    return listed_with_and(std::move(names));
 }
 
 QString street(const LetterFamily& to)
@@ -98,22 +75,25 @@ using To = const LetterFamily&;
 
 constexpr LetterField fields[]{
     {u"[Surname]", nullptr, [](To to) { return surname(to); }, nothing_more},
-    {u"[Primary_Name]", u"[First_Adult_Name]", [](To to) { return name_of(to, to.household.primary); }, nothing_more},
-    {u"[Spouse_Name]", u"[Second_Adult_Name]", [](To to) { return name_of(to, to.household.spouse); }, nothing_more},
-    {u"[Primary_&_Spouse_Name]", u"[First_&_Second_Adult_Name]", [](To to) { return both_names(to); }, nothing_more},
+    {u"[Primary_Name]", u"[First_Adult_Name]", [](To to) { return name_of(to.family, to.household.primary); },
+     nothing_more},
+    {u"[Spouse_Name]", u"[Second_Adult_Name]", [](To to) { return name_of(to.family, to.household.spouse); },
+     nothing_more},
+    {u"[Primary_&_Spouse_Name]", u"[First_&_Second_Adult_Name]",
+     [](To to) { return couple_names(to.family, to.household); }, nothing_more},
     {u"[Primary_&_Spouse_Name_&_Surname]", u"[First_&_Second_Adult_Name_&_Surname]",
      [](To to) {
-         return joined(u" ", {both_names(to), surname(to)});
+         return joined(u" ", {couple_names(to.family, to.household), surname(to)});
      },
      nothing_more},
     {u"[Titles_&_Primary_&_Spouse_Name_&_Surname]", u"[Titles_&_First_&_Second_Adult_Name_&_Surname]",
      [](To to) {
-         return joined(u" ", {titled(to, Called::by_name), surname(to)});
+         return joined(u" ", {titled_couple(to.family, to.household), surname(to)});
      },
      details},
     {u"[Titles_&_Primary_&_Spouse_initial_&_Surname]", u"[Titles_&_First_&_Second_Adult_initial_&_Surname]",
      [](To to) {
-         return joined(u" ", {titled(to, Called::by_initial), surname(to)});
+         return joined(u" ", {titled_couple(to.family, to.household, Called::by_initial), surname(to)});
      },
      details},
     {u"[Primary_Title]", u"[First_Adult_Title]", [](To to) { return title_of(to.household.primary); }, details},
@@ -128,21 +108,29 @@ constexpr LetterField fields[]{
 
 } // namespace
 
+QString couple_names(const people::DisclosedFamily& family, const people::Household& household, Called called)
+{
+    return joined(conjunction, {name_of(family, household.primary, called), name_of(family, household.spouse, called)});
+}
+
+QString titled_couple(const people::DisclosedFamily& family, const people::Household& household, Called called)
+{
+    const auto first = title_of(household.primary), second = title_of(household.spouse);
+    if (!first.isEmpty() && !second.isEmpty())
+        return joined(u" ", {joined(conjunction, {first, second}), couple_names(family, household, called)});
+    return joined(conjunction, {joined(u" ", {first, name_of(family, household.primary, called)}),
+                                joined(u" ", {second, name_of(family, household.spouse, called)})});
+}
+
+QString listed_with_and(QStringList texts)
+{
+    const auto last = texts.isEmpty() ? QString() : texts.takeLast();
+    return joined(conjunction, {texts.join(u", "_s), last});
+}
+
 LetterFamily LetterFamily::of(const people::DisclosedFamily& family, LetterAddress address, QDate today)
 {
-    auto household = people::household_of(family.people());
-    const auto gone = [](const people::Person* person) {
-        return person->Decease;
-    };
-    std::erase_if(household.adults, gone);
-    std::erase_if(household.children, gone);
-    if (household.spouse && household.spouse->Decease)
-        household.spouse = nullptr;
-    if (household.primary && household.primary->Decease) {
-        household.primary = household.adults.empty() ? nullptr : household.adults.front();
-        household.spouse = nullptr;
-    }
-    return {family, std::move(household), address, today};
+    return {family, people::living_household(family.people()), address, today};
 }
 
 std::span<const LetterField> letter_fields()

@@ -1,18 +1,16 @@
 #pragma once
 
+#include "output/run_options.h"
 #include "people/disclosed.h"
 #include "people/family_store.h"
 #include "people/names.h"
 
 #include <QDate>
+#include <QStringList>
 
 #include <span>
 
 namespace kindrel::output {
-
-/// Which address a run puts into its letters. `mailing` is the postal one, or the residential one where a family has
-/// no postal one.
-enum class LetterAddress { residential, postal, mailing };
 
 /// Whom a copy of a letter goes to.
 struct LetterFamily
@@ -25,6 +23,19 @@ struct LetterFamily
     /// The living people of the family, whoever of them is on the list.
     [[nodiscard]] static LetterFamily of(const people::DisclosedFamily& family, LetterAddress address, QDate today);
 };
+
+/// How a joint form of address names a person.
+enum class Called { by_name, by_initial };
+
+/// "Ann & Ben", "A & B"; a single name stands for itself.
+[[nodiscard]] QString couple_names(const people::DisclosedFamily& family, const people::Household& household,
+                                   Called called = Called::by_name);
+/// "Mrs & Mr Ann & Ben". Titles stand together before the names when both have one; a single title stays with its own
+/// name.
+[[nodiscard]] QString titled_couple(const people::DisclosedFamily& family, const people::Household& household,
+                                    Called called = Called::by_name);
+/// "Cid, Dot & Eve".
+[[nodiscard]] QString listed_with_and(QStringList texts);
 
 /// What may stand in a letter to be replaced for each family.
 struct LetterField

@@ -65,7 +65,7 @@ class Merging
 public:
     explicit Merging(const LetterValues& values) : m_values(values) {}
 
-    [[nodiscard]] std::vector<LetterParagraph> merge(Pieces pieces)
+    [[nodiscard]] MergedPart merge(Pieces pieces)
     {
         bool inside = false;
         for (std::size_t i = 0; i < pieces.size(); ++i) {
@@ -74,14 +74,15 @@ public:
                 continue;
             }
             const auto stretch = pieces.subspan(i + 1);
-            if (!inside && merges_empty(stretch.first(length_to_filter(stretch)))) {
-                i += length_to_filter(stretch) + 1;
-                m_removed = true;
+            const auto length = length_to_filter(stretch);
+            if (!inside && merges_empty(stretch.first(length))) {
+                remove(stretch.first(length));
+                i += length + 1;
             } else {
                 inside = !inside;
             }
         }
-        return std::move(m_paragraphs);
+        return std::move(m_merged);
     }
 
 private:
@@ -94,6 +95,12 @@ private:
             return is_field(piece) && !m_values[piece.field].isEmpty();
         };
         return std::ranges::any_of(stretch, is_field) && std::ranges::none_of(stretch, is_filled);
+    }
+
+    void remove(Pieces stretch)
+    {
+        m_removed = true;
+        m_merged.page_due |= std::ranges::any_of(stretch, [](const auto& piece) { return piece.shape.new_page; });
     }
 
     void take(const LetterPiece& piece)
@@ -140,6 +147,7 @@ private:
 
     void end_paragraph(const LetterPiece& piece)
     {
+        m_merged.page_due |= piece.shape.new_page;
         if (!keep_line()) {
             if (m_paragraph.runs.empty())
                 return;
@@ -147,7 +155,8 @@ private:
         }
         close(m_paragraph, piece.run.style);
         m_paragraph.shape = piece.shape;
-        m_paragraphs.push_back(std::exchange(m_paragraph, {}));
+        m_paragraph.shape.new_page = std::exchange(m_merged.page_due, false);
+        m_merged.paragraphs.push_back(std::exchange(m_paragraph, {}));
     }
 
     void drop_last_line_end()
@@ -159,7 +168,7 @@ private:
     }
 
     const LetterValues& m_values;
-    std::vector<LetterParagraph> m_paragraphs;
+    MergedPart m_merged;
     LetterParagraph m_paragraph, m_line;
     bool m_removed = false; ///< Something of the present line.
 };
@@ -254,14 +263,20 @@ LetterValues LetterForm::values(const LetterFamily& family) const
 LetterText LetterForm::merged(const LetterValues& values) const
 {
     LetterText letter;
-    for (const auto& part : m_parts)
-        std::ranges::move(output::merged(part, values), std::back_inserter(letter.paragraphs));
+    bool page_due = false;
+    for (const auto& part : m_parts) {
+        auto merged = output::merged(part, values);
+        if (!merged.paragraphs.empty())
+            merged.paragraphs.front().shape.new_page |= std::exchange(page_due, false);
+        page_due |= merged.page_due;
+        std::ranges::move(merged.paragraphs, std::back_inserter(letter.paragraphs));
+    }
     if (letter.paragraphs.empty())
         letter.paragraphs.push_back({{{{}, letter_style()}}});
     return letter;
 }
 
-std::vector<LetterParagraph> merged(const LetterPart& part, const LetterValues& values)
+MergedPart merged(const LetterPart& part, const LetterValues& values)
 {
     return Merging(values).merge(part.pieces);
 }

@@ -55,8 +55,16 @@ private:
     bool m_filter_open = false;
 };
 
+/// What a part comes to for one family.
+struct MergedPart
+{
+    std::vector<LetterParagraph> paragraphs;
+    bool page_due = false; ///< Whatever follows begins a page: the paragraph that was to begin it has gone.
+};
+
 /// The part with every field replaced and without its markers. A pair of markers whose fields are all empty goes with
-/// everything between them, and so does the line that is blank without it.
-[[nodiscard]] std::vector<LetterParagraph> merged(const LetterPart& part, const LetterValues& values);
+/// everything between them, and so does the line that is blank without it. The page that something began which goes is
+/// begun by what follows.
+[[nodiscard]] MergedPart merged(const LetterPart& part, const LetterValues& values);
 
 } // namespace kindrel::output

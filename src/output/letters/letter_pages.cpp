@@ -37,7 +37,8 @@ void LetterPages::lay_out_fixed_parts()
         if (!part.fixed)
             continue;
         pages::Box box(metrics, m_flow.type(), m_flow.width(), body_height(m_flow.setup()));
-        for (const auto& paragraph : merged(part, {}))
+        const auto same_for_all = merged(part, {});
+        for (const auto& paragraph : same_for_all.paragraphs)
             write_paragraph(box, paragraph);
         m_fixed[i] = box.take();
     }
@@ -48,6 +49,7 @@ void LetterPages::write(const LetterValues& values)
     if (m_begun)
         m_flow.next_page();
     m_begun = m_at_top = true;
+    m_page_due = false;
     for (std::size_t i = 0; i < m_fixed.size(); ++i) {
         const auto& part = m_letter.parts()[i];
         if (part.fixed) {
@@ -56,16 +58,19 @@ void LetterPages::write(const LetterValues& values)
                 m_flow.write(block);
             continue;
         }
-        for (const auto& paragraph : merged(part, values)) {
+        const auto own = merged(part, values);
+        for (const auto& paragraph : own.paragraphs) {
             begin_paragraph(paragraph.shape);
             write_paragraph(m_flow, paragraph);
         }
+        m_page_due |= own.page_due;
     }
 }
 
 void LetterPages::begin_paragraph(const LetterShape& shape)
 {
-    if (shape.new_page && !m_at_top)
+    const bool page_due = std::exchange(m_page_due, false);
+    if ((shape.new_page || page_due) && !m_at_top)
         m_flow.next_page();
     m_at_top = false;
 }

@@ -31,7 +31,8 @@ private:
     std::vector<pages::Blocks> m_fixed;            ///< By the places of the parts; empty for those that differ.
     QHash<const char*, pages::Picture> m_pictures; ///< By the letter's own bytes, which all copies share.
     bool m_begun = false;
-    bool m_at_top = true; ///< Nothing of the present copy stands on the present page.
+    bool m_at_top = true;    ///< Nothing of the present copy stands on the present page.
+    bool m_page_due = false; ///< The next paragraph begins a page, whatever it asks for.
 };
 
 } // namespace kindrel::output

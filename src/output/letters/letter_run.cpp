@@ -86,15 +86,14 @@ std::optional<LetterForm> usable_letter(core::Dialogue& dialogue, const QString&
     return form;
 }
 
-bool write_letter(const LetterForm& letter, const ReportInput& input, LetterAddress address, core::Progress& progress,
-                  pages::PageSpool& spool)
+bool write_letter(const LetterForm& letter, const ReportInput& input, core::Progress& progress, pages::PageSpool& spool)
 {
     const pages::PageSetup setup{.paper = input.options.paper, .margins = letter_margins};
     pages::Flow flow(spool, setup);
     LetterPages pages(letter, flow, input.options.text_percent);
     const auto today = input.office.clock.today();
     const auto write = [&](const ListedFamily& listed) {
-        pages.write(letter.values(LetterFamily::of(listed.family, address, today)));
+        pages.write(letter.values(LetterFamily::of(listed.family, input.options.address, today)));
     };
     if (!for_each_family(input, progress, write, letter.extent()))
         return false;
@@ -102,8 +101,7 @@ bool write_letter(const LetterForm& letter, const ReportInput& input, LetterAddr
     return true;
 }
 
-bool run_letter(const QString& file, const ReportInput& input, LetterAddress address, core::Progress& progress,
-                pages::PageSpool& spool)
+bool run_letter(const QString& file, const ReportInput& input, core::Progress& progress, pages::PageSpool& spool)
 {
     if (!may_run(input))
         return false;
@@ -111,7 +109,7 @@ bool run_letter(const QString& file, const ReportInput& input, LetterAddress add
     if (!lock)
         return false;
     const auto letter = usable_letter(input.office.dialogue, file);
-    return letter && write_letter(*letter, input, address, progress, spool);
+    return letter && write_letter(*letter, input, progress, spool);
 }
 
 } // namespace kindrel::output

@@ -48,11 +48,11 @@ private:
 
 /// One copy for each family of the input's list, each beginning on a new page. Asks nothing and checks nothing. False
 /// when cancelled; the spool then stays open.
-[[nodiscard]] bool write_letter(const LetterForm& letter, const ReportInput& input, LetterAddress address,
-                                core::Progress& progress, pages::PageSpool& spool);
+[[nodiscard]] bool write_letter(const LetterForm& letter, const ReportInput& input, core::Progress& progress,
+                                pages::PageSpool& spool);
 
 /// As run_report(). The letter is locked meanwhile; a letter with faults is refused before the first page.
-[[nodiscard]] bool run_letter(const QString& file, const ReportInput& input, LetterAddress address,
-                              core::Progress& progress, pages::PageSpool& spool);
+[[nodiscard]] bool run_letter(const QString& file, const ReportInput& input, core::Progress& progress,
+                              pages::PageSpool& spool);
 
 } // namespace kindrel::output

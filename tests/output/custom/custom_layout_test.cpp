@@ -69,6 +69,12 @@ std::string told(const ParsedLayout& parsed)
     return shown(parsed).join(u'\n').toStdString();
 }
 
+/// A layout and what is told of it.
+struct Faulty
+{
+    QString text, fault;
+};
+
 /// A layout per family whose one section holds these lines from line 3 on.
 QString in_section(const QString& lines)
 {
@@ -112,11 +118,7 @@ TEST(CustomLayout, TheFilesEndingTellsWhatItHoldsUnlessItsFirstLineDoes)
 
 TEST(CustomLayout, EachFaultIsToldWithItsLine)
 {
-    struct Case
-    {
-        QString text, fault;
-    };
-    const std::vector<Case> cases{
+    const std::vector<Faulty> cases{
         {in_section(u"line [surnam]"_s), u"Line 3: there is no field \"surnam\"; did you mean \"surname\"?"_s},
         {in_section(u"line [qqqqqqqq]"_s), u"Line 3: there is no field \"qqqqqqqq\"."_s},
         {in_section(u"line [Name]"_s), u"Line 3: the field \"Name\" has no value in \"each family\"."_s},
@@ -145,7 +147,7 @@ TEST(CustomLayout, EachFaultIsToldWithItsLine)
         {in_section(u"line [phone]\nreceipt"_s), u"Line 4: \"receipt\" belongs on the first line."_s},
         {in_section(u"row [phone]"_s),
          u"Line 3: a row needs a table: write \"table\" and its columns above the first section."_s},
-        {in_section(u"barcode 80 by 20\nline [phone]"_s),
+        {in_section(u"barcode 90 by 20\nline [phone]"_s),
          u"Line 3: a barcode is a person's and cannot stand in \"each family\"."_s},
         {in_section(u"portrait 80 100"_s),
          u"Line 3: \"portrait\" needs width and height, as in \"portrait 80 by 100\", but not \"100\"."_s},
@@ -165,9 +167,28 @@ TEST(CustomLayout, EachFaultIsToldWithItsLine)
          "Line 2: \"surname\" has no meaning at this place of the line."_s},
         {with_settings(u"group by [status]"_s), u"Line 2: the field \"status\" has no value in \"each family\"."_s},
         {u"each person"_s, u"The layout prints nobody: it needs a section \"each family\" with lines in it."_s},
+    };
+    for (const auto& one : cases)
+        EXPECT_EQ(told(parse_layout(one.text, LayoutKind::families)), one.fault.toStdString())
+            << one.text.toStdString();
+}
+
+TEST(CustomLayout, WhatHasNoRoomOnThePagesIsRefusedWithItsLine)
+{
+    const std::vector<Faulty> cases{
         {with_settings(u"margins 250 36 250 36\ncolumns 4"_s), u"The margins and columns leave no room to print in."_s},
         {with_settings(u"page portrait\npage header\nspace 300"_s),
-         u"The section \"page header\" is too high: it leaves no room on the pages."_s},
+         u"Line 3: the section \"page header\" is too high: it leaves no room on the pages."_s},
+        {with_settings(u"text 36\npage footer\nline heading \"a\"\nline heading \"b\"\nline heading \"c\""_s),
+         u"Line 3: the section \"page footer\" is too high: it leaves no room on the pages."_s},
+        {with_settings(u"page landscape\nmargins 36 90 36 90\npage header\nspace 110\npage footer\nspace 110"_s),
+         u"Line 6: page header and page footer leave no room between them on the pages."_s},
+        {with_settings(u"margins 36 300 36 36"_s),
+         u"Line 2: \"margins\" needs a number from 0 to 250 here, but not \"300\"."_s},
+        {u"report per person\neach person\nbarcode 84 by 20"_s,
+         u"Line 3: \"barcode\" needs a number from 85 to 400 here, but not \"84\"."_s},
+        {u"report per person\ncolumns 4\neach person\nbarcode 120 by 20"_s,
+         u"Line 4: the barcode is wider than the columns, which have room for 114 points."_s},
     };
     for (const auto& one : cases)
         EXPECT_EQ(told(parse_layout(one.text, LayoutKind::families)), one.fault.toStdString())

@@ -58,10 +58,10 @@ TEST_F(ReceiptTest, EachGiverGetsAPageWithTheirDetailsAndWhatTheyGave)
     EXPECT_EQ(told(pages[0]), told(QStringList{u"Konrad Zuse"_s, u"Konrad Zuse"_s,
                                                u"Building Fund, 01/07/2023 to 30/06/2024"_s, u"2 gifts, $10.00"_s} +
                                    gave));
-    EXPECT_EQ(told(pages[1]),
-              told(QStringList{u"Mrs Ann & Mr Ben Naismith"_s, u"Mr Ben Naismith"_s, u"PO Box 1"_s, u"Unknown Suburb"_s,
-                               u"P.I.N. 77"_s, u"Building Fund, 01/07/2023 to 30/06/2024"_s, u"2 gifts, $25.50"_s} +
-                   gave + QStringList{u"2 receipts"_s}));
+    EXPECT_EQ(told(pages[1]), told(QStringList{u"Mrs & Mr Ann & Ben Naismith"_s, u"Mr Ben Naismith"_s, u"PO Box 1"_s,
+                                               u"Unknown Suburb"_s, u"P.I.N. 77"_s,
+                                               u"Building Fund, 01/07/2023 to 30/06/2024"_s, u"2 gifts, $25.50"_s} +
+                                   gave + QStringList{u"2 receipts"_s}));
 }
 
 TEST_F(ReceiptTest, SeveralReceiptsShareAPageWhereTheLayoutSaysSo)
@@ -97,6 +97,30 @@ TEST_F(ReceiptTest, NobodyAndAReportThatIsNoReceiptAreRefused)
     dialogue.expect_box(u"\"list.rct\" is a report and no receipt."_s);
     EXPECT_FALSE(run(lay(u"list.rct"_s, u"report per person\neach person\nline [Name]"_s), {giver(0, u"$1.00"_s)}));
     EXPECT_FALSE(spool.finished());
+}
+
+TEST_F(ReceiptTest, ReceiptsAreAddressedToTheLivingAndAGiverWhoHasDiedKeepsTheirName)
+{
+    auto couple = family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s, u"Cid"_s});
+    couple.people[0].Decease = couple.people[2].Decease = true;
+    add({couple});
+
+    ASSERT_TRUE(run(lay(u"thanks.rct"_s, u"many to a page\neach giver\nline [Primary_&_Spouse_Name] \" for \" [Name] "
+                                         "{ \" and \" [Children_Names] }"_s),
+                    {giver(0, u"$1.00"_s), giver(1, u"$2.00"_s)}));
+
+    EXPECT_EQ(told(read_back(spool).front()), "Ben for Ann\nBen for Ben");
+}
+
+TEST_F(ReceiptTest, TheEndCountsFamiliesAndPeopleAndNotReceipts)
+{
+    add({family(u"Abel"_s, {u"Ann"_s, u"Ben"_s}), family(u"Zuse"_s, {u"Konrad"_s})});
+
+    ASSERT_TRUE(run(lay(u"small.rct"_s, u"many to a page\neach giver\nline [number]\nend\n"
+                                        "line [family_count] \" families, \" [person_count] \" people\""_s),
+                    {giver(0, u"$1.00"_s), giver(1, u"$2.00"_s), giver(2, u"$3.00"_s), giver(2, u"$4.00"_s)}));
+
+    EXPECT_EQ(told(read_back(spool).front()), "1\n2\n3\n4\n2 families, 3 people");
 }
 
 TEST_F(ReceiptTest, AGiverWhoIsNoLongerInTheRegisterGetsNone)

@@ -118,6 +118,31 @@ TEST(LetterMerge, RemovesEmptiedLinesWithinAParagraphToo)
     }
 }
 
+TEST(LetterMerge, KeepsThePagesThatWhatGoesWasToBegin)
+{
+    // "/" stands for the beginning of a page.
+    const Merge merges[]{
+        {u"a\n/[R][Spouse_Name][R]\nb"_s, u"a\n/b"_s},
+        {u"a\n/[R][Spouse_Name][R]\n[R][Spouse_Title][R]\nb\nc"_s, u"a\n/b\nc"_s},
+        {u"a\n/[R][Spouse_Name][R]\n/b\nc"_s, u"a\n/b\nc"_s},
+        {u"a\n/[R]x [Spouse_Name]\n[R]b\nc"_s, u"a\n/b\nc"_s},
+        {u"a\n/x [R][Spouse_Name]\n[R]b\nc"_s, u"a\n/x b\nc"_s},
+        {u"a\n[R][Spouse_Name]\n/Dear\n[R]\nb"_s, u"a\n/b"_s},
+        {u"a\n/[R][Spouse_Name][R]"_s, u"a"_s},
+    };
+    for (const auto& [lines, copy] : merges) {
+        auto letter = letter_of(QString(lines).remove(u'/'));
+        const auto texts = lines.split(u'\n');
+        for (qsizetype line = 0; line < texts.size(); ++line)
+            letter.paragraphs[std::size_t(line)].shape.new_page = texts[line].startsWith(u'/');
+        QStringList paragraphs;
+        for (const auto& paragraph : LetterForm(letter).merged(naismiths).paragraphs)
+            paragraphs +=
+                (paragraph.shape.new_page ? u"/"_s : QString()) + output::plain_text({{paragraph}}).chopped(1);
+        EXPECT_EQ(paragraphs.join(u'\n'), copy) << lines.toStdString();
+    }
+}
+
 TEST(LetterMerge, FindsAFieldThatChangesItsLookAndKeepsItsFirstCharactersLook)
 {
     const auto bold = usual.bolder();

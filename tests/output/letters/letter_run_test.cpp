@@ -7,7 +7,6 @@
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
-using output::LetterAddress;
 
 namespace {
 
@@ -21,12 +20,12 @@ const QString one_user =
     u"To protect the integrity of your data, Kindrel only allows each custom letter to be used by one user at a time. "
     "If no user is on the system then you will need to enter the 'Network Setup' area to unlock the Custom Letter."_s;
 
-/// A paragraph for each line; a line that begins with "/" begins a page.
+/// A paragraph for each line; a line that begins with "/", marker or not, begins a page.
 output::LetterText letter_of(const QString& text)
 {
     output::LetterText letter;
     for (const auto& line : text.split(u'\n'))
-        letter.paragraphs.push_back({{{line, usual}}, {.new_page = line.startsWith(u'/')}});
+        letter.paragraphs.push_back({{{line, usual}}, {.new_page = QString(line).remove(u"[R]"_s).startsWith(u'/')}});
     return letter;
 }
 
@@ -43,7 +42,7 @@ protected:
     }
     [[nodiscard]] bool run_letter(const QString& text, pages::PageSpool& spool)
     {
-        return output::run_letter(lay(text), {office, list, options}, LetterAddress::residential, progress, spool);
+        return output::run_letter(lay(text), {office, list, options}, progress, spool);
     }
     /// The texts of each page.
     [[nodiscard]] std::vector<QStringList> copies(const QString& text)
@@ -148,7 +147,7 @@ TEST_F(LetterRunTest, PrintsPicturesOnceForAllCopiesInTheSizeThatTheyHave)
     output::save_letter(file, letter);
 
     pages::PageSpool spool;
-    ASSERT_TRUE(output::run_letter(file, {office, list}, LetterAddress::postal, progress, spool));
+    ASSERT_TRUE(output::run_letter(file, {office, list}, progress, spool));
 
     for (const int number : {1, 2}) {
         const auto page = spool.page(number);
@@ -158,6 +157,17 @@ TEST_F(LetterRunTest, PrintsPicturesOnceForAllCopiesInTheSizeThatTheyHave)
         EXPECT_NEAR(picture->where.right(), page.size.width() - 72, 0.01);
         EXPECT_EQ(picture->picture.encoded(), png);
     }
+}
+
+TEST_F(LetterRunTest, KeepsAPageThatAnEmptiedParagraphWasToBegin)
+{
+    add({family(u"Adams"_s, {u"Ann"_s}), family(u"Zorn"_s, {u"Dora"_s, u"Emil"_s})});
+    const auto with_spouse = std::vector<QStringList>{{u"a"_s}, {u"/Emil"_s, u"b"_s}};
+
+    for (const auto& next : {u"b"_s, u"[R]b[R]"_s}) // Laid out once for all copies, or for each.
+        EXPECT_EQ(copies(u"a\n[R]/[Spouse_Name][R]\n"_s + next),
+                  (std::vector<QStringList>{{u"a"_s}, {u"b"_s}, with_spouse[0], with_spouse[1]}));
+    EXPECT_EQ(copies(u"a\n[R]/[Spouse_Name][R]"_s), (std::vector<QStringList>{{u"a"_s}, {u"a"_s}, {u"/Emil"_s}}));
 }
 
 TEST_F(LetterRunTest, IsRefusedBeforeTheFirstPage)
@@ -187,7 +197,7 @@ TEST_F(LetterRunTest, TellsWhatIsWrongWithADamagedFile)
     dialogue.expect_box(u"The letter \"Welcome.ltr\" cannot be used."_s, u"It is damaged: its end is missing."_s);
 
     pages::PageSpool spool;
-    EXPECT_FALSE(output::run_letter(file, {office, list}, LetterAddress::postal, progress, spool));
+    EXPECT_FALSE(output::run_letter(file, {office, list}, progress, spool));
 }
 
 TEST_F(LetterRunTest, StopsWhereItIsCancelledAndAsksAsReportsDo)
@@ -201,10 +211,11 @@ TEST_F(LetterRunTest, StopsWhereItIsCancelledAndAsksAsReportsDo)
     EXPECT_EQ(progress.question, u"Are you sure that you wish to cancel this report?"_s);
 }
 
-TEST_F(LetterRunTest, EveryLetterOfTheTreeRunsWithTheAddressThatPostGoesTo)
+TEST_F(LetterRunTest, EveryLetterOfTheTreeRunsWithTheAddressThatIsChosenAndSaysWhenItIsPrinted)
 {
     auto boxed = family(u"Adams"_s, {u"Ann"_s});
     boxed.address.post_street = u"Box 5"_s;
+    boxed.address.res_street = u"3 Mill Lane"_s;
     auto at_home = family(u"Zorn"_s, {u"Dora"_s});
     at_home.address.res_street = u"1 High Street"_s;
     add({boxed, at_home});
@@ -217,11 +228,17 @@ TEST_F(LetterRunTest, EveryLetterOfTheTreeRunsWithTheAddressThatPostGoesTo)
     for (const auto& leaf : {u"Welcome"_s, u"Easter Greeting (Plugin Letters)"_s}) {
         const auto chosen = choice(leaf);
         EXPECT_EQ(chosen.family, u"Custom Letters"_s);
-        pages::PageSpool spool;
-        ASSERT_TRUE(chosen.run({office, list}, progress, spool));
-        ASSERT_EQ(spool.page_count(), 2);
-        EXPECT_EQ(pages::texts_of(spool.page(1), 2), QStringList(u"Box 5"_s));
-        EXPECT_EQ(pages::texts_of(spool.page(2), 2), QStringList(u"1 High Street"_s));
+        EXPECT_EQ(chosen.printed, u"Letter Printing is now completed"_s);
+        for (const auto& [address, first, second] :
+             {std::tuple{output::RunOptions{}.address, u"Box 5"_s, u"1 High Street"_s},
+              {output::LetterAddress::residential, u"3 Mill Lane"_s, u"1 High Street"_s},
+              {output::LetterAddress::postal, u"Box 5"_s, u""_s}}) {
+            pages::PageSpool spool;
+            ASSERT_TRUE(chosen.run({office, list, {.address = address}}, progress, spool));
+            ASSERT_EQ(spool.page_count(), 2);
+            EXPECT_EQ(pages::texts_of(spool.page(1), 2).join(u'|'), first);
+            EXPECT_EQ(pages::texts_of(spool.page(2), 2).join(u'|'), second);
+        }
     }
 }
 
@@ -233,7 +250,7 @@ TEST_F(LetterRunTest, TheLettersThatComeWithTheProgramRunAndAreWrittenByIt)
     for (const auto& name : {u"welcome.ltr"_s, u"holiday_club.ltr"_s}) {
         const auto file = QStringLiteral(KINDREL_SAMPLES "/") + name;
         pages::PageSpool spool;
-        ASSERT_TRUE(output::run_letter(file, {office, list}, LetterAddress::mailing, progress, spool));
+        ASSERT_TRUE(output::run_letter(file, {office, list}, progress, spool));
         ASSERT_EQ(spool.page_count(), 2) << name.toStdString();
         for (const int number : {1, 2})
             EXPECT_FALSE(pages::texts_of(spool.page(number), 2).join(u' ').contains(u'[')) << name.toStdString();
@@ -286,7 +303,7 @@ protected:
     [[nodiscard]] bool run(core::Progress& progress)
     {
         pages::PageSpool spool;
-        return output::run_letter(file(), {*office, list}, LetterAddress::postal, progress, spool);
+        return output::run_letter(file(), {*office, list}, progress, spool);
     }
 
     FakeWorkstation workstation;
