@@ -8,10 +8,49 @@
 #include <QFileInfo>
 
 #include <algorithm>
+#include <vector>
 
 namespace kindrel::core {
 
 using namespace Qt::StringLiterals;
+
+/// Files that belong together: unless kept, they are put back as they were.
+class WrittenFiles
+{
+public:
+    WrittenFiles() = default;
+    WrittenFiles(const WrittenFiles&) = delete;
+    WrittenFiles& operator=(const WrittenFiles&) = delete;
+    ~WrittenFiles()
+    {
+        for (const auto& [file, content] : m_before)
+            put_back(file, content);
+    }
+
+    /// Throws FileError.
+    void write(const QString& file, const QByteArray& content)
+    {
+        auto before = read_file(file);
+        write_file(file, content);
+        m_before.emplace_back(file, std::move(before));
+    }
+    void write(const Paths& paths, const SideRecord& record)
+    {
+        write(paths.file(record.file().folder, QLatin1String(record.file().name)), record.bytes());
+    }
+    void keep() { m_before.clear(); }
+
+private:
+    static void put_back(const QString& file, const std::optional<QByteArray>& content)
+    {
+        try {
+            content ? write_file(file, *content) : remove_file(file);
+        } catch (const FileError&) { // The failure that led here is told already.
+        }
+    }
+
+    std::vector<std::pair<QString, std::optional<QByteArray>>> m_before;
+};
 
 namespace {
 
@@ -62,7 +101,7 @@ QString shortened(const QFileInfo& file, int copy)
 }
 
 /// Puts the picture among the church's pictures, beside those of other content, and tells its name there.
-QString store_picture(const Paths& paths, const QString& chosen_file, const QByteArray& content)
+QString store_picture(const Paths& paths, const QString& chosen_file, const QByteArray& content, WrittenFiles& files)
 {
     make_folder(paths.folder(Folder::images));
     for (int copy = 1;; ++copy) {
@@ -72,7 +111,7 @@ QString store_picture(const Paths& paths, const QString& chosen_file, const QByt
         if (there && *there != content)
             continue;
         if (!there)
-            write_file(path, content);
+            files.write(path, content);
         return QFileInfo(path).fileName();
     }
 }
@@ -176,42 +215,41 @@ bool GlobalVariables::accepted()
     return true;
 }
 
-void GlobalVariables::store_logos()
+/// What others wrote into the files meanwhile stays, but for the fields that were altered here. Gives the options of
+/// all churches as they are now.
+SideRecord GlobalVariables::write_side_files(const std::array<Logo, 2>& logos, WrittenFiles& files) const
 {
-    for (Logo& chosen : m_logos) {
-        if (chosen.chosen_file.isEmpty())
-            continue;
-        chosen.name = store_picture(m_office->paths, chosen.chosen_file, chosen.content);
-        chosen.chosen_file.clear();
-    }
-}
-
-/// What others wrote into the files meanwhile stays, but for the fields that were altered here.
-void GlobalVariables::write_side_files()
-{
+    const auto& [of_all, of_workstation] = logos;
     const Paths& paths = m_office->paths;
     SideRecord common = read_now(paths, side_files::common);
     if (m_starts != m_stored_starts)
         common.set_number("starts_between_compactions", m_starts);
-    if (logo(LogoOf::all_churches).altered())
-        common.set_text("logo", logo_name(LogoOf::all_churches));
-    if (m_starts != m_stored_starts || logo(LogoOf::all_churches).altered())
-        write_side_file(paths, common);
-    SideRecord own = read_now(paths, side_files::workstation_logo);
-    if (logo(LogoOf::workstation).altered()) {
-        own.set_text("logo", logo_name(LogoOf::workstation));
-        write_side_file(paths, own);
+    if (of_all.altered())
+        common.set_text("logo", of_all.name);
+    if (m_starts != m_stored_starts || of_all.altered())
+        files.write(paths, common);
+    if (of_workstation.altered()) {
+        SideRecord own = read_now(paths, side_files::workstation_logo);
+        own.set_text("logo", of_workstation.name);
+        files.write(paths, own);
     }
-    m_office->side.common = common;
+    return common;
 }
 
 void GlobalVariables::write()
 {
-    store_logos();
+    WrittenFiles files;
+    auto logos = m_logos;
+    for (Logo& chosen : logos)
+        if (!chosen.chosen_file.isEmpty())
+            chosen.name = store_picture(m_office->paths, chosen.chosen_file, chosen.content, files);
+    const SideRecord common = write_side_files(logos, files);
     Transaction transaction(*m_office->session);
     m_draft.write(*m_office->session);
-    write_side_files();
     transaction.commit();
+    files.keep();
+    m_office->side.common = common;
+    m_logos = logos;
 }
 
 bool GlobalVariables::save()
@@ -224,12 +262,12 @@ bool GlobalVariables::save()
         m_office->dialogue.show({error.text()});
         return false;
     }
-    m_draft.follow(*m_office->session, m_office->settings);
     m_starts = m_stored_starts = m_office->side.common.number("starts_between_compactions");
     logo(LogoOf::all_churches).name = m_office->side.common.text("logo");
     for (Logo& saved : m_logos)
-        saved.stored_name = saved.name;
+        saved = {.name = saved.name, .stored_name = saved.name};
     m_office->logo = logo_in_use();
+    m_draft.follow(*m_office->session, m_office->settings);
     return true;
 }
 

@@ -8,6 +8,8 @@
 
 namespace kindrel::core {
 
+class WrittenFiles;
+
 enum class LogoOf { all_churches, workstation };
 
 inline constexpr int largest_pin_start = 999'999'999;
@@ -40,7 +42,8 @@ public:
     [[nodiscard]] QString logo_in_use() const;
 
     [[nodiscard]] bool altered() const;
-    /// Writes what was altered and gives it to the office. Nothing is written when any of it is refused.
+    /// Writes what was altered and gives it to the office. When any of it is refused or cannot be written, files and
+    /// database are as they were. Throws DatabaseError.
     [[nodiscard]] bool save();
     /// The stored order of day and month is not the one in use: it changes when the program is started again.
     [[nodiscard]] bool waits_for_next_start() const;
@@ -64,8 +67,7 @@ private:
     [[nodiscard]] Logo& logo(LogoOf whose) { return m_logos[static_cast<std::size_t>(whose)]; }
     [[nodiscard]] QString path_of(LogoOf whose) const;
     [[nodiscard]] bool accepted();
-    void store_logos();
-    void write_side_files();
+    [[nodiscard]] SideRecord write_side_files(const std::array<Logo, 2>& logos, WrittenFiles& files) const;
     void write();
 
     Office* m_office;

@@ -47,22 +47,44 @@ constexpr std::array lengths{
 };
 
 const QString size_refused = u"Please choose letters from %1 to %2 points high."_s;
-const QString head_too_high = u"The vision statement would take more than a third of every page of a report."_s;
-const QString foot_too_high = u"The lines at the foot would take more than a sixth of every page of a report."_s;
+const QString head_too_high = u"The vision statement would take more than a third of every %1 of a report."_s;
+const QString foot_too_high = u"The lines at the foot would take more than a sixth of every %1 of a report."_s;
 const QString make_room = u"Please shorten the text or choose smaller letters."_s;
 
-// Points, of the smallest page that reports are made for.
-constexpr double line_width = 520;
-constexpr double page_height = 792;
+/// In points, what both A4 and Letter have of a page that lies this way.
+struct PaperArea
+{
+    const char16_t* page;
+    double line_width, height;
+};
+constexpr std::array papers{
+    PaperArea{u"page", 511, 792},
+    PaperArea{u"landscape page", 708, 595},
+};
+constexpr double head_share = 1.0 / 3;
+constexpr double foot_share = 1.0 / 6;
+
+/// Without a size of its own the statement takes that of the report, which is hardly ever larger.
+constexpr int letters_of_reports = 11;
 
 /// An estimate that errs to the large side: there is nothing here to measure letters with.
-double height_of(const QString& text, int letters)
+double height_of(const QString& text, int chosen_letters, double line_width)
 {
+    const int letters = chosen_letters > 0 ? chosen_letters : letters_of_reports;
     const double across = letters * 0.55, down = letters * 1.25;
     double height = 0;
     for (const auto& line : text.split(u'\n'))
         height += down * std::max(1.0, std::ceil(double(line.size()) * across / line_width));
     return height;
+}
+
+/// The first way a page can lie on which the text would take more than its share; null when there is none.
+const PaperArea* too_small_for(const QString& text, int letters, double share)
+{
+    const auto small = std::ranges::find_if(papers, [&](const PaperArea& paper) {
+        return height_of(text, letters, paper.line_width) > paper.height * share;
+    });
+    return small == papers.end() ? nullptr : &*small;
 }
 
 const QString& head_text(const Settings& settings)
@@ -95,11 +117,15 @@ bool VisionSetup::accepted()
     if (m_draft.altered(u"vision_font_size") &&
         (wanted.vision_font_size < smallest_vision_letters || wanted.vision_font_size > largest_vision_letters))
         return refuse(u"vision_font_size", {size_refused.arg(smallest_vision_letters).arg(largest_vision_letters)});
-    if (wanted.Include_vision_reports && height_of(head_text(wanted), wanted.vision_font_size) > page_height / 3)
-        return refuse(wanted.church_vision.isEmpty() ? u"vision" : u"church_vision", {head_too_high, make_room});
+    const int letters = wanted.vision_font_size;
+    if (wanted.Include_vision_reports)
+        if (const auto* paper = too_small_for(head_text(wanted), letters, head_share))
+            return refuse(wanted.church_vision.isEmpty() ? u"vision" : u"church_vision",
+                          {head_too_high.arg(QStringView(paper->page)), make_room});
     const QString foot = wanted.footer_vision + u'\n' + wanted.footer_vision_line2;
-    if (wanted.include_vision_footer && height_of(foot, wanted.vision_font_size) > page_height / 6)
-        return refuse(u"footer_vision", {foot_too_high, make_room});
+    if (wanted.include_vision_footer)
+        if (const auto* paper = too_small_for(foot, letters, foot_share))
+            return refuse(u"footer_vision", {foot_too_high.arg(QStringView(paper->page)), make_room});
     m_faulty.clear();
     return true;
 }

@@ -11,7 +11,6 @@ using namespace Qt::StringLiterals;
 namespace {
 
 // Points.
-constexpr QSizeF logo_room(110, 36);
 constexpr qreal beside_logo = 12;
 constexpr qreal date_width = 130;
 constexpr qreal thin_line = 0.75;
@@ -62,7 +61,8 @@ Statement statement(const core::Settings& settings, const QString& text, const p
     return {text, style, alignment_of(settings.vision_alignment)};
 }
 
-Header header_of(const ReportInput& input, const QString& title, const pages::TypeScale& type)
+Header header_of(const ReportInput& input, const QString& title, const pages::TypeScale& type,
+                 const std::optional<pages::Picture>& logo)
 {
     const auto& office = input.office;
     const auto& settings = office.settings;
@@ -72,7 +72,7 @@ Header header_of(const ReportInput& input, const QString& title, const pages::Ty
     if (parts.church)
         header.church = office.church_name;
     if (parts.logo && !office.logo.isEmpty())
-        header.logo = pages::Picture::from_file(office.logo, logo_room);
+        header.logo = logo ? *logo : pages::Picture::from_file(office.logo, logo_room);
     if (parts.date)
         header.date = u"Report Date - "_s + core::Date::from(office.clock.today()).shown(office.day_order());
     if (parts.filters && !input.list.criteria.isEmpty())
@@ -163,11 +163,12 @@ void write_footer(pages::Writer& band, const Footer& footer, int number)
 
 void decorate(pages::Flow& flow, const QString& title, const ReportInput& input, const OwnBands& own)
 {
-    flow.set_header([header = header_of(input, title, flow.type()), own = own.header](pages::Writer& band, int number) {
-        write_header(band, header);
-        if (own)
-            own(band, number);
-    });
+    flow.set_header(
+        [header = header_of(input, title, flow.type(), own.logo), own = own.header](pages::Writer& band, int number) {
+            write_header(band, header);
+            if (own)
+                own(band, number);
+        });
     flow.set_footer([footer = footer_of(input, title, flow.type()), own = own.footer](pages::Writer& band, int number) {
         if (own)
             own(band, number);

@@ -1,13 +1,18 @@
 #pragma once
 
 #include "output/catalogue.h"
+#include "pages/picture.h"
 
 namespace kindrel::output {
 
-/// What a report adds to every page by itself: beneath the header and above the footer.
+/// The points that the logo has at the head of a page, at most.
+inline constexpr QSizeF logo_room(110, 36);
+
+/// What a report brings itself for every page: beneath the header and above the footer.
 struct OwnBands
 {
     pages::BandWriter header, footer;
+    std::optional<pages::Picture> logo = {}; ///< The office's, read already.
 };
 
 /// Gives every page of the flow its header and footer, as the church or the run has set them up: title, church and

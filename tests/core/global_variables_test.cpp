@@ -215,6 +215,56 @@ TEST_P(GlobalVariablesTest, WhenAFileCannotBeWrittenTheDatabaseKeepsItsOptions)
     EXPECT_FALSE(place->office.settings.American_date);
 }
 
+TEST_P(GlobalVariablesTest, AFailureLeavesFilesDatabaseAndOfficeAsTheyWere)
+{
+    struct Case
+    {
+        const char* what;
+        std::function<void()> fail, mend;
+        QString told; ///< Empty where the database fails.
+    };
+    const QString local = paths().folder(Folder::local_settings);
+    const Case cases[]{
+        {"the second file", [&] { QDir(local).removeRecursively(); }, [&] { QDir().mkpath(local); },
+         u"Unable to write '%1logo.dat': No such file or directory"_s.arg(local)},
+        {"the database",
+         [&] { session().execute(u"ALTER TABLE [tbl_startup] RENAME TO [tbl_away];"_s); },
+         [&] { session().execute(u"ALTER TABLE [tbl_away] RENAME TO [tbl_startup];"_s); },
+         {}},
+    };
+    SideRecord common(side_files::common);
+    common.set_text("logo", u"before.png"_s);
+    write_side_file(paths(), common);
+    place->office.side.common = common;
+    for (const auto& [what, fail, mend, told] : cases) {
+        SCOPED_TRACE(what);
+        auto variables = open();
+        const QString own = make_file(u"own.png"_s, "picture");
+        ASSERT_TRUE(variables.choose_logo(LogoOf::workstation, own, is_picture));
+        ASSERT_TRUE(variables.choose_logo(LogoOf::all_churches, make_file(u"all.png"_s, "picture 2"), is_picture));
+        variables.settings().title_logo = true;
+        fail();
+
+        if (told.isEmpty()) {
+            EXPECT_THROW(static_cast<void>(variables.save()), DatabaseError);
+        } else {
+            place->dialogue.expect_box(told);
+            EXPECT_FALSE(variables.save());
+        }
+
+        mend();
+        EXPECT_EQ(file(side_files::common).bytes(), common.bytes());
+        EXPECT_FALSE(read_side_file(paths(), side_files::workstation_logo));
+        EXPECT_EQ(QDir(paths().folder(Folder::images)).entryList(QDir::Files), QStringList());
+        EXPECT_FALSE(read_settings(session()).title_logo);
+        EXPECT_FALSE(place->office.settings.title_logo);
+        EXPECT_EQ(place->office.side.common.bytes(), common.bytes());
+        EXPECT_EQ(place->office.logo, QString());
+        EXPECT_EQ(variables.logo_in_use(), own) << "the choice is not lost";
+        EXPECT_TRUE(variables.altered());
+    }
+}
+
 TEST_P(GlobalVariablesTest, WithoutTheRightTheOptionsStayClosed)
 {
     place->grant_only({Area::security});

@@ -145,6 +145,40 @@ TEST_P(VisionSetupTest, WhatReportsCouldNotPrintIsRefusedAndNothingIsWritten)
     }
 }
 
+TEST_P(VisionSetupTest, WhatFitsAnUprightPageAloneIsRefused)
+{
+    auto head = open();
+    head.settings().Include_vision_reports = true;
+    head.settings().vision = QString(17, u'\n');
+    place->dialogue.expect_box(
+        u"The vision statement would take more than a third of every landscape page of a report."_s);
+    EXPECT_FALSE(head.save());
+
+    auto foot = open();
+    foot.settings().include_vision_footer = true;
+    foot.settings().vision_font_size = 40;
+    place->dialogue.expect_box(
+        u"The lines at the foot would take more than a sixth of every landscape page of a report."_s);
+    EXPECT_FALSE(foot.save());
+    EXPECT_EQ(foot.faulty(), u"footer_vision"_s);
+    EXPECT_FALSE(stored().Include_vision_reports || stored().include_vision_footer);
+}
+
+TEST_P(VisionSetupTest, LettersOfTheReportsOwnSizeCountAsElevenPoints)
+{
+    write_setting(session(), u"vision_font_size"_s, 0);
+    auto setup = open();
+    setup.settings().Include_vision_reports = true;
+    setup.settings().vision = QString(13, u'\n');
+    EXPECT_TRUE(setup.save());
+
+    setup.settings().vision += u'\n';
+    place->dialogue.expect_box(
+        u"The vision statement would take more than a third of every landscape page of a report."_s);
+    EXPECT_FALSE(setup.save());
+    EXPECT_EQ(stored().vision.count(u'\n'), 13);
+}
+
 TEST_P(VisionSetupTest, ALongStatementThatReportsDoNotPrintIsKept)
 {
     auto setup = open();

@@ -87,6 +87,21 @@ TEST_F(CataloguePageTest, AnOwnLayoutIsFoundOnEnteringAndOpensInAPreviewOnTheCho
     EXPECT_EQ(page.size.toSize(), QSize(612, 792));
 }
 
+TEST_F(CataloguePageTest, TheFirstReportIsChosenAndAnotherChoiceStaysOnEnteringAgain)
+{
+    open();
+    EXPECT_EQ(tree().chosen()->leaf, u"Directory 1"_s);
+    const int reports = tree().reports();
+    tree().choose(u"k13"_s);
+    core::write_file(desk().office.paths.folder(core::Folder::custom) + u"who.rpy"_s,
+                     "report per person\neach person\nline [surname]\n");
+
+    window().page()->entered();
+
+    EXPECT_EQ(tree().chosen()->leaf, u"Directory 4 (Landscape)"_s);
+    EXPECT_EQ(tree().reports(), reports + 1);
+}
+
 TEST_F(CataloguePageTest, AFaultyLayoutIsToldWhenItIsRunWithoutAPreviewAndNotBefore)
 {
     open("report per person\ntitle \"Broken\"\neach person\nline [no such field]\n");

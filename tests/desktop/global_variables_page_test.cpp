@@ -112,6 +112,24 @@ TEST_F(GlobalVariablesPageTest, ALogoIsChosenShownAndTakenAwayAgain)
     EXPECT_TRUE(visible_texts(window()).contains(u"The logo of all churches"_s));
 }
 
+TEST_F(GlobalVariablesPageTest, APictureIsReadAgainOnlyWhenItsFileWasWrittenTo)
+{
+    const QString name = make_picture(u"church.png"_s);
+    desktop::PictureFile logo({110, 36});
+    ASSERT_FALSE(logo.read(name).empty());
+    QFile file(name);
+    ASSERT_TRUE(file.open(QIODevice::ReadWrite));
+    const auto written = file.fileTime(QFileDevice::FileModificationTime);
+    file.write(QByteArray(file.size(), 'x'));
+    file.flush();
+
+    ASSERT_TRUE(file.setFileTime(written, QFileDevice::FileModificationTime));
+    EXPECT_FALSE(logo.read(name).empty());
+    ASSERT_TRUE(file.setFileTime(written.addSecs(1), QFileDevice::FileModificationTime));
+    EXPECT_TRUE(logo.read(name).empty());
+    EXPECT_FALSE(logo.read(make_picture(u"own.png"_s)).empty());
+}
+
 TEST_F(GlobalVariablesPageTest, AFileThatIsNoPictureIsRefused)
 {
     const QString letter = place.data.drive() + u"letter.png"_s;

@@ -50,17 +50,22 @@ protected:
     void save() { press(window(), Qt::Key_S, Qt::ControlModifier); }
     void close_page() { press(window(), Qt::Key_W, Qt::ControlModifier); }
     void other_tab() { press(window(), Qt::Key_PageDown, Qt::ControlModifier); }
+    [[nodiscard]] QTabWidget& tabs() { return child<QTabWidget>(window(), u"label_tabs"_s); }
     [[nodiscard]] bool in_page() { return window().page()->objectName() == u"label_setup"_s; }
     [[nodiscard]] QString stock_shown() { return child<QComboBox>(window(), u"label_stock"_s).currentText(); }
     [[nodiscard]] double shown(const QString& field) { return child<QDoubleSpinBox>(window(), field).value(); }
+    /// With its print, as it is once the picture had its moment.
     [[nodiscard]] desktop::SheetPicture& sheet(const QString& name = u"label_sheet"_s)
     {
-        return child<desktop::SheetPicture>(window(), name);
+        auto& picture = child<desktop::SheetPicture>(window(), name);
+        picture.draw_now();
+        return picture;
     }
     /// Where on the sheet the text begins, as it is printed.
-    [[nodiscard]] QPointF printed_at(const QString& text)
+    [[nodiscard]] QPointF printed_at(const QString& text) { return printed_at(text, *sheet().page()); }
+    [[nodiscard]] static QPointF printed_at(const QString& text, const pages::Page& page)
     {
-        for (const auto& item : sheet().print()->items)
+        for (const auto& item : page.items)
             if (const auto* line = std::get_if<pages::TextItem>(&item); line && line->text.trimmed() == text)
                 return line->at;
         return {-1, -1};
@@ -181,17 +186,19 @@ TEST_F(LabelSetupPageTest, TheLabelToStartAtIsChosenInThePictureByArrowsAndByMou
 TEST_F(LabelSetupPageTest, TheNameTagsShowTheChurchAndTheirBorderAsTicked)
 {
     other_tab();
-    auto& tags = sheet(u"tag_sheet"_s);
+    const auto texts = [this] {
+        return pages::texts_of(*sheet(u"tag_sheet"_s).page(), 1);
+    };
     const auto church = desk().office.church_name;
-    EXPECT_TRUE(pages::texts_of(*tags.print(), 1).contains(church));
+    EXPECT_TRUE(texts().contains(church));
     tab_to(u"tag_shows_church"_s);
     press(window(), Qt::Key_Space);
-    EXPECT_FALSE(pages::texts_of(*tags.print(), 1).contains(church));
-    EXPECT_TRUE(pages::texts_of(*tags.print(), 1).contains(u"Okafor"_s));
-    const auto unframed = tags.print()->items.size();
+    EXPECT_FALSE(texts().contains(church));
+    EXPECT_TRUE(texts().contains(u"Okafor"_s));
+    const auto unframed = sheet(u"tag_sheet"_s).page()->items.size();
     tab_to(u"tag_shows_border"_s);
     press(window(), Qt::Key_Space);
-    EXPECT_EQ(tags.print()->items.size(), unframed + 3) << "a frame for each of three people";
+    EXPECT_EQ(sheet(u"tag_sheet"_s).page()->items.size(), unframed + 3) << "a frame for each of three people";
     EXPECT_TRUE(stored().tags.shows_church) << "nothing is saved yet";
 }
 
@@ -242,6 +249,62 @@ TEST_F(LabelSetupPageTest, TheTestSheetShowsTheEdgesOfEveryLabelOfTheSheetAsItIs
     for (int place_on_sheet = 0; place_on_sheet < 10; ++place_on_sheet)
         EXPECT_EQ(frames[std::size_t(place_on_sheet)], grid.label(place_on_sheet)) << place_on_sheet;
     EXPECT_EQ(pages::texts_of(page, 1).join(u' '), u"1 2 3 4 5 6 7 8 9 10"_s);
+}
+
+TEST_F(LabelSetupPageTest, ThePrintWaitsAMomentAndUntilItIsSeen)
+{
+    const auto family = u"Ann & Ben Naismith"_s;
+    auto& picture = child<desktop::SheetPicture>(window(), u"label_sheet"_s);
+    const auto first = printed_at(family);
+
+    child<QSpinBox>(window(), u"label_start"_s).setValue(4);
+    EXPECT_EQ(printed_at(family, *picture.page()), first);
+    EXPECT_EQ(picture.accessibleName(), u"The sheet, starting at label 4 of 24"_s) << "the labels do not wait";
+
+    tabs().setCurrentIndex(1);
+    picture.draw_now();
+    EXPECT_EQ(printed_at(family, *picture.page()), first);
+    tabs().setCurrentIndex(0);
+    EXPECT_GT(printed_at(family).y(), first.y());
+}
+
+TEST_F(LabelSetupPageTest, APrintThatCannotBeMadeLeavesTheSheetEmptyWithoutABox)
+{
+    ASSERT_FALSE(sheet().empty());
+    place.in_database(u"DROP TABLE [tbl_people];"_s);
+
+    press(window(), Qt::Key_Down);
+
+    EXPECT_TRUE(sheet().empty());
+    EXPECT_EQ(sheet().fault(), QString());
+}
+
+TEST_F(LabelSetupPageTest, AStoredSheetThatCannotBePrintedIsToldInThePictureAlone)
+{
+    close_page();
+    auto record = desk().office.side.labels;
+    record.set_number("label_columns", 12);
+    core::write_side_file(desk().office.paths, record);
+
+    open();
+
+    EXPECT_TRUE(sheet().fault().startsWith("12 columns "_L1)) << sheet().fault().toStdString();
+    EXPECT_TRUE(sheet().empty());
+}
+
+TEST_F(LabelSetupPageTest, SavingKeepsAndShowsWhatAnotherWorkstationSavedMeanwhile)
+{
+    auto theirs = desk().office.side.labels;
+    theirs.set_number("tag_church_size", 14);
+    core::write_side_file(desk().office.paths, theirs);
+    choose(u"A4, 5 x 13, 38.1 x 21.2 mm"_s);
+
+    save();
+
+    EXPECT_FALSE(window().page()->altered());
+    EXPECT_EQ(child<QSpinBox>(window(), u"tag_church_size"_s).value(), 14);
+    EXPECT_EQ(stored().tags.church.size, 14);
+    EXPECT_EQ(stored().labels.grid.columns, 5);
 }
 
 TEST_F(LabelSetupPageTest, WhatAnotherWorkstationSavedMeanwhileIsShown)

@@ -3,7 +3,7 @@
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
-#include "pages/picture.h"
+#include "output/decoration.h"
 
 #include <QGridLayout>
 #include <QImage>
@@ -19,7 +19,6 @@ namespace {
 
 constexpr QSize picture_size{176, 72};
 constexpr int picture_frame = 6;
-constexpr QSizeF largest_print{110, 36}; ///< Points.
 
 struct LogoRow
 {
@@ -55,7 +54,7 @@ QPushButton* make_button(const char* text, const QString& icon_name, const QStri
 
 } // namespace
 
-LogoFields::LogoFields(QWidget* parent) : QWidget(parent), m_picture(make_picture())
+LogoFields::LogoFields(QWidget* parent) : QWidget(parent), m_picture(make_picture()), m_logo(output::logo_room)
 {
     auto* grid = new QGridLayout(this);
     grid->setContentsMargins(0, 0, 0, 0);
@@ -105,7 +104,7 @@ void LogoFields::show_logos(const core::GlobalVariables& variables)
 
 void LogoFields::show_picture(const QString& file)
 {
-    const auto image = file.isEmpty() ? QImage() : pages::Picture::from_file(file, largest_print).decoded();
+    const auto image = m_logo.read(file).decoded();
     if (image.isNull()) {
         m_picture->setText(u"No picture"_s);
         return;
@@ -118,7 +117,7 @@ void LogoFields::show_picture(const QString& file)
 
 bool is_picture(const QByteArray& content)
 {
-    return !pages::Picture::from_bytes(content, largest_print).empty();
+    return !pages::Picture::from_bytes(content, output::logo_room).empty();
 }
 
 } // namespace kindrel::desktop

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "core/global_variables.h"
+#include "desktop/output/head_picture.h"
 
 #include <QWidget>
 
@@ -28,6 +29,7 @@ private:
 
     std::array<QLabel*, 2> m_names{};
     QLabel* m_picture;
+    PictureFile m_logo;
 };
 
 /// Whether reports can show a file of this content.

@@ -4,6 +4,7 @@
 #include "output/decoration.h"
 #include "pages/flow.h"
 
+#include <QFileInfo>
 #include <QPainter>
 
 #include <algorithm>
@@ -24,7 +25,8 @@ const QString sample_title = u"Directory"_s;
 const QString sample_criteria = u"Active Families"_s;
 
 /// The page with nothing between head and foot.
-pages::Page decorated_page(core::Office& office, const core::Settings& settings, const QString& logo)
+pages::Page decorated_page(core::Office& office, const core::Settings& settings, const QString& logo,
+                           const pages::Picture& picture)
 {
     core::Office sample{.paths = office.paths,
                         .church_name = office.church_name,
@@ -37,7 +39,7 @@ pages::Page decorated_page(core::Office& office, const core::Settings& settings,
     list.criteria = sample_criteria;
     pages::PageSpool spool;
     pages::Flow flow(spool, {});
-    output::decorate(flow, sample_title, {sample, list});
+    output::decorate(flow, sample_title, {sample, list}, {.header = {}, .footer = {}, .logo = picture});
     flow.finish();
     return spool.page(1);
 }
@@ -71,7 +73,19 @@ Extent extent_of(const Other&)
 
 } // namespace
 
-HeadPicture::HeadPicture(core::Office& office, QWidget* parent) : QWidget(parent), m_office(office)
+const pages::Picture& PictureFile::read(const QString& file)
+{
+    const QFileInfo now(file);
+    const auto state = std::tuple(file, now.size(), now.lastModified());
+    if (state != m_state) {
+        m_state = state;
+        m_picture = file.isEmpty() ? pages::Picture() : pages::Picture::from_file(file, m_within);
+    }
+    return m_picture;
+}
+
+HeadPicture::HeadPicture(core::Office& office, QWidget* parent)
+    : QWidget(parent), m_office(office), m_logo(output::logo_room)
 {
     setObjectName(u"head_picture"_s);
     setAccessibleName(u"Head and foot of a report"_s);
@@ -81,7 +95,7 @@ HeadPicture::HeadPicture(core::Office& office, QWidget* parent) : QWidget(parent
 
 void HeadPicture::show_settings(const core::Settings& settings, const QString& logo)
 {
-    m_page = decorated_page(m_office, settings, logo);
+    m_page = decorated_page(m_office, settings, logo, settings.title_logo ? m_logo.read(logo) : pages::Picture());
     const qreal middle = m_page.size.height() / 2;
     qreal head_bottom = 0, foot_top = m_page.size.height();
     for (const auto& item : m_page.items) {

@@ -3,10 +3,28 @@
 #include "core/office.h"
 #include "pages/page.h"
 #include "pages/painter.h"
+#include "pages/picture.h"
 
+#include <QDateTime>
 #include <QWidget>
 
+#include <tuple>
+
 namespace kindrel::desktop {
+
+/// A picture that is shown again and again, but read anew only when its file is another one or was written to.
+class PictureFile
+{
+public:
+    explicit PictureFile(QSizeF within) : m_within(within) {}
+    /// By the whole path; no file gives an empty picture.
+    [[nodiscard]] const pages::Picture& read(const QString& file);
+
+private:
+    QSizeF m_within; ///< Points.
+    std::tuple<QString, qint64, QDateTime> m_state;
+    pages::Picture m_picture;
+};
 
 /// Head and foot of a report's page as settings that need not be saved yet would print them: two strips of paper.
 class HeadPicture : public QWidget
@@ -34,6 +52,7 @@ private:
     core::Office& m_office;
     pages::PagePainter m_painter;
     pages::Page m_page;
+    PictureFile m_logo;
     QRectF m_head, m_foot; ///< Parts of the page.
 };
 

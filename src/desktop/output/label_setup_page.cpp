@@ -82,7 +82,7 @@ LabelSetupPage::Tab LabelSetupPage::make_tags()
 
 LabelSetupPage::Tab LabelSetupPage::make_tab(const QString& prefix, output::LabelGrid& grid)
 {
-    const Tab tab{grid, new LabelFields(prefix, grid), new SheetPicture};
+    const Tab tab{grid, new LabelFields(prefix, grid), new SheetPicture(m_desk)};
     tab.picture->setObjectName(prefix + "sheet"_L1);
     connect(tab.fields, &LabelFields::edited, this, &LabelSetupPage::show_state);
     connect(tab.picture, &SheetPicture::start_chosen, this, [this, tab](int label) {
@@ -157,7 +157,9 @@ bool LabelSetupPage::save()
             lead_to_field(fault.field);
         return false;
     }
-    m_stored = m_setup;
+    m_stored = output::load_label_setup(m_desk.office);
+    if (m_setup != m_stored) // Another workstation changed other parts meanwhile.
+        show_stored();
     show_state();
     note().say(saved_note + (m_desk.office.shared() ? saved_for_others : QString()));
     return true;
@@ -166,11 +168,16 @@ bool LabelSetupPage::save()
 bool LabelSetupPage::leave()
 {
     return save_or_drop(m_desk.office.dialogue, save_question, [this] {
-        m_setup = m_stored;
-        for (const auto& tab : m_sheets)
-            tab.fields->show_values();
+        show_stored();
         show_state();
     });
+}
+
+void LabelSetupPage::show_stored()
+{
+    m_setup = m_stored;
+    for (const auto& tab : m_sheets)
+        tab.fields->show_values();
 }
 
 void LabelSetupPage::lead_to_field(const QString& name)
@@ -195,7 +202,7 @@ void LabelSetupPage::draw()
     if (fault)
         picture->show_fault(fault.text);
     else
-        picture->show_sheet(grid, output::first_page(shown_report(), {m_desk.office, m_list}));
+        picture->show_sheet(grid, shown_report(), m_list);
     set_status(fault ? QString() : u"%1 labels on a sheet"_s.arg(grid.labels()));
 }
 

@@ -50,6 +50,7 @@ private:
     void add_actions();
     [[nodiscard]] const Tab& shown() const;
     [[nodiscard]] output::ReportChoice shown_report() const;
+    void show_stored();
     void show_state();
     void draw();
     void open_test_sheet();

@@ -68,9 +68,17 @@ void ReportDrawing::paintEvent(QPaintEvent*)
     painter.setRenderHints(QPainter::Antialiasing | QPainter::SmoothPixmapTransform);
     painter.fillRect(place.translated(shadow, shadow), shadow_ink);
     painter.fillRect(place, Qt::white);
-    painter.setClipRect(place);
-    painter.translate(place.topLeft());
-    painter.scale(sheet.width() / m_page->size.width(), sheet.width() / m_page->size.width());
+    paint_page(painter, place);
+}
+
+void ReportDrawing::paint_page(QPainter& painter, const QRectF& paper)
+{
+    if (!m_page)
+        return;
+    const qreal scale = paper.width() / m_page->size.width();
+    painter.setClipRect(paper);
+    painter.translate(paper.topLeft());
+    painter.scale(scale, scale);
     m_painter.paint(painter, *m_page, 1);
 }
 

@@ -25,10 +25,14 @@ public:
     /// Draws at once what waits. A report that cannot be drawn leaves no picture: its run will say why.
     void draw_now();
     [[nodiscard]] bool empty() const { return !m_page; }
+    /// As it was drawn last.
+    [[nodiscard]] const std::optional<pages::Page>& page() const { return m_page; }
 
 protected:
     void paintEvent(QPaintEvent* event) override;
     void showEvent(QShowEvent* event) override;
+    /// Nothing while there is no page. `paper` has the page's shape.
+    void paint_page(QPainter& painter, const QRectF& paper);
 
 private:
     Desk& m_desk;

@@ -23,16 +23,15 @@ ReportTree::ReportTree(const core::Office& office, QWidget* parent) : QTreeWidge
         if (item->data(0, place_role).isValid())
             Q_EMIT wanted();
     });
-    fill();
-    choose(m_choices.empty() ? QString() : m_choices.front().key);
 }
 
 void ReportTree::reload()
 {
+    const bool first_time = m_choices.empty();
     const auto* before = chosen();
     const QString key = before ? before->key : QString();
     fill();
-    choose(key);
+    choose(first_time && !m_choices.empty() ? m_choices.front().key : key);
 }
 
 void ReportTree::fill()

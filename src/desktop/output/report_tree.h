@@ -7,7 +7,7 @@
 
 namespace kindrel::desktop {
 
-/// The families of reports with their leaves, the first one chosen.
+/// The families of reports with their leaves; empty until reload().
 class ReportTree : public QTreeWidget
 {
     Q_OBJECT
@@ -15,7 +15,7 @@ class ReportTree : public QTreeWidget
 public:
     explicit ReportTree(const core::Office& office, QWidget* parent = nullptr);
 
-    /// Looks again for the church's own layouts; the choice stays.
+    /// Looks for the church's own layouts as they are now. The choice stays; the first time it is the first report.
     void reload();
     [[nodiscard]] int reports() const { return int(m_choices.size()); }
     /// Null while none is.

@@ -7,7 +7,6 @@
 #include <QPainter>
 
 #include <map>
-#include <optional>
 
 namespace kindrel::desktop {
 
@@ -39,18 +38,19 @@ std::optional<int> led_to(int key, const output::LabelGrid& grid)
 
 } // namespace
 
-SheetPicture::SheetPicture(QWidget* parent) : QWidget(parent)
+SheetPicture::SheetPicture(Desk& desk, QWidget* parent) : ReportDrawing(desk, parent)
 {
     setFocusPolicy(Qt::StrongFocus);
     setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
     setToolTip(u"Click the label to start at, or choose it with the arrow keys"_s);
 }
 
-void SheetPicture::show_sheet(const output::LabelGrid& grid, std::optional<pages::Page> print)
+void SheetPicture::show_sheet(const output::LabelGrid& grid, const output::ReportChoice& report,
+                              const people::WorkingList& list)
 {
     m_grid = grid;
     m_fault.clear();
-    m_print = std::move(print);
+    show_report(&report, list, {});
     setAccessibleName(u"The sheet, starting at label %1 of %2"_s.arg(grid.start).arg(grid.labels()));
     update();
 }
@@ -58,7 +58,7 @@ void SheetPicture::show_sheet(const output::LabelGrid& grid, std::optional<pages
 void SheetPicture::show_fault(const QString& fault)
 {
     m_fault = fault;
-    m_print.reset();
+    show_report(nullptr, {}, {});
     setAccessibleName(fault);
     update();
 }
@@ -100,7 +100,7 @@ void SheetPicture::paintEvent(QPaintEvent*)
     painter.fillRect(sheet().translated(edge, edge), shadow_ink);
     painter.fillRect(sheet(), Qt::white);
     paint_labels(painter);
-    paint_print(painter);
+    paint_page(painter, sheet());
 }
 
 void SheetPicture::paint_labels(QPainter& painter) const
@@ -113,18 +113,6 @@ void SheetPicture::paint_labels(QPainter& painter) const
     painter.setBrush(Qt::NoBrush);
     painter.setPen(QPen(start_mark, hasFocus() ? 3 : 1.5));
     painter.drawRect(on_screen(m_grid.label(m_grid.start - 1)));
-}
-
-void SheetPicture::paint_print(QPainter& painter)
-{
-    if (!m_print)
-        return;
-    const QRectF paper = sheet();
-    const qreal scale = paper.width() / m_print->size.width();
-    painter.setClipRect(paper);
-    painter.translate(paper.topLeft());
-    painter.scale(scale, scale);
-    m_painter.paint(painter, *m_print, 1);
 }
 
 void SheetPicture::mousePressEvent(QMouseEvent* event)

@@ -1,29 +1,23 @@
 #pragma once
 
+#include "desktop/output/report_drawing.h"
 #include "output/labels/label_setup.h"
-#include "pages/page.h"
-#include "pages/painter.h"
-
-#include <QWidget>
-
-#include <optional>
 
 namespace kindrel::desktop {
 
-/// The first sheet of labels as it will be printed, with the edges of the labels. A click or the arrow keys choose the
-/// label that printing starts at.
-class SheetPicture : public QWidget
+/// The first sheet of labels as it will be printed, with the edges of the labels, which are there at once. A click or
+/// the arrow keys choose the label that printing starts at.
+class SheetPicture : public ReportDrawing
 {
     Q_OBJECT
 
 public:
-    explicit SheetPicture(QWidget* parent = nullptr);
+    explicit SheetPicture(Desk& desk, QWidget* parent = nullptr);
 
-    /// Without a print the sheet is empty.
-    void show_sheet(const output::LabelGrid& grid, std::optional<pages::Page> print);
+    /// `report` prints on the sheet; where it has nothing to print the sheet is empty.
+    void show_sheet(const output::LabelGrid& grid, const output::ReportChoice& report, const people::WorkingList& list);
     /// Why there is no sheet that could be shown.
     void show_fault(const QString& fault);
-    [[nodiscard]] const std::optional<pages::Page>& print() const { return m_print; }
     [[nodiscard]] const QString& fault() const { return m_fault; }
     /// The label's middle, counted from 1.
     [[nodiscard]] QPointF middle_of(int label) const { return on_screen(m_grid.label(label - 1)).center(); }
@@ -43,13 +37,10 @@ protected:
 private:
     [[nodiscard]] QRectF sheet() const;
     [[nodiscard]] QRectF on_screen(const QRectF& of_sheet) const;
-    void paint_print(QPainter& painter);
     void paint_labels(QPainter& painter) const;
 
     output::LabelGrid m_grid;
     QString m_fault;
-    std::optional<pages::Page> m_print;
-    pages::PagePainter m_painter;
 };
 
 } // namespace kindrel::desktop

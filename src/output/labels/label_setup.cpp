@@ -138,6 +138,55 @@ LabelFault fault_of(const LabelGrid& grid, const Direction& direction)
     return {};
 }
 
+LabelSetup read_setup(const core::SideRecord& record)
+{
+    return {{read_grid(record, "label_"), read_font(record, "label_name_"), read_font(record, "label_address_")},
+            {read_grid(record, "tag_"), read_font(record, "tag_given_name_"), read_font(record, "tag_surname_"),
+             read_font(record, "tag_church_"), record.flag("tag_shows_church"), record.flag("tag_shows_border")}};
+}
+
+void write_setup(core::SideRecord& record, const LabelSetup& setup)
+{
+    write_grid(record, "label_", setup.labels.grid);
+    write_font(record, "label_name_", setup.labels.name);
+    write_font(record, "label_address_", setup.labels.address);
+    write_grid(record, "tag_", setup.tags.grid);
+    write_font(record, "tag_given_name_", setup.tags.given_name);
+    write_font(record, "tag_surname_", setup.tags.surname);
+    write_font(record, "tag_church_", setup.tags.church);
+    record.set_flag("tag_shows_church", setup.tags.shows_church);
+    record.set_flag("tag_shows_border", setup.tags.shows_border);
+}
+
+template <class Value>
+Value merged(const Value& stored, const Value& before, const Value& after)
+{
+    return after == before ? stored : after;
+}
+
+/// The measures stay together, because those of two sheets would fit neither.
+LabelGrid merged(const LabelGrid& stored, const LabelGrid& before, const LabelGrid& after)
+{
+    auto grid = stored;
+    grid.start = before.start == after.start ? stored.start : std::min(after.start, stored.labels());
+    auto measures = after;
+    measures.start = before.start;
+    return measures == before ? grid : after;
+}
+
+/// `stored` with all that differs between the other two.
+LabelSetup merged(const LabelSetup& stored, const LabelSetup& before, const LabelSetup& after)
+{
+    const auto part = [&](auto sheet, auto field) {
+        return merged(stored.*sheet.*field, before.*sheet.*field, after.*sheet.*field);
+    };
+    constexpr auto labels = &LabelSetup::labels;
+    constexpr auto tags = &LabelSetup::tags;
+    return {{part(labels, &LabelSheet::grid), part(labels, &LabelSheet::name), part(labels, &LabelSheet::address)},
+            {part(tags, &TagSheet::grid), part(tags, &TagSheet::given_name), part(tags, &TagSheet::surname),
+             part(tags, &TagSheet::church), part(tags, &TagSheet::shows_church), part(tags, &TagSheet::shows_border)}};
+}
+
 /// A sheet or text of the setup, and what the names of its fields begin with.
 struct Part
 {
@@ -205,10 +254,7 @@ LabelFault fault_of(const LabelSetup& setup)
 
 LabelSetup load_label_setup(const core::Office& office)
 {
-    const auto& record = office.side.labels;
-    return {{read_grid(record, "label_"), read_font(record, "label_name_"), read_font(record, "label_address_")},
-            {read_grid(record, "tag_"), read_font(record, "tag_given_name_"), read_font(record, "tag_surname_"),
-             read_font(record, "tag_church_"), record.flag("tag_shows_church"), record.flag("tag_shows_border")}};
+    return read_setup(office.side.labels);
 }
 
 LabelSetup reload_label_setup(core::Office& office)
@@ -228,16 +274,10 @@ bool save_label_setup(core::Office& office, const LabelSetup& setup)
         office.dialogue.show({fault.text});
         return false;
     }
-    auto record = office.side.labels;
-    write_grid(record, "label_", setup.labels.grid);
-    write_font(record, "label_name_", setup.labels.name);
-    write_font(record, "label_address_", setup.labels.address);
-    write_grid(record, "tag_", setup.tags.grid);
-    write_font(record, "tag_given_name_", setup.tags.given_name);
-    write_font(record, "tag_surname_", setup.tags.surname);
-    write_font(record, "tag_church_", setup.tags.church);
-    record.set_flag("tag_shows_church", setup.tags.shows_church);
-    record.set_flag("tag_shows_border", setup.tags.shows_border);
+    const auto before = load_label_setup(office);
+    auto record = core::read_side_file(office.paths, core::side_files::labels).value_or(office.side.labels);
+    record.fill_blanks();
+    write_setup(record, merged(read_setup(record), before, setup));
     core::write_side_file(office.paths, record);
     office.side.labels = record;
     return true;

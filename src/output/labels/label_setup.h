@@ -67,8 +67,9 @@ struct LabelSetup
 /// As the file holds it, which another workstation may have written; the office has it from then on. Throws
 /// core::FileError.
 [[nodiscard]] LabelSetup reload_label_setup(core::Office& office);
-/// Writes the setup and gives it to the office. False when its numbers cannot be printed, which the person has been
-/// told, or may not be changed. Throws core::FileError when the file cannot be written.
+/// Writes the parts that differ from what the office holds, among those that other workstations wrote meanwhile, and
+/// gives the whole to the office. False when the setup's numbers cannot be printed, which the person has been told, or
+/// may not be changed. Throws core::FileError when the file cannot be written.
 [[nodiscard]] bool save_label_setup(core::Office& office, const LabelSetup& setup);
 
 /// Why something cannot be printed.

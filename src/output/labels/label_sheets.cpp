@@ -25,17 +25,24 @@ LabelSheets::LabelSheets(pages::Flow& flow, const LabelGrid& grid) : m_flow(flow
 
 void LabelSheets::add(const std::vector<pages::Item>& items)
 {
+    m_empty = false;
     if (m_place == m_grid.labels())
-        finish();
+        write_sheet();
     const auto corner = m_grid.label(m_place++).topLeft();
     for (const auto& item : items)
         m_items.push_back(pages::moved(item, corner));
 }
 
-void LabelSheets::finish()
+bool LabelSheets::finish()
 {
-    if (m_place > 0)
-        m_flow.write({.height = m_flow.setup().size().height(), .items = std::exchange(m_items, {})});
+    if (!m_empty)
+        write_sheet();
+    return !m_empty;
+}
+
+void LabelSheets::write_sheet()
+{
+    m_flow.write({.height = m_flow.setup().size().height(), .items = std::exchange(m_items, {})});
     m_place = 0;
 }
 
@@ -54,7 +61,7 @@ void write_test_sheet(const LabelGrid& grid, pages::PageSpool& spool)
             items.push_back(pages::moved(item, {0, (frame.height() - words.size.height()) / 2}));
         sheets.add(items);
     }
-    sheets.finish();
+    static_cast<void>(sheets.finish());
     flow.finish();
 }
 

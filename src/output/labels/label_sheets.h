@@ -23,13 +23,16 @@ public:
     [[nodiscard]] QSizeF label_size() const { return m_grid.label(0).size(); }
     /// The items count from the label's upper left corner.
     void add(const std::vector<pages::Item>& items);
-    /// Writes the sheet begun last.
-    void finish();
+    /// Writes the sheet begun last. False when there was no label, and so there is no sheet.
+    [[nodiscard]] bool finish();
 
 private:
+    void write_sheet();
+
     pages::Flow& m_flow;
     LabelGrid m_grid;
     int m_place;
+    bool m_empty = true;
     std::vector<pages::Item> m_items;
 };
 

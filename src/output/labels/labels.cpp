@@ -127,38 +127,53 @@ private:
     pages::TextMetrics& m_metrics;
 };
 
-bool write_labels(const ReportInput& input, const LabelSheet& sheet, core::Progress& progress, pages::Flow& flow)
+/// How a run came out. What was refused has been told; that there is nobody to print has not.
+enum class Outcome { whole, cancelled_or_refused, nobody };
+
+Outcome finished(LabelSheets& sheets)
+{
+    return sheets.finish() ? Outcome::whole : Outcome::nobody;
+}
+
+bool told(const ReportInput& input, Outcome outcome)
+{
+    if (outcome == Outcome::nobody)
+        input.office.dialogue.show({u"No people found for creating a report"_s});
+    return outcome == Outcome::whole;
+}
+
+Outcome write_labels(const ReportInput& input, const LabelSheet& sheet, core::Progress& progress, pages::Flow& flow)
 {
     if (!is_printable(input, sheet.grid))
-        return false;
+        return Outcome::cancelled_or_refused;
     LabelSheets sheets(flow, sheet.grid);
     const auto room = padded(sheets.label_size(), label_padding);
     const auto write = [&](const ListedFamily& listed) {
+        if (listed.household.adults.empty() && listed.household.children.empty())
+            return; // Those on the list have left the family.
         std::vector<pages::Item> items;
         const auto texts = label_texts(listed, sheet, input);
         add_centred(items, fitted(texts, room.size(), pages::Align::left, flow.metrics()), room);
         sheets.add(items);
     };
     if (!for_each_family(input, progress, write, people::Part::address))
-        return false;
-    sheets.finish();
-    return true;
+        return Outcome::cancelled_or_refused;
+    return finished(sheets);
 }
 
-bool write_tags(const ReportInput& input, const TagSheet& tags, TagBars bars, core::Progress& progress,
-                pages::Flow& flow)
+Outcome write_tags(const ReportInput& input, const TagSheet& tags, TagBars bars, core::Progress& progress,
+                   pages::Flow& flow)
 {
     if (!is_printable(input, tags.grid))
-        return false;
+        return Outcome::cancelled_or_refused;
     LabelSheets sheets(flow, tags.grid);
     const TagPainter painter(input, tags, bars, flow.metrics());
     const auto write = [&](const ListedMember& listed) {
         sheets.add(painter.tag(listed, sheets.label_size()));
     };
     if (!for_each_person(input, progress, write, {}))
-        return false;
-    sheets.finish();
-    return true;
+        return Outcome::cancelled_or_refused;
+    return finished(sheets);
 }
 
 constexpr auto family_name = "Labels";
@@ -188,14 +203,15 @@ constexpr std::array reports{
                      name_tags_printable},
 };
 
-using WriteSheets = std::function<bool(const ReportInput&, core::Progress&, pages::Flow&)>;
+using WriteSheets = std::function<Outcome(const ReportInput&, core::Progress&, pages::Flow&)>;
 
 ReportChoice report_on(const LabelGrid& grid, const ReportDefinition& like, WriteSheets write)
 {
     const auto run = [grid, write = std::move(write)](const ReportInput& input, core::Progress& progress,
                                                       pages::PageSpool& spool) {
         pages::Flow flow(spool, sheet_page(grid));
-        if (!core::permitted(input.office, core::Area::report_outputs) || !write(input, progress, flow))
+        if (!core::permitted(input.office, core::Area::report_outputs) ||
+            write(input, progress, flow) != Outcome::whole)
             return false;
         flow.finish();
         return true;
@@ -215,13 +231,13 @@ ReportChoice report_on(const LabelGrid& grid, const ReportDefinition& like, Writ
 
 bool write_mailing_labels(const ReportInput& input, const void*, core::Progress& progress, pages::Flow& flow)
 {
-    return write_labels(input, load_label_setup(input.office).labels, progress, flow);
+    return told(input, write_labels(input, load_label_setup(input.office).labels, progress, flow));
 }
 
 bool write_name_tags(const ReportInput& input, const void* layout, core::Progress& progress, pages::Flow& flow)
 {
     const auto bars = static_cast<const NameTagLayout*>(layout)->bars;
-    return write_tags(input, load_label_setup(input.office).tags, bars, progress, flow);
+    return told(input, write_tags(input, load_label_setup(input.office).tags, bars, progress, flow));
 }
 
 ReportChoice mailing_labels_on(const LabelSheet& sheet)

@@ -17,7 +17,8 @@ struct NameTagLayout
 };
 static_assert(std::is_standard_layout_v<NameTagLayout>);
 
-/// A label for each family of the list; one whose address is not known or hidden gets its names alone.
+/// A label for each family of which the list still names somebody; one whose address is not known or hidden gets its
+/// names alone.
 [[nodiscard]] bool write_mailing_labels(const ReportInput& input, const void* layout, core::Progress& progress,
                                         pages::Flow& flow);
 /// A tag for each person of the list. `layout` is a NameTagLayout.
@@ -31,7 +32,8 @@ static_assert(std::is_standard_layout_v<NameTagLayout>);
 [[nodiscard]] bool mailing_labels_printable(const core::Office& office);
 [[nodiscard]] bool name_tags_printable(const core::Office& office);
 
-/// The reports on sheets that need not be those of the office, nor saved. They are not part of the report tree.
+/// The reports on sheets that need not be those of the office, nor saved, for their pictures: where there is nobody to
+/// print they leave no page and say nothing. They are not part of the report tree.
 [[nodiscard]] ReportChoice mailing_labels_on(const LabelSheet& sheet);
 [[nodiscard]] ReportChoice name_tags_on(const TagSheet& sheet);
 

@@ -54,8 +54,11 @@ void write_phones(pages::Writer& place, const ListedFamily& listed)
     const auto& address = listed.family.address();
     place.caption(u"Family Ph: "_s, address.phone);
     place.caption(u"Family Mobile: "_s, address.family_mobile);
-    for (const auto* person : listed.people())
-        place.caption(listed.family.name(*person) + u"  Mobile: "_s, person->mobile_phone);
+    for (const auto* person : listed.people()) {
+        const auto name = listed.family.name(*person);
+        place.caption(name + u"  Mobile: "_s, person->mobile_phone);
+        place.caption(name + u"  Business Phone: "_s, person->business_phone);
+    }
 }
 
 pages::TableStyle entry_style()

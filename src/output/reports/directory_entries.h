@@ -10,7 +10,7 @@ namespace kindrel::output {
 void write_side_by_side(pages::Flow& flow, const ListedFamily& listed);
 /// The same beneath each other.
 void write_stacked(pages::Flow& flow, const ListedFamily& listed);
-/// Names and address, beside them the family's phone, its mobile and the mobiles of its people.
+/// Names and address, beside them the phones and mobiles of the family and of its people.
 void write_with_phones(pages::Flow& flow, const ListedFamily& listed);
 /// Address and contacts of the family, beside them its people with theirs.
 void write_with_details(pages::Flow& flow, const ListedFamily& listed);

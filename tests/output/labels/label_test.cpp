@@ -149,6 +149,40 @@ TEST_F(LabelTest, AFullSheetIsNotFollowedByAnEmptyOne)
     EXPECT_EQ(sheets().size(), 1u);
 }
 
+TEST_F(LabelTest, WhereNobodyOfTheListIsLeftThereIsNoSheet)
+{
+    add_many(2);
+    for (const auto& table : {u"tbl_people"_s, u"tbl_surname"_s}) {
+        office.session->execute(u"DELETE FROM [%1];"_s.arg(table));
+        for (const auto key : {u"k60", u"k61"}) {
+            for (const int start : {1, 5}) {
+                auto grid = output::load_label_setup(office).labels.grid;
+                grid.start = start;
+                use(grid);
+                choose(key);
+                dialogue.expect_box(u"No people found for creating a report"_s);
+                pages::PageSpool spool;
+
+                EXPECT_FALSE(run(spool));
+
+                EXPECT_EQ(spool.page_count(), 0);
+                dialogue.verify();
+            }
+        }
+    }
+}
+
+TEST_F(LabelTest, AFamilyThatTheListedPeopleHaveLeftGetsNoLabel)
+{
+    add({family(u"Left"_s, {u"Ann"_s}), family(u"Naismith"_s, {u"Ben"_s})});
+    office.session->execute(u"DELETE FROM [tbl_people] WHERE [Surname_ID]=?;"_s, list.members.front().surname_id);
+    choose(u"k60");
+
+    const auto page = sheets().front();
+
+    EXPECT_EQ(words_in(page, output::load_label_setup(office).labels.grid.label(0)), u"Ben Naismith"_s);
+}
+
 TEST_F(LabelTest, ALabelHoldsTheFamilysNamesAndTheAddressThatPostGoesTo)
 {
     struct Case
@@ -277,6 +311,42 @@ TEST_F(LabelTest, ASavedSetupIsReadBackFromTheFile)
 
     office.side.labels = *core::read_side_file(office.paths, core::side_files::labels);
     EXPECT_EQ(output::load_label_setup(office), setup);
+}
+
+TEST_F(LabelTest, OfTwoWorkstationsEachSavesOnlyWhatItChanged)
+{
+    const auto opened_by_both = office.side.labels;
+    auto mine = output::load_label_setup(office), theirs = mine;
+    mine.labels.grid = output::label_stocks()[5].grid;
+    mine.labels.name.italic = true;
+    theirs.labels.address.size = 8;
+    theirs.tags.grid.start = 4;
+    theirs.tags.shows_border = true;
+    ASSERT_TRUE(output::save_label_setup(office, theirs));
+    office.side.labels = opened_by_both;
+
+    ASSERT_TRUE(output::save_label_setup(office, mine));
+
+    auto both = theirs;
+    both.labels.grid = mine.labels.grid;
+    both.labels.name = mine.labels.name;
+    EXPECT_EQ(output::load_label_setup(office), both);
+    EXPECT_EQ(output::reload_label_setup(office), both);
+}
+
+TEST_F(LabelTest, ALabelToStartAtStaysOnTheSheetThatAnotherWorkstationChose)
+{
+    const auto opened_by_both = office.side.labels;
+    auto mine = output::load_label_setup(office), theirs = mine;
+    mine.labels.grid.start = 20;
+    theirs.labels.grid = output::label_stocks()[3].grid;
+    ASSERT_TRUE(output::save_label_setup(office, theirs));
+    office.side.labels = opened_by_both;
+
+    ASSERT_TRUE(output::save_label_setup(office, mine));
+
+    theirs.labels.grid.start = 8;
+    EXPECT_EQ(output::load_label_setup(office), theirs);
 }
 
 TEST_F(LabelTest, NumbersThatCannotBePrintedAreRefusedAndNothingIsWritten)

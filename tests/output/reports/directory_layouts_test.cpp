@@ -47,7 +47,7 @@ TEST_F(DirectoryLayoutsTest, EachDirectoryPrintsItsOwnPartOfTheFamilyInItsOrder)
     const std::string plain = "Naismith | Ann & Ben | Cid | 12 Long Street | suburb 1 3000 | Family Ph: 9555 1234 | "
                               "Family Mobile: 0411 222 | Family Email: n@example.org";
     const std::string phones = "Naismith | Ann & Ben | Cid | 12 Long Street | suburb 1 3000 | Family Ph: 9555 1234 | "
-                               "Family Mobile: 0411 222 | Ann  Mobile: 0412 333";
+                               "Family Mobile: 0411 222 | Ann  Mobile: 0412 333 | Ann  Business Phone: 9555 9";
     const std::string details =
         "Naismith | 12 Long Street | suburb 1 3000 | Family Ph: 9555 1234 | "
         "Family Mobile: 0411 222 | Family Email: n@example.org | Ann | Birth Date: 12/05/XXXX | "
