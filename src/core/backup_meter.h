@@ -1,6 +1,6 @@
 #pragma once
 
-#include "core/progress.h"
+#include "core/progress_run.h"
 
 #include <algorithm>
 
@@ -9,23 +9,6 @@ namespace kindrel::core {
 /// The person gave up a long run. Thrown and caught inside the engine: what was begun is taken away on the way.
 struct Cancelled
 {
-};
-
-/// Begins a long run and ends it, however it goes.
-class ProgressRun
-{
-public:
-    ProgressRun(Progress& progress, const QString& what, int steps, const QString& cancel_question)
-        : m_progress(progress)
-    {
-        m_progress.begin(what, steps, cancel_question);
-    }
-    ProgressRun(const ProgressRun&) = delete;
-    ProgressRun& operator=(const ProgressRun&) = delete;
-    ~ProgressRun() { m_progress.end(); }
-
-private:
-    Progress& m_progress;
 };
 
 /// Turns amounts of bytes into `meter_steps` steps of a progress.

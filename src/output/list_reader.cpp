@@ -1,5 +1,7 @@
 #include "output/list_reader.h"
 
+#include "core/progress_run.h"
+
 #include <QHash>
 
 #include <algorithm>
@@ -17,28 +19,13 @@ constexpr std::size_t first_chunk = 200;
 constexpr std::size_t growth = 4;
 constexpr std::size_t largest_chunk = 3200;
 
-/// Ends the progress however the run ends.
-class ReportRun
-{
-public:
-    ReportRun(core::Progress& progress, int steps) : m_progress(progress)
-    {
-        m_progress.begin(u"Creating report"_s, steps, u"Are you sure that you wish to cancel this report?"_s);
-    }
-    ~ReportRun() { m_progress.end(); }
-    ReportRun(const ReportRun&) = delete;
-    ReportRun& operator=(const ReportRun&) = delete;
-
-private:
-    core::Progress& m_progress;
-};
-
 /// Hands the keys chunk by chunk to `read` and then each place to `write`, which gets what was read of its chunk. False
 /// when cancelled.
 template <class Key, class Read, class Write>
 bool in_chunks(std::span<const Key> keys, core::Progress& progress, const Read& read, const Write& write)
 {
-    const ReportRun run(progress, static_cast<int>(keys.size()));
+    const core::ProgressRun run(progress, u"Creating report"_s, static_cast<int>(keys.size()),
+                                u"Are you sure that you wish to cancel this report?"_s);
     std::size_t size = first_chunk;
     for (std::size_t first = 0; first < keys.size(); first += size, size = std::min(size * growth, largest_chunk)) {
         size = std::min(size, keys.size() - first);

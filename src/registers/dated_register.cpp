@@ -26,11 +26,6 @@ const QString other_date_exists =
     u"Unable to change to this date as it already exists, please choose a date which has not been used yet."_s;
 const QString date_removed = u"This date has been removed by another user."_s;
 
-QString named(const char16_t* name)
-{
-    return u'[' + QString::fromUtf16(name) + u']';
-}
-
 /// The weekday, from 1 for Monday, of more than half of the dates; 0 when there is none.
 int usual_weekday(const std::vector<RegisterDate>& dates)
 {
@@ -86,10 +81,12 @@ bool DatedRegister::may_work() const
 
 bool DatedRegister::enter()
 {
+    m_none_set_up = false;
     if (!may_work())
         return false;
     m_projects = read_projects(session(), m_kind);
-    if (m_projects.empty())
+    m_none_set_up = m_projects.empty();
+    if (m_none_set_up)
         return refuse(QString::fromUtf16(m_kind.no_projects));
     m_project = remembered_project(session(), m_kind, Page::entry);
     refresh_dates();
@@ -221,7 +218,7 @@ bool DatedRegister::settle()
         return false;
     if (*answer)
         return save();
-    load_rows();
+    drop_rows();
     return true;
 }
 
@@ -356,6 +353,13 @@ bool DatedRegister::refuse_standing(Standing standing)
     return false;
 }
 
+void DatedRegister::commit_marked(core::Transaction& transaction)
+{
+    auto mark = stored_mark();
+    transaction.commit();
+    m_mark = std::move(mark);
+}
+
 bool DatedRegister::save()
 {
     if (!m_open)
@@ -368,13 +372,12 @@ bool DatedRegister::save()
         found = standing();
         if (found == Standing::good) {
             save_rows();
-            transaction.commit();
+            commit_marked(transaction);
         }
     }
     if (found != Standing::good)
         return refuse_standing(found);
-    m_mark = stored_mark();
-    load_rows();
+    keep_rows();
     return true;
 }
 
@@ -393,7 +396,7 @@ bool DatedRegister::update_date(const core::Date& date, Standing& found)
             throw;
         return false;
     }
-    transaction.commit();
+    commit_marked(transaction);
     return true;
 }
 
@@ -409,7 +412,6 @@ bool DatedRegister::change_date(const core::Date& date)
     if (!update_date(date, found))
         return found == Standing::good ? refuse(other_date_exists) : refuse_standing(found);
     m_open->date = date;
-    m_mark = stored_mark();
     refresh_dates();
     date_moved();
     return true;

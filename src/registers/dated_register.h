@@ -32,6 +32,8 @@ public:
 
     /// Reads the projects and chooses the one last worked in. Comes before everything else.
     [[nodiscard]] virtual bool enter();
+    /// Whether the last enter() found that no project is set up, rather than that it could not read them.
+    [[nodiscard]] bool none_set_up() const { return m_none_set_up; }
     [[nodiscard]] const std::vector<Project>& projects() const { return m_projects; }
     /// The key of the chosen project; 0 before entering.
     [[nodiscard]] int project() const { return m_project; }
@@ -64,10 +66,14 @@ public:
     [[nodiscard]] bool leave();
 
 protected:
-    /// Of the open date, outside of any transaction; also after each save.
+    /// Of the open date, outside of any transaction.
     virtual void load_rows() = 0;
     /// Of the open date, inside the transaction. What is in memory must not change.
     virtual void save_rows() = 0;
+    /// What stands in memory is stored now. Neither this nor dropping reads anything.
+    virtual void keep_rows() = 0;
+    /// What was typed since the rows were loaded or kept is forgotten.
+    virtual void drop_rows() = 0;
     /// No date is open any more.
     virtual void clear_rows() = 0;
     /// The open date has got another day; what was typed stays.
@@ -108,11 +114,14 @@ private:
     [[nodiscard]] Standing standing();
     [[nodiscard]] bool refuse_standing(Standing standing);
     [[nodiscard]] QByteArray stored_mark();
+    /// Takes the mark of what was written before anybody else can write.
+    void commit_marked(core::Transaction& transaction);
     [[nodiscard]] QString holders(const HeldWords& words) const;
 
     core::Office& m_office;
     const RegisterKind& m_kind;
     std::vector<Project> m_projects;
+    bool m_none_set_up = false;
     int m_project = 0;
     std::vector<RegisterDate> m_dates;
     std::optional<RegisterDate> m_open;

@@ -65,6 +65,11 @@ QString money(core::Amount amount, bool zero_before_point)
 
 } // namespace
 
+QString kind_name(FigureKind kind)
+{
+    return kind == FigureKind::attendance ? u"Attendance"_s : u"$ Amount"_s;
+}
+
 TypedFigure read_figure(QStringView typed, FigureKind kind)
 {
     const bool counts = kind == FigureKind::attendance;

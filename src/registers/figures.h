@@ -14,6 +14,9 @@ struct TypedFigure
     QString refusal;
 };
 
+/// "Attendance" or "$ Amount", as headings name it.
+[[nodiscard]] QString kind_name(FigureKind kind);
+
 /// Attendance in whole numbers, money to the cent, both from 0 to 99999. A dollar sign before money and commas between
 /// thousands may be typed. An attendance of 0 is shown as nothing and is no figure.
 [[nodiscard]] TypedFigure read_figure(QStringView typed, FigureKind kind);

@@ -2,6 +2,7 @@
 
 #include "core/entry.h"
 #include "core/open_church.h"
+#include "registers/register_kind.h"
 
 #include <algorithm>
 #include <array>
@@ -47,11 +48,6 @@ bool may_work(const core::Office& office, const NotesTable& table)
 {
     return (core::may_enter(office, table.entry) || core::permitted(office, table.right)) &&
            core::network_guard(office);
-}
-
-QString named(const char16_t* name)
-{
-    return u'[' + QString::fromUtf16(name) + u']';
 }
 
 /// The stored note; nullopt when the date is gone.

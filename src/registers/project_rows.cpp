@@ -19,11 +19,6 @@ using core::to_value;
 using core::Value;
 using Items = std::vector<ProjectItem>;
 
-QString named(const char16_t* name)
-{
-    return u'[' + QString::fromUtf16(name) + u']';
-}
-
 /// The fields of `tbl_roll_setup` that setup writes: services, absences and include flags, in this order.
 QStringList setup_fields()
 {
@@ -89,11 +84,6 @@ void read_roll_setup(Session& session, Items& items)
     }
 }
 
-std::vector<CategoryItem>& categories_of(ProjectItem& item, FigureKind kind)
-{
-    return kind == FigureKind::attendance ? item.attendance : item.finance;
-}
-
 void read_weekly_categories(Session& session, Items& items)
 {
     const auto places = by_key(items);
@@ -101,7 +91,7 @@ void read_weekly_categories(Session& session, Items& items)
                                "ORDER BY [weekly_project_id],[group_type],[position],[group_id];"_s);
     for (const core::Row& row : rows) {
         if (auto* item = places.value(row.integer(Column{0})))
-            categories_of(*item, static_cast<FigureKind>(row.integer(Column{3})))
+            item->categories(static_cast<FigureKind>(row.integer(Column{3})))
                 .push_back({row.integer(Column{1}), row.text(Column{2})});
     }
 }

@@ -66,11 +66,6 @@ bool all_empty(const auto& names)
     return std::ranges::all_of(names, &QString::isEmpty);
 }
 
-std::vector<CategoryItem>& categories_of(ProjectItem& item, FigureKind kind)
-{
-    return kind == FigureKind::attendance ? item.attendance : item.finance;
-}
-
 bool holds(const std::vector<CategoryItem>& categories, int index)
 {
     return index >= 0 && index < std::ssize(categories);
@@ -174,26 +169,45 @@ bool ProjectSetup::roll_chosen(int project) const
            refuse(u"You need to select a Roll project before adding any information to it"_s);
 }
 
-bool ProjectSetup::set_service(int project, int place, const QString& name)
+bool ProjectSetup::may_empty(QStringView what, const QString& name, const QString& told) const
+{
+    return told.isEmpty() ||
+           m_office.dialogue.confirm(
+               {.text =
+                    u"Please confirm that you wish to remove this %1 '%2'. Do you wish to continue?"_s.arg(what, name),
+                .more = told,
+                .icon = core::Icon::question},
+               Answer::no);
+}
+
+template <std::size_t Count>
+bool ProjectSetup::set_name(int project, int place, const QString& name, const RollPart<Count>& part)
 {
     if (!roll_chosen(project))
         return false;
+    const auto& item = list(Kind::roll)[project];
+    const auto& names = item.*part.names;
+    const auto& before = names.at(static_cast<std::size_t>(place));
     const auto tidied = people::tidy(name);
-    if (!tidied.isEmpty() && !fits(tidied, others_of(list(Kind::roll)[project].services, place)))
+    if (!tidied.isEmpty() && !fits(tidied, others_of(names, place)))
         return false;
-    change(Kind::roll, project, [&](ProjectItem& item) { item.services.at(static_cast<std::size_t>(place)) = tidied; });
+    if (tidied.isEmpty() && !before.isEmpty() &&
+        !may_empty(part.what, before, part.told(*m_office.session, item.key, place + 1)))
+        return false;
+    change(Kind::roll, project,
+           [&](ProjectItem& changed) { (changed.*part.names).at(static_cast<std::size_t>(place)) = tidied; });
     return true;
+}
+
+bool ProjectSetup::set_service(int project, int place, const QString& name)
+{
+    return set_name<service_count>(project, place, name, {u"service", &ProjectItem::services, told_without_service});
 }
 
 bool ProjectSetup::set_absence(int project, int place, const QString& name)
 {
-    if (!roll_chosen(project))
-        return false;
-    const auto tidied = people::tidy(name);
-    if (!tidied.isEmpty() && !fits(tidied, others_of(list(Kind::roll)[project].absences, place)))
-        return false;
-    change(Kind::roll, project, [&](ProjectItem& item) { item.absences.at(static_cast<std::size_t>(place)) = tidied; });
-    return true;
+    return set_name<absence_count>(project, place, name,
+                                   {u"reason for being absent", &ProjectItem::absences, told_without_absence});
 }
 
 bool ProjectSetup::set_include(int project, int place, bool include)
@@ -214,8 +228,7 @@ bool ProjectSetup::weekly_chosen(int project) const
 
 const std::vector<CategoryItem>& ProjectSetup::categories(int project, FigureKind kind) const
 {
-    const auto& item = list(Kind::weekly)[project];
-    return kind == FigureKind::attendance ? item.attendance : item.finance;
+    return list(Kind::weekly)[project].categories(kind);
 }
 
 bool ProjectSetup::add_category(int project, FigureKind kind, const QString& name)
@@ -230,7 +243,7 @@ bool ProjectSetup::add_category(int project, FigureKind kind, const QString& nam
         return refuse(u"A weekly project can have no more than %1 categories"_s.arg(most_categories));
     if (!fits(tidied, names_of(categories(project, kind))))
         return false;
-    change(Kind::weekly, project, [&](ProjectItem& changed) { categories_of(changed, kind).push_back({0, tidied}); });
+    change(Kind::weekly, project, [&](ProjectItem& changed) { changed.categories(kind).push_back({0, tidied}); });
     return true;
 }
 
@@ -246,7 +259,7 @@ bool ProjectSetup::rename_category(int project, FigureKind kind, int index, cons
     if (!fits(tidied, names_of(categories(project, kind), index)))
         return false;
     change(Kind::weekly, project,
-           [&](ProjectItem& item) { categories_of(item, kind).at(static_cast<std::size_t>(index)).name = tidied; });
+           [&](ProjectItem& item) { item.categories(kind).at(static_cast<std::size_t>(index)).name = tidied; });
     return true;
 }
 
@@ -266,7 +279,7 @@ bool ProjectSetup::remove_category(int project, FigureKind kind, int index)
     if (!m_office.dialogue.confirm(question, Answer::no))
         return false;
     change(Kind::weekly, project, [&](ProjectItem& item) {
-        auto& changed = categories_of(item, kind);
+        auto& changed = item.categories(kind);
         changed.erase(changed.begin() + index);
     });
     return true;
@@ -281,7 +294,7 @@ bool ProjectSetup::move_category(int project, FigureKind kind, int index, bool u
         return refuse(choose_to_move);
     if (!(up ? moved.move_up(index) : moved.move_down(index)))
         return refuse(up ? highest : lowest);
-    change(Kind::weekly, project, [&](ProjectItem& item) { categories_of(item, kind) = moved.items(); });
+    change(Kind::weekly, project, [&](ProjectItem& item) { item.categories(kind) = moved.items(); });
     return true;
 }
 
@@ -321,6 +334,12 @@ bool ProjectSetup::check()
 bool ProjectSetup::altered() const
 {
     return std::ranges::any_of(m_lists, &ProjectList::altered);
+}
+
+void ProjectSetup::drop()
+{
+    for (auto& projects : m_lists)
+        projects = ProjectList(projects.stored());
 }
 
 bool ProjectSetup::write(const AllItems& items)

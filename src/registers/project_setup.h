@@ -38,6 +38,15 @@ struct ProjectItem
     std::array<bool, absence_count> include{};     ///< Whether the absence counts as an attendance in analyses.
     std::vector<CategoryItem> attendance, finance; ///< The categories of a weekly project, each kind in its order.
 
+    [[nodiscard]] std::vector<CategoryItem>& categories(FigureKind kind)
+    {
+        return kind == FigureKind::attendance ? attendance : finance;
+    }
+    [[nodiscard]] const std::vector<CategoryItem>& categories(FigureKind kind) const
+    {
+        return kind == FigureKind::attendance ? attendance : finance;
+    }
+
     friend bool operator==(const ProjectItem&, const ProjectItem&) = default;
 };
 using ProjectList = core::OrderedList<ProjectItem>;
@@ -60,7 +69,7 @@ public:
     [[nodiscard]] bool move_up(Kind kind, int index);
     [[nodiscard]] bool move_down(Kind kind, int index);
 
-    // Of a roll project. An empty name takes the service or absence away.
+    // Of a roll project. An empty name takes the service or absence away; asks first where it has marks.
     [[nodiscard]] bool set_service(int project, int place, const QString& name);
     [[nodiscard]] bool set_absence(int project, int place, const QString& name);
     [[nodiscard]] bool set_include(int project, int place, bool include);
@@ -85,6 +94,8 @@ public:
     [[nodiscard]] const std::optional<Faulty>& faulty() const { return m_faulty; }
 
     [[nodiscard]] bool altered() const;
+    /// Back to what was read; nothing is read anew.
+    void drop();
     /// All lists in one transaction, once check() agrees. Refused, and nothing is written, when others have changed the
     /// projects since they were read.
     [[nodiscard]] bool save();
@@ -93,6 +104,18 @@ private:
     [[nodiscard]] bool refuse(const QString& text, const QString& more = {}) const;
     [[nodiscard]] bool fits(const QString& name, const QStringList& others) const;
     [[nodiscard]] bool roll_chosen(int project) const;
+    /// What the services and the absences differ in.
+    template <std::size_t Count>
+    struct RollPart
+    {
+        QStringView what;
+        std::array<QString, Count> ProjectItem::*names;
+        QString (*told)(core::Session& session, int project, int number);
+    };
+    template <std::size_t Count>
+    [[nodiscard]] bool set_name(int project, int place, const QString& name, const RollPart<Count>& part);
+    /// Asks where there is something to be told.
+    [[nodiscard]] bool may_empty(QStringView what, const QString& name, const QString& told) const;
     [[nodiscard]] bool weekly_chosen(int project) const;
     /// Moves within a copy of the categories and puts it back.
     [[nodiscard]] bool move_category(int project, FigureKind kind, int index, bool up);

@@ -10,16 +10,15 @@ namespace {
 
 QString position_field(const RegisterKind& kind, Page page)
 {
-    return QString::fromUtf16(page == Page::entry ? kind.entry_position : kind.output_position);
+    return named(page == Page::entry ? kind.entry_position : kind.output_position);
 }
 
 } // namespace
 
 std::vector<Project> read_projects(core::Session& session, const RegisterKind& kind)
 {
-    auto rows = session.select(u"SELECT [%1],[%2] FROM [%3] ORDER BY [position],[%1];"_s.arg(
-        QString::fromUtf16(kind.project_key), QString::fromUtf16(kind.project_name),
-        QString::fromUtf16(kind.projects_query)));
+    auto rows = session.select(u"SELECT %1,%2 FROM %3 ORDER BY [position],%1;"_s.arg(
+        named(kind.project_key), named(kind.project_name), named(kind.projects_query)));
     std::vector<Project> projects;
     for (const core::Row& row : rows)
         projects.push_back({row.integer(core::Column{0}), row.text(core::Column{1})});
@@ -29,7 +28,7 @@ std::vector<Project> read_projects(core::Session& session, const RegisterKind& k
 int remembered_project(core::Session& session, const RegisterKind& kind, Page page)
 {
     const auto projects = read_projects(session, kind);
-    auto rows = session.select(u"SELECT [%1] FROM [tbl_project_position];"_s.arg(position_field(kind, page)));
+    auto rows = session.select(u"SELECT %1 FROM [tbl_project_position];"_s.arg(position_field(kind, page)));
     const auto* row = rows.first();
     const int remembered = row ? row->integer(core::Column{0}) : 0;
     if (std::ranges::find(projects, remembered, &Project::key) != projects.end())
@@ -39,7 +38,7 @@ int remembered_project(core::Session& session, const RegisterKind& kind, Page pa
 
 void remember_project(core::Session& session, const RegisterKind& kind, Page page, int project)
 {
-    session.execute(u"UPDATE [tbl_project_position] SET [%1]=?;"_s.arg(position_field(kind, page)), project);
+    session.execute(u"UPDATE [tbl_project_position] SET %1=?;"_s.arg(position_field(kind, page)), project);
 }
 
 } // namespace kindrel::registers

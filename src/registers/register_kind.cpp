@@ -128,6 +128,11 @@ std::span<const Belonging> RegisterKind::belonging_tables() const
     return {belongings.begin(), end};
 }
 
+QString named(const char16_t* name)
+{
+    return u'[' + QString::fromUtf16(name) + u']';
+}
+
 const RegisterKind& register_kind(Kind kind)
 {
     return all[static_cast<std::size_t>(kind)];

@@ -62,6 +62,9 @@ struct RegisterKind
     [[nodiscard]] std::span<const Belonging> belonging_tables() const;
 };
 
+/// A stored name as statements write it.
+[[nodiscard]] QString named(const char16_t* name);
+
 [[nodiscard]] const RegisterKind& register_kind(Kind kind);
 
 /// Whether the person may work in the register; otherwise says so.

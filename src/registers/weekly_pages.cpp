@@ -1,5 +1,6 @@
 #include "registers/weekly_pages.h"
 
+#include "core/progress_run.h"
 #include "pages/table.h"
 #include "registers/weekly_charts.h"
 
@@ -37,25 +38,34 @@ pages::TableColumn figure_column(const QString& heading)
     return {.heading = heading, .align = pages::Align::right};
 }
 
+core::ProgressRun begin(core::Progress& progress, std::size_t steps)
+{
+    return {progress, u"Creating report"_s, int(steps), u"Are you sure that you wish to cancel this report?"_s};
+}
+
 // Charts
 
 bool write_charts(const WeeklyContent& content, std::span<const pages::ChartData> charts, pages::Flow& flow,
-                  const Step& step)
+                  core::Progress& progress)
 {
     for (const auto& data : charts) {
         flow.drawing(pages::chart(data, *content.chart, {flow.width(), chart_height}, flow.type(), flow.metrics()));
         flow.space(between_charts);
-        if (!step())
+        if (!progress.step())
             return false;
     }
     return true;
 }
 
+std::size_t pairs(std::size_t charts)
+{
+    return (charts + 1) / 2;
+}
+
 /// Two beside each other.
 bool write_small_charts(const WeeklyContent& content, std::span<const pages::ChartData> charts, pages::Flow& flow,
-                        const Step& step)
+                        core::Progress& progress)
 {
-    flow.space(between_charts);
     pages::TableStyle style;
     style.lines = pages::TableLines::none;
     style.padding = style.vertical_padding = between_charts / 2;
@@ -69,7 +79,7 @@ bool write_small_charts(const WeeklyContent& content, std::span<const pages::Cha
     };
     for (std::size_t i = 0; i < charts.size(); i += 2) {
         table.row({cell_of(i), cell_of(i + 1)});
-        if (!step())
+        if (!progress.step())
             return false;
     }
     return true;
@@ -151,7 +161,7 @@ void write_summaries(const WeeklyContent& content, const DateTable& dates, pages
     }
 }
 
-bool write_date_rows(const WeeklyContent& content, const DateTable& dates, pages::Flow& flow, const Step& step)
+bool write_date_rows(const WeeklyContent& content, const DateTable& dates, pages::Flow& flow, core::Progress& progress)
 {
     const auto date_width = flow.type().body.size * date_in_ems;
     pages::Table table(flow, date_columns(content.categories, date_width), table_style(flow));
@@ -160,7 +170,7 @@ bool write_date_rows(const WeeklyContent& content, const DateTable& dates, pages
         for (std::size_t i = 0; i < content.categories.size(); ++i)
             texts += shown(dates.rows[row][i], content.categories[i].kind);
         table.row(texts);
-        if (!step())
+        if (!progress.step())
             return false;
     }
     const pages::Keep together(flow);
@@ -180,11 +190,6 @@ ChartFigures chart_figures(const DateTable& dates, std::size_t categories, core:
 
 // A row for each category
 
-QString section_name(FigureKind kind)
-{
-    return kind == FigureKind::attendance ? u"Attendance"_s : u"$ Amount"_s;
-}
-
 QString shown_slot(const std::optional<core::Amount>& figure, FigureKind kind, TableShape shape)
 {
     if (!figure)
@@ -197,12 +202,12 @@ QString shown_slot(const std::optional<core::Amount>& figure, FigureKind kind, T
 
 void write_section(pages::Table& table, FigureKind kind, int columns, const pages::TextStyle& style)
 {
-    pages::Cell cell(section_name(kind), style);
+    pages::Cell cell(kind_name(kind), style);
     cell.columns = columns;
     table.row({cell});
 }
 
-bool write_slot_rows(const WeeklyContent& content, const SlotTable& slots, pages::Flow& flow, const Step& step)
+bool write_slot_rows(const WeeklyContent& content, const SlotTable& slots, pages::Flow& flow, core::Progress& progress)
 {
     std::vector<pages::TableColumn> columns{{.width = name_width, .heading = u"Category"_s}};
     for (const auto& name : slots.columns)
@@ -220,46 +225,54 @@ bool write_slot_rows(const WeeklyContent& content, const SlotTable& slots, pages
                                flow.type().body.bolder(all));
         }
         table.row(cells);
-        if (!step())
+        if (!progress.step())
             return false;
     }
     return true;
 }
 
-/// The months or years without what stands for all of them.
+/// The months or years, and apart from them what stands for all of them.
 ChartFigures chart_figures(const SlotTable& slots)
 {
     ChartFigures figures{slots.columns.first(slots.slots), slots.rows};
-    for (auto& row : figures.rows)
+    for (auto& row : figures.rows) {
+        if (row.size() > std::size_t(slots.slots))
+            figures.all.push_back(row.back());
         row.resize(std::size_t(slots.slots));
+    }
     return figures;
 }
 
 } // namespace
 
-bool write_date_pages(const WeeklyContent& content, pages::Flow& flow, const Step& step)
+bool write_date_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress)
 {
     const auto dates = date_table(content.figures, content.categories);
-    if (content.chart) {
-        const auto figures = chart_figures(dates, content.categories.size(), content.day_order);
-        if (!write_charts(content, charts_by_kind(content.categories, figures), flow, step))
-            return false;
-    }
-    return write_date_rows(content, dates, flow, step);
+    std::vector<pages::ChartData> charts;
+    if (content.chart)
+        charts = charts_by_kind(content.categories, chart_figures(dates, content.categories.size(), content.day_order),
+                                content.chart->shape);
+    const auto run = begin(progress, dates.dates.size() + charts.size());
+    return write_charts(content, charts, flow, progress) && write_date_rows(content, dates, flow, progress);
 }
 
-bool write_slot_pages(const WeeklyContent& content, pages::Flow& flow, const Step& step)
+bool write_slot_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress)
 {
     const auto slots = slot_table(*content.report.shape, content.period, content.figures, content.categories);
-    if (!write_slot_rows(content, slots, flow, step))
+    const bool small = content.report.charts == ReportCharts::by_category;
+    std::vector<pages::ChartData> charts;
+    if (content.chart) {
+        const auto figures = chart_figures(slots);
+        charts = small ? charts_by_category(content.categories, figures)
+                       : charts_by_kind(content.categories, figures, content.chart->shape);
+    }
+    const auto run = begin(progress, content.categories.size() + (small ? pairs(charts.size()) : charts.size()));
+    if (!write_slot_rows(content, slots, flow, progress))
         return false;
-    if (!content.chart)
+    if (charts.empty())
         return true;
-    const auto figures = chart_figures(slots);
-    if (content.report.charts == ReportCharts::by_category)
-        return write_small_charts(content, charts_by_category(content.categories, figures), flow, step);
     flow.space(between_charts);
-    return write_charts(content, charts_by_kind(content.categories, figures), flow, step);
+    return small ? write_small_charts(content, charts, flow, progress) : write_charts(content, charts, flow, progress);
 }
 
 } // namespace kindrel::registers

@@ -1,9 +1,8 @@
 #pragma once
 
+#include "core/progress.h"
 #include "pages/flow.h"
 #include "registers/weekly_reports.h"
-
-#include <functional>
 
 namespace kindrel::registers {
 
@@ -18,12 +17,9 @@ struct WeeklyContent
     core::DayOrder day_order;
 };
 
-/// False to stop.
-using Step = std::function<bool()>;
-
-/// Each date's figure with a column for each category, then total, average, highest and lowest. False when stopped.
-[[nodiscard]] bool write_date_pages(const WeeklyContent& content, pages::Flow& flow, const Step& step);
+/// Each date's figure with a column for each category, then total, average, highest and lowest. False when cancelled.
+[[nodiscard]] bool write_date_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress);
 /// Months or years with a row for each category.
-[[nodiscard]] bool write_slot_pages(const WeeklyContent& content, pages::Flow& flow, const Step& step);
+[[nodiscard]] bool write_slot_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress);
 
 } // namespace kindrel::registers

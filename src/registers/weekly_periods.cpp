@@ -102,6 +102,14 @@ Period Period::from_month_before() const
     return period;
 }
 
+Period Period::only_year(int year) const
+{
+    auto period = *this;
+    period.first = {year, 1, 1};
+    period.last = {year, 12, 31};
+    return period;
+}
+
 QStringList offered_years()
 {
     QStringList years;

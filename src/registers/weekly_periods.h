@@ -30,6 +30,8 @@ struct Period
     [[nodiscard]] int years() const { return year_slot(last); }
     /// The same period and the month before it.
     [[nodiscard]] Period from_month_before() const;
+    /// One year of a span.
+    [[nodiscard]] Period only_year(int year) const;
 };
 
 /// The years that choosers list; any other can be typed.

@@ -46,6 +46,8 @@ public:
 protected:
     void load_rows() override;
     void save_rows() override;
+    void keep_rows() override { m_stored = m_rows; }
+    void drop_rows() override { m_rows = m_stored; }
     void clear_rows() override;
     void date_moved() override { load_last(); }
     [[nodiscard]] bool setup_unchanged() override;

@@ -197,28 +197,20 @@ qreal text_size_of(const WeeklyReport& report, std::size_t categories)
     return report.orientation == portrait && categories > many_columns ? dense_text_size : text_size;
 }
 
-/// Ends the progress however the run ends.
-class ReportRun
+/// Of the days that the report looks at.
+std::vector<WeeklyFigure> read_figures(core::Session& session, const WeeklyReportRequest& request, const Plan& plan)
 {
-public:
-    ReportRun(core::Progress& progress, int steps) : m_progress(progress)
-    {
-        m_progress.begin(u"Creating report"_s, steps, u"Are you sure that you wish to cancel this report?"_s);
-    }
-    ~ReportRun() { m_progress.end(); }
-    ReportRun(const ReportRun&) = delete;
-    ReportRun& operator=(const ReportRun&) = delete;
-
-private:
-    core::Progress& m_progress;
-};
-
-/// A step for each row of the table and each chart.
-int steps_of(const WeeklyContent& content)
-{
-    const auto categories = content.categories.size();
-    const auto rows = content.report.shape ? categories : date_table(content.figures, content.categories).dates.size();
-    return int(rows + (content.chart ? categories : 0));
+    const auto& period = plan.period;
+    const auto read = [&](const Period& days) {
+        return read_weekly_figures(session, request.project, days, plan.categories);
+    };
+    if (request.report->shape == month_changes)
+        return read(period.from_month_before());
+    if (request.report->shape != year_changes || period.years() == 1)
+        return read(period);
+    auto figures = read(period.only_year(period.first.year));
+    std::ranges::copy(read(period.only_year(period.last.year)), std::back_inserter(figures));
+    return figures;
 }
 
 bool write_report(core::Office& office, const WeeklyContent& content, const QString& project, pages::Paper paper,
@@ -238,11 +230,7 @@ bool write_report(core::Office& office, const WeeklyContent& content, const QStr
         band.space(below_period);
     };
     output::decorate(flow, QString::fromUtf8(report.title), {office, no_people}, own);
-    const ReportRun run(progress, steps_of(content));
-    const Step step = [&] {
-        return progress.step();
-    };
-    if (!(report.shape ? write_slot_pages(content, flow, step) : write_date_pages(content, flow, step)))
+    if (!(report.shape ? write_slot_pages(content, flow, progress) : write_date_pages(content, flow, progress)))
         return false;
     flow.finish();
     return true;
@@ -270,8 +258,7 @@ bool run_weekly_report(core::Office& office, const WeeklyReportRequest& request,
     if (!plan)
         return false;
     const auto& report = *request.report;
-    const auto read = report.shape == month_changes ? plan->period.from_month_before() : plan->period;
-    const auto figures = read_weekly_figures(*office.session, request.project, read, plan->categories);
+    const auto figures = read_figures(*office.session, request, *plan);
     if (figures.empty())
         return refuse(office, u"No figures found for creating a report"_s);
     const auto* chart = report.charts == ReportCharts::none ? nullptr : request.chart;

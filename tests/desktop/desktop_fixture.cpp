@@ -1,6 +1,7 @@
 #include "desktop/desktop_fixture.h"
 
 #include "core/sqlite_session.h"
+#include "desktop/shell/application.h"
 #include "people/family_store.h"
 #include "support/families.h"
 
@@ -9,7 +10,10 @@
 
 namespace kindrel::test {
 
-DesktopTest::DesktopTest() : look(*qobject_cast<QApplication*>(QCoreApplication::instance())) {}
+DesktopTest::DesktopTest() : look(*qobject_cast<QApplication*>(QCoreApplication::instance()))
+{
+    qobject_cast<desktop::Application*>(QCoreApplication::instance())->set_dialogue(place.dialogue);
+}
 
 void DesktopTest::begin(std::vector<people::FamilyFile> families)
 {

@@ -1,4 +1,4 @@
-#include <QApplication>
+#include "desktop/shell/application.h"
 
 #include <gtest/gtest.h>
 
@@ -7,6 +7,6 @@ int main(int count, char** words)
     testing::InitGoogleTest(&count, words);
     if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM"))
         qputenv("QT_QPA_PLATFORM", "offscreen");
-    const QApplication application(count, words);
+    const kindrel::desktop::Application application(count, words);
     return RUN_ALL_TESTS();
 }

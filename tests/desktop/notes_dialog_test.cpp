@@ -108,4 +108,25 @@ TEST_F(NotesDialogTest, ANoteThatOthersChangedIsToldAndTheCursorStaysInIt)
     EXPECT_EQ(note_of(2), u"Rain"_s);
 }
 
+TEST_F(NotesDialogTest, ANoteThatCannotBeStoredStaysWithItsDateHoweverItIsLeft)
+{
+    start();
+    auto& notes = open_notes();
+    type(notes, u"Rain"_s);
+    place.in_database(u"ALTER TABLE [tbl_weekly_memo] RENAME TO [gone];"_s);
+    for (const auto way : {Qt::Key_Down, Qt::Key_Escape}) {
+        if (way == Qt::Key_Down)
+            child<QListWidget>(notes, u"note_dates"_s).setFocus();
+        place.dialogue.expect_confirm_or_cancel(note_question, true);
+        place.dialogue.expect_box(u"Unable to save the note"_s);
+        press(notes, way);
+        EXPECT_TRUE(notes.isVisible());
+        EXPECT_EQ(child<QListWidget>(notes, u"note_dates"_s).currentRow(), 0);
+        EXPECT_EQ(child<QPlainTextEdit>(notes, u"note"_s).toPlainText(), u"Rain"_s);
+    }
+    place.dialogue.expect_confirm_or_cancel(note_question, false);
+    press(notes, Qt::Key_Escape);
+    EXPECT_EQ(window().findChild<QDialog*>(u"Roll_notes"_s), nullptr);
+}
+
 } // namespace kindrel::test

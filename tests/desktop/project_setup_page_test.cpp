@@ -106,6 +106,37 @@ TEST_F(ProjectSetupPageTest, ARollProjectGetsServicesReasonsAndTheirMarksByKeysA
               QStringList{u"Morning|Evening|Away|-1"_s});
 }
 
+TEST_F(ProjectSetupPageTest, AnIncompleteProjectIsDroppedAndThePageLeftWithoutItsDatabase)
+{
+    open();
+    enter(u"Youth"_s);
+    place.in_database(u"DROP VIEW [Qry_roll_load_project];"_s);
+    place.dialogue.expect_confirm_or_cancel(leave_question, false);
+    place.dialogue.expect_box(u"Unable to read the projects"_s);
+    EXPECT_TRUE(window().close());
+}
+
+TEST_F(ProjectSetupPageTest, AnEmptiedServiceWhoseMarksAreToStayInSightComesBack)
+{
+    open();
+    add_roll_project(u"Sunday"_s, u"Morning"_s);
+    save();
+    place.in_database(u"INSERT INTO [tbl_roll_date] ([roll_date_id],[roll_date],[roll_project_id]) VALUES "
+                      "(1,'2024-05-12',1);"_s);
+    place.in_database(u"INSERT INTO [tbl_roll_attendance] ([roll_date_id],[person_id],[Attendance]) VALUES "
+                      "(1,1,192);"_s);
+    press(window(), Qt::Key_V, Qt::AltModifier);
+    auto& service = child<QLineEdit>(page(), u"description_1"_s);
+    service.selectAll();
+    press(window(), Qt::Key_Delete);
+    place.dialogue.expect_confirm(u"Please confirm that you wish to remove this service 'Morning'. Do you wish to "
+                                  "continue?"_s,
+                                  core::Answer::no, core::Answer::no);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(service.text(), u"Morning"_s);
+    EXPECT_FALSE(window().page()->altered());
+}
+
 TEST_F(ProjectSetupPageTest, AnIncompleteProjectIsChosenWhenThePageRefusesToBeLeft)
 {
     open();

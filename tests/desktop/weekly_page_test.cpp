@@ -26,6 +26,14 @@ protected:
         act(Qt::Key_Insert);
         enter(date);
     }
+    /// The key of a button, which is pressed for a moment before it acts.
+    void press_button(Qt::Key key)
+    {
+        const auto shown = place.dialogue.seen().size();
+        act(key, Qt::AltModifier);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return place.dialogue.seen().size() > shown; }));
+        settle();
+    }
     [[nodiscard]] std::vector<desktop::PreviewWindow*> previews()
     {
         settle();
@@ -114,6 +122,36 @@ TEST_F(WeeklyPageTest, AFigureIsClearedAndWhatIsStillBeingTypedIsSaved)
     EXPECT_FALSE(marks().altered);
 }
 
+TEST_F(WeeklyPageTest, WhatIsStillBeingTypedGoesAlongWithWhateverIsDoneToTheDate)
+{
+    start();
+    open_newest();
+    write(u"130"_s);
+    place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"06/05/2024"_s);
+    press_button(Qt::Key_C);
+    EXPECT_EQ(shown(0, 2), u"130"_s);
+
+    act(Qt::Key_Down);
+    write(u"80"_s);
+    place.dialogue.expect_confirm(u"Please confirm that you wish to remove this record"_s, core::Answer::no);
+    press_button(Qt::Key_L);
+    save();
+    EXPECT_EQ(stored(u"2024-05-06"_s), u"1:130 2:80"_s);
+}
+
+TEST_F(WeeklyPageTest, ARefusedFigureKeepsItsDateFromBeingChangedOrDeleted)
+{
+    start();
+    open_newest();
+    write(u"100000"_s);
+    for (const auto key : {Qt::Key_C, Qt::Key_L}) {
+        place.dialogue.expect_box(u"Please enter a number under 99,000"_s);
+        press_button(key);
+        EXPECT_EQ(in_focus(), u"att_in"_s);
+        EXPECT_EQ(child<QLineEdit>(grid(), u"att_in"_s).text(), u"100000"_s);
+    }
+}
+
 TEST_F(WeeklyPageTest, LeavingAsksAndDoesAsItIsTold)
 {
     struct Case
@@ -135,6 +173,23 @@ TEST_F(WeeklyPageTest, LeavingAsksAndDoesAsItIsTold)
         EXPECT_EQ(stored(u"2024-05-05"_s), in_store);
         EXPECT_EQ(marks().locked, stays);
     }
+}
+
+TEST_F(WeeklyPageTest, FiguresThatCannotBeStoredStayAndLeavingWithoutThemNeedsNoDatabase)
+{
+    start();
+    open_newest();
+    enter(u"130"_s);
+    place.in_database(u"ALTER TABLE [tbl_weekly_amount] RENAME TO [gone];"_s);
+    place.dialogue.expect_confirm_or_cancel(leave_question, true);
+    place.dialogue.expect_box(u"Unable to save the figures of this date"_s);
+    EXPECT_FALSE(window().close());
+    EXPECT_TRUE(window().isVisible());
+    EXPECT_EQ(shown(0, 2), u"130"_s);
+    EXPECT_TRUE(marks().altered);
+    place.dialogue.expect_confirm_or_cancel(leave_question, false);
+    place.dialogue.expect_confirm_or_cancel(u"Backup Kindrel files before exiting?"_s, false);
+    EXPECT_TRUE(window().close());
 }
 
 TEST_F(WeeklyPageTest, TheProjectSetupHasTheParkedPageSettledFirst)
@@ -273,6 +328,26 @@ TEST_F(WeeklyPageTest, WithoutAProjectTheNextStepIsItsSetup)
     EXPECT_EQ(in_focus(), u"open_setup"_s);
     act(Qt::Key_Space);
     EXPECT_EQ(page().objectName(), u"setup_projects"_s);
+}
+
+TEST_F(WeeklyPageTest, ProjectsThatCannotBeReadAreNotCalledMissingAndAreReadOnceTheyCanBe)
+{
+    start();
+    const QString church = place.data.paths().database();
+    place.in_database(u"DROP VIEW [Qry_weekly_load_project];"_s);
+    place.dialogue.expect_box(u"Unable to read the weekly projects"_s);
+    open_page();
+    EXPECT_EQ(in_focus(), u"try_again"_s);
+    place.in_database(u"CREATE VIEW [Qry_weekly_load_project] AS SELECT * FROM [tbl_weekly_project];"_s);
+    desk().office.mode = core::Mode::network;
+    ASSERT_TRUE(QFile::rename(church, church + u".away"_s));
+    place.dialogue.expect_box(u"Unable to access your network files."_s);
+    act(Qt::Key_Space);
+    EXPECT_EQ(in_focus(), u"try_again"_s);
+    ASSERT_TRUE(QFile::rename(church + u".away"_s, church));
+    act(Qt::Key_Space);
+    EXPECT_EQ(in_focus(), u"dates"_s);
+    EXPECT_EQ(dates().size(), 2);
 }
 
 TEST_F(WeeklyPageTest, TheAreaStaysClosedWhileSomebodyIsInTheProjectSetup)

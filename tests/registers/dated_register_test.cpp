@@ -36,6 +36,31 @@ const QString unsaved =
     u"You have un-saved Weekly Statistics information, do you wish to save this data before exiting "
     "the weekly program?"_s;
 
+/// Loses its figures' table inside the transaction that writes, before the rows are written or after.
+class BreakingRegister : public WeeklyRegister
+{
+public:
+    using WeeklyRegister::WeeklyRegister;
+    bool before = false, after = false;
+
+protected:
+    bool setup_unchanged() override
+    {
+        if (before)
+            lose_table();
+        return true;
+    }
+    void save_rows() override
+    {
+        WeeklyRegister::save_rows();
+        if (after)
+            lose_table();
+    }
+
+private:
+    void lose_table() { session().execute(u"ALTER TABLE [tbl_weekly_amount] RENAME TO [gone];"_s); }
+};
+
 } // namespace
 
 KINDREL_ON_BOTH_ENGINES(DatedRegisterTest);
@@ -206,6 +231,38 @@ TEST_P(DatedRegisterTest, UnsavedWorkIsSavedDroppedOrStayedWith)
     EXPECT_TRUE(weekly->choose_project(2));
     EXPECT_EQ(stored(second), u"");
     EXPECT_EQ(locks(), 0);
+}
+
+TEST_P(DatedRegisterTest, WritingThatCannotBeReadBackIsNotDone)
+{
+    BreakingRegister breaking(office());
+    ASSERT_TRUE(breaking.enter() && breaking.add(first));
+    type(breaking, {u"10"});
+    breaking.after = true;
+    EXPECT_THROW((void)breaking.save(), core::DatabaseError);
+    EXPECT_TRUE(breaking.altered());
+    EXPECT_EQ(stored(first), u"");
+
+    breaking.after = false;
+    breaking.before = true;
+    EXPECT_THROW((void)breaking.change_date(second), core::DatabaseError);
+    EXPECT_EQ(breaking.open_date()->date, first);
+    EXPECT_EQ(count(u"[tbl_weekly_date] WHERE [weekly_date]='2024-04-28'"_s), 1);
+
+    breaking.before = false;
+    EXPECT_TRUE(breaking.save());
+    EXPECT_FALSE(breaking.altered());
+    EXPECT_EQ(stored(first), u"1:10");
+}
+
+TEST_P(DatedRegisterTest, DroppingUnsavedWorkReadsNothing)
+{
+    start_with({first});
+    type(*weekly, {u"10"});
+    session().execute(u"ALTER TABLE [tbl_weekly_amount] RENAME TO [gone];"_s);
+    dialogue().expect_confirm_or_cancel(unsaved, false);
+    EXPECT_TRUE(weekly->leave());
+    EXPECT_FALSE(weekly->open_date());
 }
 
 TEST_P(DatedRegisterTest, AnOddDayIsNoted)

@@ -2,6 +2,11 @@
 
 #include "register_fixture.h"
 #include "registers/projects.h"
+#include "support/processes.h"
+
+#include <QSet>
+
+#include <random>
 
 namespace kindrel::test {
 
@@ -186,6 +191,50 @@ TEST_P(ProjectSetupTest, ARemovedCategoryTakesItsFiguresAlongAndNoOthers)
     EXPECT_EQ(RegisterTest::stored(first), u"2:20 3:$30.00");
 }
 
+TEST_P(ProjectSetupTest, AServiceOrReasonWithMarksIsEmptiedOnceThatIsConfirmed)
+{
+    add_projects();
+    {
+        auto setup = open();
+        ASSERT_TRUE(setup.set_service(0, 1, u"Evening"_s));
+        ASSERT_TRUE(setup.set_absence(0, 1, u"Sick"_s));
+        ASSERT_TRUE(setup.set_absence(0, 2, u"Away"_s));
+        ASSERT_TRUE(setup.save());
+    }
+    give_records(); // 192: the first service. Of project 2 there is one too.
+    session().run_script(u"INSERT INTO [tbl_roll_attendance] ([roll_date_id],[person_id],[Attendance]) VALUES "
+                         "(1,3,224),(1,4,-2),(2,4,-2);"
+                         "INSERT INTO [tbl_roll_visitors] ([roll_date_id],[service_id],[visitors]) VALUES (1,2,9);"_s);
+    struct Case
+    {
+        bool (ProjectSetup::*set)(int, int, const QString&);
+        int place;
+        QString what, told;
+    };
+    auto setup = open();
+    const auto service = &ProjectSetup::set_service;
+    for (const auto& [set, place, what, told] :
+         {Case{service, 0, u"service 'Meeting'"_s, u"2 marks cannot be seen without it, until a service"_s},
+          Case{service, 1, u"service 'Evening'"_s,
+               u"1 mark and 1 visitor figure cannot be seen without it, until a service"_s},
+          Case{&ProjectSetup::set_absence, 1, u"reason for being absent 'Sick'"_s,
+               u"1 mark cannot be seen without it, until a reason"_s}}) {
+        const auto asked = u"Please confirm that you wish to remove this %1. Do you wish to continue?"_s.arg(what);
+        for (const auto answer : {Answer::no, Answer::yes}) {
+            dialogue().expect_confirm(asked, answer, Answer::no);
+            EXPECT_EQ((setup.*set)(0, place, u" "_s), answer == Answer::yes);
+            EXPECT_EQ(dialogue().seen().back().more, told + u" has a name in its place again."_s);
+        }
+    }
+    EXPECT_TRUE(setup.set_absence(0, 2, {})) << "It has no marks.";
+    EXPECT_TRUE(setup.set_service(0, 0, u"Early"_s));
+    ASSERT_TRUE(setup.save());
+    const auto stays = open().list(Kind::roll)[0];
+    EXPECT_EQ(stays.services, (decltype(stays.services){u"Early"_s}));
+    EXPECT_EQ(stays.absences, decltype(stays.absences){});
+    EXPECT_EQ(count(u"[tbl_roll_attendance]"_s), 6) << "The marks stay.";
+}
+
 TEST_P(ProjectSetupTest, WhatCannotBeDoneIsSaidAndChangesNothing)
 {
     auto setup = open();
@@ -264,6 +313,57 @@ TEST_P(ProjectSetupTest, WithoutTheRightNothingIsSaved)
         u"Your password does not give access to \"%1\""_s.arg(core::area_name(core::Area::project_setup)));
     EXPECT_FALSE(setup.save());
     EXPECT_EQ(stored(Kind::finance), QStringList());
+}
+
+TEST_P(ProjectSetupTest, AKilledSaveLeavesTheProjectsOfOneSaveAlone)
+{
+    constexpr int funds = 40;
+    {
+        add_projects();
+        auto setup = open();
+        for (int fund = 0; fund < funds; ++fund)
+            ASSERT_TRUE(setup.add_category(0, FigureKind::money, u"Fund %1"_s.arg(fund)));
+        ASSERT_TRUE(setup.save());
+    }
+    weekly.reset();
+    desk.reset();
+    other.reset();
+    std::mt19937 random(20261123);
+    for (int round = 0; round < 20; ++round) {
+        church->close();
+        run_and_kill(
+            [&](const Ready& ready) {
+                WorkingOffice working(*church);
+                ProjectSetup setup(working.office);
+                for (int save = 1;; ++save) {
+                    const auto name = [save](const QString& what) {
+                        return u"%1 %2"_s.arg(what).arg(save);
+                    };
+                    for (const auto kind : registers::kinds)
+                        (void)setup.rename(kind, 1, name(u"Project"_s));
+                    (void)setup.set_service(1, 0, name(u"Service"_s));
+                    for (const int fund : {0, funds})
+                        (void)setup.rename_category(0, FigureKind::money, fund, name(u"Fund no %1"_s.arg(fund)));
+                    (void)setup.move_category_down(0, FigureKind::money, 1);
+                    (void)setup.save();
+                    if (save == 1)
+                        ready();
+                }
+            },
+            std::chrono::microseconds(random() % 15000));
+        church->reopen();
+        SetupOffice looking(*church);
+        const ProjectSetup setup(looking.office);
+        const auto& categories = setup.categories(0, FigureKind::money);
+        ASSERT_EQ(categories.size(), funds + 1) << "A save stands by half.";
+        EXPECT_EQ(count(u"[tbl_roll_setup]"_s), 2);
+        QSet<QString> saves{setup.list(Kind::roll)[1].services[0].section(u' ', -1)};
+        for (const auto kind : registers::kinds)
+            saves += setup.list(kind)[1].name.section(u' ', -1);
+        for (const auto* category : {&categories.front(), &categories.back()})
+            saves += category->name.section(u' ', -1);
+        EXPECT_EQ(saves.size(), 1) << "Two saves are mixed.";
+    }
 }
 
 } // namespace kindrel::test

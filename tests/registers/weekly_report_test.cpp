@@ -17,10 +17,14 @@ class CancellingProgress : public core::SilentProgress
 {
 public:
     int cancel_at = 0; ///< Counted from 1; 0 is never.
-    int taken = 0;
+    int taken = 0, announced = 0;
     QString question;
 
-    void begin(const QString&, int, const QString& cancel_question) override { question = cancel_question; }
+    void begin(const QString&, int steps, const QString& cancel_question) override
+    {
+        announced += steps;
+        question = cancel_question;
+    }
     [[nodiscard]] bool step(const QString&) override { return ++taken != cancel_at; }
 };
 
@@ -145,6 +149,17 @@ TEST_P(EachWeeklyReportTest, PrintsItsFiguresUnderItsHeadings)
     const auto found = row_of(one.first, cells);
     EXPECT_TRUE(found.startsWith(one.expected)) << found.toStdString();
     EXPECT_TRUE(spool->finished());
+}
+
+TEST_P(EachWeeklyReportTest, TakesAsManyStepsAsItAnnounced)
+{
+    auto asked = request(QString::fromUtf8(GetParam().report));
+    for (const auto* style : {"2D Bar", "2D Pie"}) {
+        asked.chart = pages::find_chart_style(QString::fromUtf8(style));
+        ASSERT_TRUE(run(asked));
+        EXPECT_EQ(progress.taken, progress.announced) << style;
+        EXPECT_GT(progress.taken, 0);
+    }
 }
 
 TEST_P(EachWeeklyReportTest, FillsTheWidthOfEitherPaper)
@@ -286,6 +301,35 @@ TEST_F(WeeklyReportTest, HeadCountsAndMoneyHaveChartsOfTheirOwn)
     EXPECT_EQ(all.count(u"Offering ($)"_s), 2) << "above its own chart and in the table";
     EXPECT_TRUE(all.contains(u"$100.00"_s));
     EXPECT_TRUE(all.contains(u"0"_s)) << "the axis of head counts begins at zero";
+}
+
+TEST_F(WeeklyReportTest, APieOfSeveralCategoriesShowsWhatTheTableShowsForAllYears)
+{
+    figures.add({{{2006, 12, 10}, 2, 10}, {{2007, 2, 4}, 2, 40}, {{2007, 3, 4}, 2, 10}});
+    struct Case
+    {
+        QString report;
+        QString morning, evening;
+    };
+    for (const auto& [report, morning, evening] : {Case{u"Yearly_average_report"_s, u"23 (53.5%)"_s, u"20 (46.5%)"_s},
+                                                   Case{u"Yearly_table_report"_s, u"115 (65.7%)"_s, u"60 (34.3%)"_s}}) {
+        auto asked = request(report);
+        asked.chart = pages::find_chart_style(u"2D Pie");
+        ASSERT_TRUE(run(asked));
+        EXPECT_TRUE(texts().contains(u"Morning: "_s + morning)) << texts().join(u'|').toStdString();
+        EXPECT_TRUE(texts().contains(u"Evening: "_s + evening));
+    }
+}
+
+TEST_F(WeeklyReportTest, AComparisonLooksAtItsTwoYearsAlone)
+{
+    figures.add({{{2007, 3, 4}, 2, 500}, {{2009, 12, 6}, 1, 34}});
+    auto asked = request(u"Yearly_variance_report"_s);
+    asked.period.to_year = u"2009"_s;
+    ASSERT_TRUE(run(asked));
+    EXPECT_EQ(row_of(u"Morning"_s, 4), u"Morning +4 +4 Evening"_s);
+    asked.categories = {2};
+    refused(asked, u"No figures found for creating a report"_s);
 }
 
 TEST_F(WeeklyReportTest, OfAProjectsCategoriesOnlyTheChosenOnesPrint)

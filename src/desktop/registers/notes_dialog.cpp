@@ -109,18 +109,23 @@ void NotesDialog::choose(int place)
 {
     if (place < 0 || place == m_notes.shown())
         return;
-    (void)m_notes.show(place);
+    (void)stored([this, place] { return m_notes.show(place); });
     show_dates();
+}
+
+bool NotesDialog::stored(const std::function<bool()>& store)
+{
+    try {
+        return store();
+    } catch (const core::DatabaseError& error) {
+        m_office.dialogue.show({u"Unable to save the note"_s, error.text()});
+        return false;
+    }
 }
 
 bool NotesDialog::save()
 {
-    bool saved = false;
-    try {
-        saved = m_notes.save();
-    } catch (const core::DatabaseError& error) {
-        m_office.dialogue.show({u"Unable to save the note"_s, error.text()});
-    }
+    const bool saved = stored([this] { return m_notes.save(); });
     show_dates();
     if (!saved)
         m_text->setFocus();
@@ -135,7 +140,7 @@ void NotesDialog::accept()
 
 void NotesDialog::reject()
 {
-    if (m_notes.leave())
+    if (stored([this] { return m_notes.leave(); }))
         QDialog::reject();
     else
         show_dates();

@@ -34,6 +34,8 @@ private:
     void show_note();
     void choose(int place);
     [[nodiscard]] bool save();
+    /// Runs what saves; false also when that failed, which is told.
+    [[nodiscard]] bool stored(const std::function<bool()>& store);
     void show_state();
 
     core::Office& m_office;

@@ -1,17 +1,13 @@
 #pragma once
 
-#include "core/entry.h"
 #include "desktop/registers/project_tab.h"
-#include "desktop/shell/desk.h"
-#include "desktop/shell/page.h"
-
-class QTabWidget;
+#include "desktop/shell/setup_tabs_page.h"
 
 namespace kindrel::desktop {
 
-/// The projects of roll, giving and weekly statistics, a tab each. Nothing is stored before the page is saved, and it
-/// cannot be left while a project is incomplete.
-class ProjectSetupPage : public Page
+/// The projects of roll, giving and weekly statistics, a tab each. The page cannot be left while a project is
+/// incomplete.
+class ProjectSetupPage : public SetupTabsPage
 {
     Q_OBJECT
 
@@ -21,32 +17,21 @@ public:
     ~ProjectSetupPage() override;
 
     [[nodiscard]] QString help() const override { return QStringLiteral("setup_projects"); }
-    void entered() override;
-    void find() override;
-    bool save() override;
-    [[nodiscard]] bool altered() const override;
-    [[nodiscard]] bool holds_lock() const override { return m_desk.office.shared(); }
-    [[nodiscard]] bool leave() override;
+
+protected:
+    [[nodiscard]] bool list_altered() const override { return m_setup->altered(); }
+    [[nodiscard]] bool store() override { return m_setup->save(); }
+    void reread() override;
+    [[nodiscard]] bool complete() override { return m_setup->check(); }
+    void go_to_fault() override;
 
 private:
     ProjectSetupPage(Desk& desk, core::AreaEntry entry);
 
-    void add_tab(ProjectTab* tab, const QString& title);
-    void add_actions();
-    /// What was typed and not entered yet goes into its list.
-    [[nodiscard]] bool finish_typing();
-    void go_to_fault();
-    void cancel();
-    void drop();
-    void show_projects();
-    void show_state();
+    void add_register(ProjectTab* tab, const QString& title);
 
-    Desk& m_desk;
-    core::AreaEntry m_entry;
     SharedSetup m_setup;
-    QTabWidget* m_tabs;
     std::vector<ProjectTab*> m_registers; ///< In their order, as the tabs are.
-    bool m_saved = false;
 };
 
 } // namespace kindrel::desktop

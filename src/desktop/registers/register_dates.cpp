@@ -18,20 +18,11 @@ namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
 
-namespace {
-
-QLabel* make_caption(const QString& text, QWidget* of)
-{
-    auto* caption = new QLabel(text);
-    caption->setBuddy(of);
-    return caption;
-}
-
-} // namespace
-
-RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, QWidget* parent)
-    : QWidget(parent), m_desk(desk), m_register(dated), m_column(new QVBoxLayout(this)), m_project(new QComboBox),
-      m_new(new DateField(desk.office)), m_dates(new QListWidget)
+RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, std::function<bool()> finish_typing,
+                             QWidget* parent)
+    : QWidget(parent), m_desk(desk), m_register(dated), m_finish_typing(std::move(finish_typing)),
+      m_column(new QVBoxLayout(this)), m_project(new QComboBox), m_new(new DateField(desk.office)),
+      m_dates(new QListWidget)
 {
     m_project->setObjectName(u"project"_s);
     m_project->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
@@ -41,7 +32,7 @@ RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, QWidge
     connect(m_project, &QComboBox::activated, this, &RegisterDates::choose_project);
     // After the key or click, for the list is filled anew.
     const auto open_later = [this] {
-        QMetaObject::invokeMethod(this, &RegisterDates::open_chosen, Qt::QueuedConnection);
+        QMetaObject::invokeMethod(this, settled(&RegisterDates::open_chosen), Qt::QueuedConnection);
     };
     connect(m_dates, &QListWidget::itemActivated, this, open_later);
     connect(m_dates, &QListWidget::itemClicked, this, open_later);
@@ -52,56 +43,66 @@ RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, QWidge
     });
     connect(
         m_new, &QLineEdit::returnPressed, this,
-        [this] {
+        [this, add = settled(&RegisterDates::add_typed)] {
             if (!m_new->isModified()) // Otherwise the field has refused what was typed.
-                add_typed();
+                add();
         },
         Qt::QueuedConnection);
     auto* remove_key = new QShortcut(Qt::Key_Delete, m_dates);
     remove_key->setContext(Qt::WidgetShortcut);
-    connect(remove_key, &QShortcut::activated, this, &RegisterDates::remove);
+    connect(remove_key, &QShortcut::activated, this, settled(&RegisterDates::remove));
+}
+
+std::function<void()> RegisterDates::settled(void (RegisterDates::*act)())
+{
+    return [this, act] {
+        if (m_finish_typing())
+            (this->*act)();
+    };
 }
 
 void RegisterDates::lay_out()
 {
+    const auto add_captioned = [this](const QString& caption, QWidget* of, QWidget* line, int stretch = 0) {
+        auto* label = new QLabel(caption);
+        label->setBuddy(of);
+        m_column->addWidget(label);
+        m_column->addWidget(line, stretch);
+    };
     m_column->setContentsMargins(0, 0, 0, 0);
     m_column->setSpacing(space::field / 2);
-    m_column->addWidget(make_caption(u"&Project"_s, m_project));
-    m_column->addWidget(m_project);
+    add_captioned(u"&Project"_s, m_project, m_project);
     m_column->addSpacing(space::field / 2);
-    m_column->addWidget(make_caption(u"New &date"_s, m_new));
-    m_column->addWidget(make_new_line());
+    add_captioned(u"New &date"_s, m_new, make_new_line());
     m_column->addSpacing(space::field / 2);
-    m_column->addWidget(make_caption(u"Da&tes"_s, m_dates));
-    m_column->addWidget(m_dates, 1);
-    auto* change = make_button(u"&Change date"_s, u"view-calendar-day"_s, u"btn_edit"_s);
-    change->setToolTip(u"Gives the chosen date, with everything on it, another day"_s);
-    connect(change, &QPushButton::clicked, this, &RegisterDates::change_date);
-    auto* remove = make_button(u"De&lete"_s, u"edit-delete"_s, u"delete"_s);
-    remove->setToolTip(u"Deletes the chosen date (Delete in the list)"_s);
-    connect(remove, &QPushButton::clicked, this, &RegisterDates::remove);
+    add_captioned(u"Da&tes"_s, m_dates, m_dates, 1);
+    add_button(make_button({u"&Change date"_s, u"view-calendar-day"_s, u"btn_edit"_s,
+                            u"Gives the chosen date, with everything on it, another day"_s},
+                           &RegisterDates::change_date));
+    add_button(
+        make_button({u"De&lete"_s, u"edit-delete"_s, u"delete"_s, u"Deletes the chosen date (Delete in the list)"_s},
+                    &RegisterDates::remove));
 }
 
 QWidget* RegisterDates::make_new_line()
 {
-    auto* add = new QPushButton(icon(u"list-add"_s), u"Add"_s);
-    add->setObjectName(u"add_date"_s);
-    add->setToolTip(u"Adds the date and opens it (Enter in the field)"_s);
-    connect(add, &QPushButton::clicked, this, &RegisterDates::add_typed);
     auto* line = new QWidget;
     auto* row = new QHBoxLayout(line);
     row->setContentsMargins(0, 0, 0, 0);
     row->setSpacing(space::field);
     row->addWidget(m_new, 1);
-    row->addWidget(add);
+    row->addWidget(
+        make_button({u"Add"_s, u"list-add"_s, u"add_date"_s, u"Adds the date and opens it (Enter in the field)"_s},
+                    &RegisterDates::add_typed));
     return line;
 }
 
-QPushButton* RegisterDates::make_button(const QString& text, const QString& icon_name, const QString& name)
+QPushButton* RegisterDates::make_button(const Button& looks, void (RegisterDates::*act)())
 {
-    auto* button = new QPushButton(icon(icon_name), text);
-    button->setObjectName(name);
-    add_button(button);
+    auto* button = new QPushButton(icon(looks.icon), looks.text);
+    button->setObjectName(looks.name);
+    button->setToolTip(looks.tip);
+    connect(button, &QPushButton::clicked, this, settled(act));
     return button;
 }
 
@@ -176,6 +177,8 @@ void RegisterDates::done(bool made)
 
 void RegisterDates::choose_project(int place)
 {
+    if (!m_finish_typing())
+        return show_register();
     (void)m_register.choose_project(m_project->itemData(place).toInt());
     Q_EMIT remarked({});
     done(false);

@@ -20,7 +20,10 @@ class RegisterDates : public QWidget
     Q_OBJECT
 
 public:
-    RegisterDates(Desk& desk, registers::DatedRegister& dated, QWidget* parent = nullptr);
+    /// `finish_typing` takes over what is being typed on the open date before anything happens to it; false when that
+    /// was refused.
+    RegisterDates(Desk& desk, registers::DatedRegister& dated, std::function<bool()> finish_typing,
+                  QWidget* parent = nullptr);
 
     /// After the register was changed elsewhere.
     void show_register();
@@ -45,8 +48,14 @@ Q_SIGNALS:
 private:
     void lay_out();
     [[nodiscard]] QWidget* make_new_line();
-    QPushButton* make_button(const QString& text, const QString& icon_name, const QString& name);
+    struct Button
+    {
+        QString text, icon, name, tip;
+    };
+    [[nodiscard]] QPushButton* make_button(const Button& looks, void (RegisterDates::*act)());
     void show_dates();
+    /// `act`, once nothing is being typed on the open date any more.
+    [[nodiscard]] std::function<void()> settled(void (RegisterDates::*act)());
     void choose_project(int place);
     void open_chosen();
     void add_typed();
@@ -56,6 +65,7 @@ private:
 
     Desk& m_desk;
     registers::DatedRegister& m_register;
+    std::function<bool()> m_finish_typing;
     QVBoxLayout* m_column;
     QComboBox* m_project;
     DateField* m_new;

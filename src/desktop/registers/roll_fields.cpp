@@ -78,12 +78,12 @@ bool RollFields::take(int place, const QString& name, Set set)
 {
     const bool chosen = m_setup->list(registers::Kind::roll).holds(m_project);
     const bool taken = ((*m_setup).*set)(m_project, place, name);
-    if (!taken && chosen)
+    if (!taken && chosen && !name.trimmed().isEmpty())
         return false;
-    // Without a project the name has no place to stay in.
+    // Without a project the name has no place to stay in; one that was not to go after all comes back.
     show_project();
     Q_EMIT changed();
-    if (!taken)
+    if (!chosen)
         Q_EMIT project_wanted();
     return true;
 }

@@ -34,7 +34,8 @@ constexpr std::array column_shares{46, 18, 18, 18};
 } // namespace
 
 WeeklyEntry::WeeklyEntry(Desk& desk, registers::WeeklyRegister& weekly, QWidget* parent)
-    : QWidget(parent), m_desk(desk), m_weekly(weekly), m_dates(new RegisterDates(desk, weekly)),
+    : QWidget(parent), m_desk(desk), m_weekly(weekly),
+      m_dates(new RegisterDates(desk, weekly, [this] { return finish_typing(); })),
       m_model(new WeeklyGridModel(weekly, desk.office.day_order(), this)), m_grid(new FigureGrid),
       m_notes(new QPushButton(icon(u"view-list-details"_s), {})), m_heading(make_heading({})), m_totals(make_value()),
       m_work(new QStackedWidget)
@@ -114,7 +115,11 @@ void WeeklyEntry::show_totals()
 
 void WeeklyEntry::show_notes_button()
 {
-    m_notes->setText(registers::notes_button(*m_desk.office.session, NotesArea::weekly, m_dates->chosen()));
+    try {
+        m_notes->setText(registers::notes_button(*m_desk.office.session, NotesArea::weekly, m_dates->chosen()));
+    } catch (const core::DatabaseError&) {
+        // The page must be able to close without its database; opening the notes tells what is wrong.
+    }
 }
 
 void WeeklyEntry::open_notes()

@@ -87,7 +87,8 @@ QVariant WeeklyGridModel::headerData(int section, Qt::Orientation orientation, i
     if (role != Qt::DisplayRole)
         return {};
     if (section != last)
-        return QStringList{u"Category"_s, u"$ Amount"_s, u"Attendance"_s}.value(section);
+        return QStringList{u"Category"_s, kind_name(FigureKind::money), kind_name(FigureKind::attendance)}.value(
+            section);
     const auto date = m_weekly.last_date();
     return date ? date->shown(m_day_order) : u"Last date"_s;
 }

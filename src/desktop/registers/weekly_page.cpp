@@ -24,6 +24,25 @@ namespace {
 constexpr int entry_tab = 0;
 constexpr int output_tab = 1;
 
+/// What the page shows.
+enum Content { tabs, empty, unread };
+
+/// Words in the middle of the page, and what one can do about it.
+QWidget* make_panel(const QString& what, const QString& next, QPushButton* button)
+{
+    auto* words = new EmptyPanel;
+    words->say(what, next);
+    words->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Maximum);
+    auto* panel = new QWidget;
+    auto* column = new QVBoxLayout(panel);
+    column->addStretch(1);
+    column->addWidget(words);
+    column->addWidget(button, 0, Qt::AlignHCenter);
+    column->addStretch(2);
+    panel->setFocusProxy(button);
+    return panel;
+}
+
 } // namespace
 
 WeeklyPage* WeeklyPage::open(Desk& desk)
@@ -44,6 +63,7 @@ WeeklyPage::WeeklyPage(Desk& desk, core::AreaEntry entry)
     m_tabs->addTab(m_output, u"Output"_s);
     m_content->addWidget(m_tabs);
     m_content->addWidget(make_empty());
+    m_content->addWidget(make_unread());
     set_content(m_content);
     add_actions();
     connect(m_figures, &WeeklyEntry::changed, this, &WeeklyPage::show_state);
@@ -60,21 +80,21 @@ WeeklyPage::~WeeklyPage() = default;
 
 QWidget* WeeklyPage::make_empty()
 {
-    auto* words = new EmptyPanel;
-    words->say(u"There is no weekly project yet"_s,
-               u"A weekly project is a list of what you count each week. Set one up, then come back."_s);
     auto* setup = new QPushButton(icon(u"settings-configure"_s), u"&Set up a weekly project"_s);
     setup->setObjectName(u"open_setup"_s);
     setup->setEnabled(core::may_enter(m_desk.office, core::AreaId::project_setup));
     connect(setup, &QPushButton::clicked, this, [this] { m_desk.navigation.open_area(u"setup_projects"_s); });
-    words->setSizePolicy(QSizePolicy::Preferred, QSizePolicy::Maximum);
-    auto* panel = new QWidget;
-    auto* column = new QVBoxLayout(panel);
-    column->addStretch(1);
-    column->addWidget(words);
-    column->addWidget(setup, 0, Qt::AlignHCenter);
-    column->addStretch(2);
-    return panel;
+    return make_panel(u"There is no weekly project yet"_s,
+                      u"A weekly project is a list of what you count each week. Set one up, then come back."_s, setup);
+}
+
+QWidget* WeeklyPage::make_unread()
+{
+    auto* again = new QPushButton(icon(u"view-refresh"_s), u"&Try again"_s);
+    again->setObjectName(u"try_again"_s);
+    connect(again, &QPushButton::clicked, this, &WeeklyPage::entered);
+    return make_panel(u"The weekly projects could not be read"_s,
+                      u"What is stored is not lost. Try again once the connection is back."_s, again);
 }
 
 void WeeklyPage::add_actions()
@@ -105,16 +125,25 @@ bool WeeklyPage::at_entry() const
     return m_tabs->currentIndex() == entry_tab;
 }
 
+bool WeeklyPage::enter_register()
+{
+    try {
+        return m_weekly.enter();
+    } catch (const core::DatabaseError& error) {
+        m_desk.office.dialogue.show({u"Unable to read the weekly projects"_s, error.text()});
+        return false;
+    }
+}
+
 void WeeklyPage::entered()
 {
     if (!m_figures->finish_typing())
         return;
     // Projects and dates may have come or gone while no date was open here.
-    const bool usable = m_weekly.open_date() || m_weekly.enter();
-    m_content->setCurrentIndex(usable ? 0 : 1);
+    const bool usable = m_weekly.open_date() || enter_register();
+    m_content->setCurrentIndex(usable ? tabs : m_weekly.none_set_up() ? empty : unread);
     if (!usable) {
-        if (auto* setup = findChild<QPushButton*>(u"open_setup"_s))
-            setup->setFocus();
+        m_content->currentWidget()->setFocus();
         return;
     }
     m_figures->show_register();
@@ -158,22 +187,27 @@ bool WeeklyPage::save()
         return false;
     if (!m_weekly.open_date())
         return true;
-    bool saved = false;
-    try {
-        saved = m_weekly.save();
-    } catch (const core::DatabaseError& error) {
-        m_desk.office.dialogue.show({u"Unable to save the figures of this date"_s, error.text()});
-    }
+    const bool saved = stored([this] { return m_weekly.save(); });
     m_saved = saved;
     show_state();
     return saved;
+}
+
+bool WeeklyPage::stored(const std::function<bool()>& store)
+{
+    try {
+        return store();
+    } catch (const core::DatabaseError& error) {
+        m_desk.office.dialogue.show({u"Unable to save the figures of this date"_s, error.text()});
+        return false;
+    }
 }
 
 bool WeeklyPage::leave()
 {
     if (!m_figures->finish_typing())
         return false;
-    const bool left = m_weekly.leave();
+    const bool left = stored([this] { return m_weekly.leave(); });
     m_figures->show_register();
     m_figures->focus_work();
     return left;

@@ -37,9 +37,14 @@ private:
     WeeklyPage(Desk& desk, core::AreaEntry entry);
 
     [[nodiscard]] QWidget* make_empty();
+    [[nodiscard]] QWidget* make_unread();
+    /// False also when the projects could not be read, which is told.
+    [[nodiscard]] bool enter_register();
     void add_actions();
     void turn_to(int tab);
     [[nodiscard]] bool at_entry() const;
+    /// Runs what saves; false also when that failed, which is told.
+    [[nodiscard]] bool stored(const std::function<bool()>& store);
     void show_state();
 
     Desk& m_desk;

@@ -16,13 +16,16 @@ bool Application::notify(QObject* receiver, QEvent* event)
     } catch (const core::FileError& error) {
         tell(u"A file could not be read or written."_s, error.text());
     }
+    if (event->type() == QEvent::Close)
+        event->ignore(); // What could not be settled is still in the window.
     return true;
 }
 
 void Application::tell(const QString& what, const QString& why)
 {
-    if (m_dialogue)
-        m_dialogue->show({what, why});
+    if (!m_dialogue)
+        throw;
+    m_dialogue->show({what, why});
 }
 
 } // namespace kindrel::desktop

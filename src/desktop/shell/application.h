@@ -7,7 +7,7 @@
 namespace kindrel::desktop {
 
 /// Turns what went wrong in answer to a key or click into a box, so that one failed screen does not take the program
-/// with it.
+/// with it. A window whose closing failed stays open.
 class Application : public QApplication
 {
     Q_OBJECT
