@@ -173,7 +173,8 @@ Status run_restore(Context& context)
     context.out << u"%1 is as it was on %2.\n"_s.arg(report->restored.church.church_name,
                                                      report->restored.made.toString(moment_format));
     if (report->before.isEmpty())
-        context.out << u"The state before could not be kept.\n"_s;
+        context.out << u"The state before could not be backed up; its files lie as they were in %1\n"_s.arg(
+            report->before_unchecked);
     else
         context.out << u"The state before is kept in %1\n"_s.arg(report->before);
     return Status::done;

@@ -20,6 +20,8 @@ using core::Cure;
 using core::Finding;
 using core::Findings;
 
+const QString running_here = u"Kindrel is running on this workstation: leave it first."_s;
+
 QString word_of(Cure cure)
 {
     switch (cure) {
@@ -110,7 +112,7 @@ QString mending_question(const MenderContext& context)
 bool mend(const MenderContext& context)
 {
     if (!free_to_work(context))
-        return refuse(context, u"Kindrel is running on this workstation: leave it first."_s);
+        return refuse(context, running_here);
     if (!agreed(context, mending_question(context)))
         return refuse(context, u"Nothing was changed."_s);
     if (context.order.remove_locks)
@@ -135,6 +137,8 @@ bool mend(const MenderContext& context)
 
 bool unlock(const MenderContext& context)
 {
+    if (!free_to_work(context))
+        return refuse(context, running_here);
     if (!agreed(context, u"Remove every lock and marker of church %1? Nobody may be inside or at work on it."_s.arg(
                              context.place.church)))
         return refuse(context, u"Nothing was changed."_s);
@@ -162,8 +166,21 @@ bool recover(const MenderContext& context)
                     << (table.whole ? QString() : u", a part could not be read"_s) << '\n';
     }
     context.out << "The new church file is '" << order.target << "'; '" << damaged << "' was left as it is.\n"
-                << "To work with it, move the damaged file away, give the new one its name, then mend the church.\n";
+                << "To work with it, set the damaged file aside (kindrel-mender set-aside), give the new one its name, "
+                   "then mend the church.\n";
     return whole;
+}
+
+bool set_aside(const MenderContext& context)
+{
+    if (!free_to_work(context))
+        return refuse(context, running_here);
+    if (!agreed(context, u"Set the damaged church file of church %1 aside, so that the next start begins an empty "
+                         "church? Nobody may be inside."_s.arg(context.place.church)))
+        return refuse(context, u"Nothing was changed."_s);
+    context.out << "The damaged church file lies in '" << core::set_database_aside(context.place) << "' now.\n"
+                << "Start Kindrel, which begins an empty church, and put back a backup with 'Restore Data'.\n";
+    return true;
 }
 
 struct Named
@@ -172,7 +189,7 @@ struct Named
     MenderCommand command;
 };
 constexpr std::array commands{Named{u"check", check}, Named{u"mend", mend}, Named{u"unlock", unlock},
-                              Named{u"recover", recover}};
+                              Named{u"recover", recover}, Named{u"set-aside", set_aside}};
 
 } // namespace
 

@@ -20,7 +20,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int own_folders = 5;
 constexpr qsizetype longest_path = 250; ///< That the settings can hold.
 
 const QString failed = u"Backup failed because:-"_s;
@@ -31,19 +30,14 @@ const QString not_noted = u"The backup is made, but its settings could not be ke
 int folder_in_turn(const Office& office)
 {
     const int next = office.side.backup.number("next_folder");
-    return next >= 1 && next <= own_folders ? next : 1;
-}
-
-QString own_folder(const Office& office, int number)
-{
-    return as_folder(office.paths.file(Folder::church, u"Backup%1"_s.arg(number)));
+    return next >= 1 && next <= own_backup_folders ? next : 1;
 }
 
 /// Throws FileError when the folder that the person chose is not there.
 QString target_folder(const Office& office, const BackupRequest& request)
 {
     if (request.folder.isEmpty()) {
-        const QString folder = own_folder(office, folder_in_turn(office));
+        const QString folder = own_backup_folder(office.paths, folder_in_turn(office));
         make_private_folder(folder);
         return folder;
     }
@@ -86,7 +80,7 @@ void keep_settings(Office& office, const BackupRequest& request)
     SideRecord record = office.side.backup;
     const auto path = to_windows1252(request.folder);
     if (request.folder.isEmpty())
-        record.set_number("next_folder", folder_in_turn(office) % own_folders + 1);
+        record.set_number("next_folder", folder_in_turn(office) % own_backup_folders + 1);
     else if (path && path->size() <= longest_path) // Any other is chosen anew each time.
         record.set_text("path", request.folder);
     record.set_flag("with_pictures", request.choice.with_pictures);
@@ -151,10 +145,17 @@ std::optional<BackupReport> make_backup(Office& office, const BackupRequest& req
 
 ChurchSummary present_state(const Office& office)
 {
-    QStringList tables;
-    for (const CountedKind& kind : counted_kinds())
-        tables += QString::fromUtf16(kind.table);
-    ChurchSummary church = summary_of(*office.session, tables);
+    ChurchSummary church = summary_of(*office.session, {});
+    for (const CountedKind& kind : counted_kinds()) {
+        try {
+            const auto counted = summary_of(*office.session, {QString::fromUtf16(kind.table)});
+            church.rows.insert(counted.rows);
+            if (counted.last_change)
+                church.last_change = counted.last_change;
+        } catch (const DatabaseError&) {
+            // A table that is missing or damaged counts nothing.
+        }
+    }
     church.church = office.church;
     church.church_name = office.church_name;
     return church;

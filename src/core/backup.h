@@ -37,7 +37,8 @@ struct KnownBackup
 /// The newest first. Reads no archive. Throws FileError.
 [[nodiscard]] std::vector<KnownBackup> backups_of(const Office& office);
 
-/// The present state of the church, to be compared with a backup. Throws DatabaseError.
+/// The present state of the church, to be compared with a backup; tables that cannot be read count nothing. Throws
+/// DatabaseError when not even the settings can be read.
 [[nodiscard]] ChurchSummary present_state(const Office& office);
 
 /// What whole-database operations share: the sentences, the folders and the record of what was made.

@@ -33,6 +33,16 @@ bool usable_part(QStringView part)
     return !part.isEmpty() && part.size() <= longest_part && part != u"." && part != u".." && !drive && !control;
 }
 
+void close_to_others(const QString& folder)
+{
+    using std::filesystem::perms;
+    const auto path = QFileInfo(folder).filesystemFilePath();
+    std::error_code ignored;                                                      // Some disks know no permissions.
+    const perms inherited = std::filesystem::status(path, ignored).permissions(); // The data folder's group among them.
+    const perms wanted = (inherited | perms::owner_all | perms::group_all) & ~perms::others_all;
+    std::filesystem::permissions(path, wanted, ignored);
+}
+
 } // namespace
 
 void keep_private(const QString& file)
@@ -47,12 +57,31 @@ void make_private_folder(const QString& folder)
     if (QDir(folder).exists())
         return;
     make_folder(folder);
-    using std::filesystem::perms;
-    const auto path = QFileInfo(folder).filesystemFilePath();
-    std::error_code ignored;                                                      // Some disks know no permissions.
-    const perms inherited = std::filesystem::status(path, ignored).permissions(); // The data folder's group among them.
-    const perms wanted = (inherited | perms::owner_all | perms::group_all) & ~perms::others_all;
-    std::filesystem::permissions(path, wanted, ignored);
+    close_to_others(folder);
+}
+
+void move_privately(const QString& from, const QString& to)
+{
+    move_file(from, to);
+    QFile::setPermissions(to, for_file);
+}
+
+QString mended_place(const Paths& paths, const QString& name)
+{
+    const QString folder = as_folder(paths.file(Folder::church, u"mended"_s));
+    make_private_folder(folder);
+    close_to_others(folder); // It may be older than this rule.
+    const QFileInfo wanted(name);
+    const QString ending = wanted.suffix().isEmpty() ? QString() : u'.' + wanted.suffix();
+    QString file = folder + name;
+    for (int copy = 2; QFileInfo::exists(file); ++copy)
+        file = folder + u"%1 (%2)%3"_s.arg(wanted.completeBaseName()).arg(copy).arg(ending);
+    return file;
+}
+
+QString own_backup_folder(const Paths& paths, int number)
+{
+    return as_folder(paths.file(Folder::church, u"Backup%1"_s.arg(number)));
 }
 
 void flush_to_disk([[maybe_unused]] const QString& path)

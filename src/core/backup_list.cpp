@@ -72,8 +72,8 @@ KnownBackup known(const Remembered& each)
 QStringList folders_of(const Office& office)
 {
     QStringList folders{backup_rules::safety_folder(office)};
-    for (int number = 1; number <= 5; ++number)
-        folders += as_folder(office.paths.file(Folder::church, u"Backup%1"_s.arg(number)));
+    for (int number = 1; number <= own_backup_folders; ++number)
+        folders += own_backup_folder(office.paths, number);
     const QString chosen = office.side.backup.text("path");
     if (!chosen.isEmpty())
         folders += as_folder(chosen);

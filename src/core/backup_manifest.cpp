@@ -88,7 +88,7 @@ ChurchSummary summary_of(Session& session, const QStringList& tables)
         if (const Row* row = code.first())
             church.church_code = row->text(Column{0});
     }
-    {
+    if (tables.contains(u"tbl_surname"_s, Qt::CaseInsensitive)) {
         auto last = session.select(u"SELECT MAX([last_edit]) FROM [tbl_surname];"_s);
         if (const Row* row = last.first())
             church.last_change = row->date(Column{0});
@@ -100,10 +100,13 @@ ChurchSummary summary_of(Session& session, const QStringList& tables)
     return church;
 }
 
-QStringList tables_of_file(Session& church_file)
+QStringList tables_of(Session& session)
 {
-    auto rows = church_file.select(
-        u"SELECT [name] FROM [sqlite_master] WHERE [type]='table' AND substr([name],1,7)<>'sqlite_' ORDER BY [name];"_s);
+    auto rows = session.select(
+        session.engine() == EngineKind::postgres
+            ? u"SELECT [tablename] FROM [pg_tables] WHERE [schemaname]='public' ORDER BY [tablename];"_s
+            : u"SELECT [name] FROM [sqlite_master] WHERE [type]='table' AND substr([name],1,7)<>'sqlite_' "
+              "ORDER BY [name];"_s);
     QStringList tables;
     for (const Row& row : rows)
         tables += row.text(Column{0});

@@ -20,10 +20,10 @@ struct ChurchSummary
     QMap<QString, qint64> rows; ///< By the names of tables, in small letters.
 };
 
-/// Reads church_code, schema, last change and the rows of `tables`. Throws DatabaseError.
+/// Reads church_code, schema and the rows of `tables`, and with `tbl_surname` the last change. Throws DatabaseError.
 [[nodiscard]] ChurchSummary summary_of(Session& session, const QStringList& tables);
-/// The tables of a church file.
-[[nodiscard]] QStringList tables_of_file(Session& church_file);
+/// The tables that there are, sorted by their names.
+[[nodiscard]] QStringList tables_of(Session& session);
 
 struct ManifestEntry
 {

@@ -110,7 +110,7 @@ bool is_as_described(const QString& file, const ChurchSummary& described)
     try {
         check_church_file(file);
         const auto session = open_sqlite(file);
-        const ChurchSummary found = summary_of(*session, tables_of_file(*session));
+        const ChurchSummary found = summary_of(*session, tables_of(*session));
         return found.rows == described.rows && found.schema == described.schema &&
                found.church_code == described.church_code && !holds_triggers(*session);
     } catch (const DatabaseError&) {

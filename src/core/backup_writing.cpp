@@ -22,6 +22,7 @@ namespace {
 constexpr qint64 bytes_to_spare = 4'000'000;
 constexpr qint64 hashed_at_once = 1 << 18;
 constexpr qint64 days_unfinished_kept = 1;
+constexpr int attempts = 2; ///< At files that somebody changes meanwhile.
 const QString unfinished = u".unfinished"_s;
 
 /// A file of the church and the name that it bears in the archive.
@@ -87,7 +88,7 @@ QString copy_database(Office& office, const QString& church_code, const WorkFold
 ChurchSummary summary_of_copy(const Office& office, const QString& copy)
 {
     const auto session = open_sqlite(copy);
-    ChurchSummary church = summary_of(*session, tables_of_file(*session));
+    ChurchSummary church = summary_of(*session, tables_of(*session));
     church.church = office.church;
     church.church_name = office.church_name;
     return church;
@@ -163,8 +164,49 @@ BackupContents check_archive(const QString& path, const ArchiveJob& job, const M
     const OpenBackup backup(path, job.password);
     if (backup.manifest.entries != manifest.entries)
         throw BackupError(BackupFault::damaged, u"The backup holds something else than was written."_s);
-    unpack(backup, work.file(u"check/"_s), Unpack::database, meter);
+    const WorkFolder checked(work.file(u"check"_s));
+    unpack(backup, checked.file({}), Unpack::database, meter);
     return contents_of(backup, job.folder + job.name);
+}
+
+/// What an archive is made of.
+struct Content
+{
+    std::vector<Source> sources;
+    Manifest manifest = {};
+};
+
+BackupContents put_together(const Office& office, const ArchiveJob& job, Content& content, const WorkFolder& work,
+                            ByteMeter& meter)
+{
+    const QString copy = content.sources.back().path;
+    content.manifest = describe(office, job.choice, copy, content.sources, meter);
+    Draft draft(job.folder + job.name);
+    fill_archive(draft.path(), job, content.manifest, content.sources, meter);
+    const BackupContents contents = check_archive(draft.path(), job, content.manifest, work, meter);
+    draft.appear();
+    return contents;
+}
+
+bool was_changed(const Source& source, const Manifest& manifest, ByteMeter& meter)
+{
+    if (!QFileInfo::exists(source.path))
+        return true;
+    const auto listed = std::ranges::lower_bound(manifest.entries, source.name, {}, &ManifestEntry::name);
+    try {
+        return listed != manifest.entries.end() && listed->name == source.name && hashed(source, meter) != *listed;
+    } catch (const FileError&) {
+        return false; // It cannot be read, which was told.
+    }
+}
+
+/// In words, what kind of file is not as it was when it was described; empty when all are.
+QString changed_kind(const Content& content, ByteMeter& meter)
+{
+    const auto changed = std::ranges::find_if(
+        content.sources, [&](const Source& source) { return was_changed(source, content.manifest, meter); });
+    const BackupPart* part = changed == content.sources.end() ? nullptr : part_of(changed->name);
+    return part ? QString::fromUtf16(part->words) : QString();
 }
 
 } // namespace
@@ -179,17 +221,26 @@ BackupContents write_archive(Office& office, const ArchiveJob& job, Progress& pr
     if (!progress.step())
         throw Cancelled();
 
-    auto sources = sources_of(office, job.choice);
-    sources.push_back({database_entry, copy, QFileInfo(copy).size()});
-    demand_space(office, job.folder, bytes_in(sources) + sources.back().size);
+    Content content{sources_of(office, job.choice)};
+    const Source database{database_entry, copy, QFileInfo(copy).size()};
+    content.sources.push_back(database);
+    demand_space(office, job.folder, bytes_in(content.sources) + database.size);
     constexpr int times_read = 3; // Described, written and compared.
-    ByteMeter meter(progress, times_read * bytes_in(sources));
-    const Manifest manifest = describe(office, job.choice, copy, sources, meter);
-    Draft draft(job.folder + job.name);
-    fill_archive(draft.path(), job, manifest, sources, meter);
-    const BackupContents contents = check_archive(draft.path(), job, manifest, work, meter);
-    draft.appear();
-    return contents;
+    ByteMeter meter(progress, times_read * bytes_in(content.sources));
+    for (int attempt = 1;; ++attempt) {
+        try {
+            return put_together(office, job, content, work, meter);
+        } catch (const std::runtime_error&) {
+            const QString kind = changed_kind(content, meter);
+            if (kind.isEmpty())
+                throw;
+            if (attempt == attempts)
+                throw FileError(u"One of the %1 was changed while the backup was made. Make it again when nobody is "
+                                "working on them."_s.arg(kind.toLower()));
+        }
+        content = {sources_of(office, job.choice)};
+        content.sources.push_back(database);
+    }
 }
 
 QString archive_name(const Office& office, const QString& folder)

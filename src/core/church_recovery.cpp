@@ -1,5 +1,6 @@
 #include "core/church_recovery.h"
 
+#include "core/backup_manifest.h"
 #include "core/damaged_file.h"
 #include "core/files.h"
 #include "core/schema.h"
@@ -18,15 +19,6 @@ using namespace Qt::StringLiterals;
 namespace {
 
 constexpr std::size_t rows_at_once = 2000;
-
-QStringList tables_of(Session& church_file)
-{
-    auto rows = church_file.select(u"SELECT [name] FROM [sqlite_master] WHERE [type]='table' ORDER BY [name];"_s);
-    QStringList tables;
-    for (const Row& row : rows)
-        tables += row.text(Column{0});
-    return tables;
-}
 
 /// Those of the table's fields that the damaged file knows too.
 QStringList shared_fields(Session& fresh, const QString& table, const QStringList& known)

@@ -5,7 +5,10 @@
 #include <sqlite3.h>
 
 #include <algorithm>
+#include <deque>
 #include <limits>
+#include <numeric>
+#include <optional>
 
 namespace kindrel::core {
 
@@ -16,8 +19,8 @@ namespace {
 using RowId = qint64;
 constexpr RowId first_row = std::numeric_limits<RowId>::min();
 constexpr RowId last_row = std::numeric_limits<RowId>::max();
-/// How far to look behind the last row that can be read from the front, where none can be read from the back.
-constexpr RowId looked_ahead = 65536;
+constexpr RowId highest_key = std::numeric_limits<int>::max();
+constexpr RowId looked_closely = 16384;
 
 struct Finalize
 {
@@ -65,26 +68,17 @@ public:
     {
         if (!m_upward || !m_downward)
             return false;
-        const auto front = pass(*m_upward, first_row, last_row);
-        if (front.whole)
+        const std::optional<Range> rest = trimmed({first_row, last_row});
+        if (!rest)
             return true;
-        const RowId low = front.any ? front.last + 1 : first_row;
-        const auto back = pass(*m_downward, low, last_row);
-        if (back.whole)
-            return true;
-        if (back.any)
-            between(low, back.last - 1);
-        else
-            between(std::max<RowId>(low, 1), std::max<RowId>(low, 1) + looked_ahead);
-        return m_whole;
+        search(*rest);
+        return false;
     }
 
 private:
-    struct Pass
+    struct Range
     {
-        bool whole = false;
-        bool any = false;
-        RowId last = 0;
+        RowId from, to;
     };
 
     static QString text(const QString& table, const QStringList& fields, const QString& direction)
@@ -93,40 +87,62 @@ private:
             fields.join(u"],["_s), table, direction);
     }
 
-    Pass pass(sqlite3_stmt& statement, RowId from, RowId to)
+    /// Hands on the rows from one end of the range and leaves in it what lies behind the first that cannot be read.
+    /// False when nothing is left. Damaged pages may lead anywhere: a row out of turn ends the pass.
+    bool pass(sqlite3_stmt& statement, Range& range, bool upward)
     {
-        sqlite3_bind_int64(&statement, 1, from);
-        sqlite3_bind_int64(&statement, 2, to);
-        Pass result;
+        sqlite3_bind_int64(&statement, 1, range.from);
+        sqlite3_bind_int64(&statement, 2, range.to);
         int code = SQLITE_ROW;
-        while ((code = sqlite3_step(&statement)) == SQLITE_ROW) {
-            result.any = true;
-            result.last = sqlite3_column_int64(&statement, 0);
+        bool left = true;
+        while (left && (code = sqlite3_step(&statement)) == SQLITE_ROW) {
+            const RowId row = sqlite3_column_int64(&statement, 0);
+            if (row < range.from || row > range.to)
+                break;
             hand_on(statement);
+            left = range.from < range.to && row != (upward ? range.to : range.from);
+            if (left)
+                (upward ? range.from : range.to) = upward ? row + 1 : row - 1;
         }
         sqlite3_reset(&statement);
-        result.whole = code == SQLITE_DONE;
-        return result;
+        return left && code != SQLITE_DONE;
     }
 
-    /// Halves the range until what cannot be read stands alone.
-    void between(RowId from, RowId to)
+    /// What is left of the range once both its ends were read; nullopt when all of it was.
+    std::optional<Range> trimmed(Range range)
     {
-        while (from <= to) {
-            const auto found = pass(*m_upward, from, to);
-            if (found.whole)
-                return;
-            if (found.any)
-                from = found.last + 1;
-            if (from >= to) {
-                m_whole = false;
-                return;
-            }
-            const RowId middle = from + (to - from) / 2;
-            between(from, middle);
-            from = middle + 1;
+        const bool left = pass(*m_upward, range, true) && pass(*m_downward, range, false);
+        return left ? std::optional(range) : std::nullopt;
+    }
+
+    /// Keys count from 1 and most follow each other: what is farther off is not looked through as closely.
+    void search(Range range)
+    {
+        if (range.from < 1)
+            (void)trimmed({range.from, std::min<RowId>(range.to, 0)});
+        range.from = std::max<RowId>(range.from, 1);
+        if (range.to == last_row)
+            range.to = std::max(range.from, highest_key);
+        RowId width = looked_closely;
+        halve({{range.from, std::min(range.to, range.from + width)}}, 4 * looked_closely);
+        std::deque<Range> far;
+        for (; range.to - range.from > width; width *= 2)
+            far.push_back({range.from + width + 1, std::min(range.to, range.from + 2 * width)});
+        halve(std::move(far), looked_closely);
+    }
+
+    /// Halves the ranges, the widest first, until what cannot be read stands alone or was looked for often enough.
+    void halve(std::deque<Range> ranges, RowId most_looks)
+    {
+        for (RowId look = 0; !ranges.empty() && look < most_looks; ++look) {
+            const auto left = trimmed(ranges.front());
+            ranges.pop_front();
+            if (!left || left->from == left->to)
+                continue;
+            const RowId middle = std::midpoint(left->from, left->to);
+            ranges.push_back({left->from, middle});
+            ranges.push_back({middle + 1, left->to});
         }
-        m_whole = false;
     }
 
     void hand_on(sqlite3_stmt& row)
@@ -139,7 +155,6 @@ private:
 
     Statement m_upward, m_downward;
     const DamagedFile::Sink& m_sink;
-    bool m_whole = true;
 };
 
 } // namespace

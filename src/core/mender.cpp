@@ -1,8 +1,11 @@
 #include "core/mender.h"
 
+#include "core/backup_files.h"
+#include "core/backup_manifest.h"
 #include "core/locks.h"
 #include "core/marker.h"
 #include "core/mender_checks.h"
+#include "core/open_church.h"
 #include "core/restore_swap.h"
 #include "core/side_files.h"
 #include "core/sqlite_session.h"
@@ -19,6 +22,14 @@ using namespace Qt::StringLiterals;
 namespace {
 
 namespace checks = mender_checks;
+
+const QString backup_or_recover =
+    u"Set the damaged file aside (kindrel-mender set-aside), start Kindrel, which begins an empty church then, and put "
+    "back a backup with 'Restore Data'. Without a backup, let what can still be read be recovered into a new church "
+    "file (kindrel-mender recover)."_s;
+const QString locked_by_marker =
+    u"The church is locked by 'lock.dat': another user is either compacting files, backing them up or restoring them. "
+    "When nobody is, unlock the church first."_s;
 
 constexpr std::array own_checks{
     Check{Check::On::rows, checks::examine_engine, checks::mend_engine},
@@ -44,8 +55,7 @@ std::vector<Check> with_own(std::span<const Check> more)
 
 Finding closed_database(const QString& why)
 {
-    return {u"closed"_s, u"The church's database cannot be opened: %1"_s.arg(why), 1, Cure::recover,
-            u"Put back a backup, or let what can still be read be recovered into a new church file."_s};
+    return {u"closed"_s, u"The church's database cannot be opened: %1"_s.arg(why), 1, Cure::recover, backup_or_recover};
 }
 
 /// A check that fails tells of a damage too.
@@ -92,8 +102,7 @@ QStringList others_inside(MenderPlace& place)
 QString refusal_for(MenderPlace& place, const Findings& findings)
 {
     if (!place.session || has(findings, u"damaged"))
-        return u"The database itself is damaged and cannot be mended in its place. Put back a backup, or let what can "
-               "still be read be recovered into a new church file."_s;
+        return u"The database itself is damaged and cannot be mended in its place. "_s + backup_or_recover;
     if (has(findings, u"version"))
         return u"The database is of another version of the program and is left alone."_s;
     const auto by_hand = [](const Finding& finding) {
@@ -102,25 +111,35 @@ QString refusal_for(MenderPlace& place, const Findings& findings)
     if (place.session->engine() == EngineKind::postgres && std::ranges::any_of(findings, by_hand))
         return u"Entries that must differ are there more than once, so that the church cannot be copied, and nothing is "
                "mended without a copy. Put them right by hand first."_s;
-    QStringList inside;
-    try {
-        inside = others_inside(place);
-    } catch (const DatabaseError&) {
-        // Without the lock tables nobody can be inside.
-    }
-    if (!inside.isEmpty())
-        return u"Somebody may be working in the church:\n%1\nWhen nobody is, unlock the church first."_s.arg(
-            inside.join(u'\n'));
     return {};
 }
 
-QStringList tables_of(Session& church_file)
+/// Tells it also where the names of what is locked cannot be read.
+bool nothing_locked(Session& session)
 {
-    auto rows = church_file.select(u"SELECT [name] FROM [sqlite_master] WHERE [type]='table' ORDER BY [name];"_s);
-    QStringList tables;
-    for (const Row& row : rows)
-        tables += row.text(Column{0});
-    return tables;
+    try {
+        return std::ranges::all_of(checks::lock_tables(), [&](const QString& table) {
+            return checks::number_from(session, u"SELECT COUNT(*) FROM [%1];"_s.arg(table)) == 0;
+        });
+    } catch (const DatabaseError&) {
+        return false;
+    }
+}
+
+/// Why somebody may be inside; empty when nobody is. Locks that cannot be read may be anybody's.
+QString inside(MenderPlace& place)
+{
+    try {
+        const auto others = others_inside(place);
+        return others.isEmpty() ? QString()
+                                : u"Somebody may be working in the church:\n%1\nWhen nobody is, unlock the church "
+                                  "first."_s.arg(others.join(u'\n'));
+    } catch (const DatabaseError& error) {
+        if (nothing_locked(*place.session))
+            return {};
+        return u"It cannot be told whether somebody is working in the church, since its locks cannot be read: %1\nWhen "
+               "nobody is, unlock the church first."_s.arg(error.text());
+    }
 }
 
 /// The copy must be sound and hold as many rows as the church. What is about to be mended does not count.
@@ -179,6 +198,34 @@ void mend_all(MenderPlace& place, std::span<const Check> all)
     }
 }
 
+/// What could not be settled because the record of the restore is damaged, in words: it lies in `mended` now.
+QString settle_cut_off_restore(MenderPlace& place)
+{
+    try {
+        settle_interrupted_restore(place.paths, *place.session);
+        return {};
+    } catch (const FileError& error) {
+        if (restore_unsettled(place.paths))
+            throw;
+        return error.text();
+    }
+}
+
+/// Mends behind the marker, which keeps everybody else out from before the look at the locks.
+void mend_alone(MenderPlace& place, std::span<const Check> all, Mending& mending)
+{
+    const auto busy = Marker::take(place.paths, side_files::busy);
+    mending.refusal = busy ? inside(place) : locked_by_marker;
+    if (!mending.refusal.isEmpty())
+        return;
+    make_fit_for_copy(place);
+    mending.copy = copy_before_mending(place);
+    if (const auto told = settle_cut_off_restore(place); !told.isEmpty())
+        mending.left.push_back({u"leftovers"_s, told, 1, Cure::by_hand,
+                                u"Look at the pictures, pages and letters, or restore a backup once more."_s});
+    mend_all(place, all);
+}
+
 /// Findings that are gone from `now`.
 Findings without(const Findings& before, const Findings& now)
 {
@@ -197,6 +244,17 @@ bool remove_marker(const MenderPlace& place, const SideFile& marker)
         return false;
     remove_file(place.paths.file(marker.folder, name));
     return true;
+}
+
+/// Locks that nobody can name any more.
+QStringList empty_lock_tables(Session& session)
+{
+    QStringList removed;
+    for (const auto& table : checks::lock_tables()) {
+        if (const int count = session.execute(u"DELETE FROM [%1];"_s.arg(table)); count > 0)
+            removed += u"%1 in '%2'"_s.arg(counted(count, u"lock"_s, u"locks"_s), table);
+    }
+    return removed;
 }
 
 QStringList remove_locks(MenderPlace& place)
@@ -229,29 +287,28 @@ Mending mend_church(MenderPlace& place, std::span<const Check> more)
     mending.refusal = refusal_for(place, before);
     if (!mending.refusal.isEmpty())
         return mending;
-    if (std::ranges::any_of(before, [](const Finding& finding) { return finding.cure == Cure::mend; })) {
-        const auto busy = Marker::take(place.paths, side_files::busy);
-        if (!busy) {
-            mending.refusal = u"The church is locked by 'lock.dat': another user is either compacting files, backing "
-                              "them up or restoring them. When nobody is, unlock the church first."_s;
-            return mending;
-        }
-        make_fit_for_copy(place);
-        mending.copy = copy_before_mending(place);
-        settle_interrupted_restore(place.paths, *place.session);
-        mend_all(place, with_own(more));
-    }
-    mending.left = examine_church(place, more);
+    if (std::ranges::any_of(before, [](const Finding& finding) { return finding.cure == Cure::mend; }))
+        mend_alone(place, with_own(more), mending);
+    if (!mending.refusal.isEmpty())
+        return mending;
+    add_new(mending.left, examine_church(place, more));
     mending.mended = without(before, mending.left);
     return mending;
 }
 
 QStringList unlock_church(MenderPlace& place)
 {
+    demand_no_restore(place.paths);
     QStringList removed;
     if (place.session) {
-        settle_interrupted_restore(place.paths, *place.session);
-        removed = remove_locks(place);
+        if (const auto told = settle_cut_off_restore(place); !told.isEmpty())
+            removed += told;
+        checks::make_lock_tables(place);
+        try {
+            removed += remove_locks(place);
+        } catch (const DatabaseError&) {
+            removed += empty_lock_tables(*place.session);
+        }
     }
     for (const auto* marker : {&side_files::busy, &side_files::opening}) {
         if (remove_marker(place, *marker))
@@ -260,20 +317,38 @@ QStringList unlock_church(MenderPlace& place)
     return removed;
 }
 
+QString set_database_aside(MenderPlace& place)
+{
+    if (place.paths.exists(Folder::church, connection_file.toString()))
+        throw FileError(u"This church lies on a server: there is no file of it that could be set aside."_s);
+    const QString file = place.paths.database();
+    if (!QFileInfo::exists(file))
+        throw FileError(u"There is no church file: start Kindrel and restore a backup."_s);
+    const auto found = examine_church(place, {});
+    if (std::ranges::none_of(found, [](const Finding& finding) { return finding.cure == Cure::recover; }))
+        throw FileError(u"The church file is not damaged: start Kindrel to restore a backup."_s);
+    const auto busy = Marker::take(place.paths, side_files::busy);
+    if (!busy)
+        throw FileError(locked_by_marker);
+    place.session.reset();
+    const QString time = place.clock.now().toString(u"yyyy-MM-dd HHmmss");
+    const QString aside = mended_place(place, u"KR10_records set aside %1.kdl"_s.arg(time));
+    const QString journal = u"-journal"_s;
+    if (QFileInfo::exists(file + journal)) // First, since it must never come to stand beside another database.
+        move_privately(file + journal, aside + journal);
+    move_privately(file, aside);
+    place.why_closed = u"'%1' is missing."_s.arg(file);
+    return aside;
+}
+
 QString mended_place(const MenderPlace& place, const QString& name)
 {
-    const QString folder = as_folder(place.paths.file(Folder::church, u"mended"_s));
-    make_folder(folder);
-    const QFileInfo wanted(name);
-    QString file = folder + name;
-    for (int copy = 2; QFileInfo::exists(file); ++copy)
-        file = folder + u"%1 (%2).%3"_s.arg(wanted.completeBaseName()).arg(copy).arg(wanted.suffix());
-    return file;
+    return mended_place(place.paths, name);
 }
 
 void set_aside(const MenderPlace& place, const QString& file)
 {
-    move_file(file, mended_place(place, QFileInfo(file).fileName()));
+    move_privately(file, mended_place(place, QFileInfo(file).fileName()));
 }
 
 QString counted(int count, const QString& one, const QString& many)

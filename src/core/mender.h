@@ -64,8 +64,14 @@ struct Mending
 /// the rows are then as they were.
 [[nodiscard]] Mending mend_church(MenderPlace& place, std::span<const Check> more);
 
-/// Removes every lock and every marker of the church, whoever left it; what was removed, in words.
+/// Removes every lock and every marker of the church, whoever left it; what was removed, in words. Throws DatabaseError
+/// or FileError, the latter also while a restore runs.
 QStringList unlock_church(MenderPlace& place);
+
+/// Moves the file of a database that cannot be opened or is damaged into the folder `mended` and tells its place there:
+/// the next start begins an empty church, into which a backup can be restored. Throws FileError when the database is
+/// sound, lies on a server, or somebody is at work on it.
+[[nodiscard]] QString set_database_aside(MenderPlace& place);
 
 /// A place of its own in the church's folder `mended`, which is made, for a file of this name.
 [[nodiscard]] QString mended_place(const MenderPlace& place, const QString& name);

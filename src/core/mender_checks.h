@@ -34,6 +34,10 @@ void mend_side_files(MenderPlace& place);
 
 /// What the embedded engine says of the file, but for indexes that do not fit their tables.
 [[nodiscard]] QStringList faults_of_file(Session& session);
+/// The tables that hold locks; without all of them nobody can tell who is inside.
+[[nodiscard]] QStringList lock_tables();
+/// Makes those again that are missing, without a lock in them.
+void make_lock_tables(MenderPlace& place);
 /// The table as the church office would call it.
 [[nodiscard]] QString in_words(QStringView table);
 /// The first number of the first row; 0 without rows.

@@ -1,3 +1,4 @@
+#include "core/backup_manifest.h"
 #include "core/mender_checks.h"
 #include "core/schema.h"
 #include "core/sqlite_session.h"
@@ -115,6 +116,17 @@ std::vector<std::pair<Piece, Fit>> misfits(Session& church)
     return found;
 }
 
+std::vector<Piece> lock_pieces()
+{
+    Model model;
+    auto pieces = pieces_of(model.session());
+    std::erase_if(pieces, [](const Piece& piece) {
+        return piece.type != u"table" || !piece.statement.contains(u"[workstation]") ||
+               !piece.statement.contains(u"[taken]");
+    });
+    return pieces;
+}
+
 /// The fields of a key that no two rows may share.
 struct Unique
 {
@@ -204,6 +216,23 @@ int number_from(Session& session, const QString& statement)
     auto rows = session.select(statement);
     const Row* row = rows.first();
     return row ? row->integer(Column{0}) : 0;
+}
+
+QStringList lock_tables()
+{
+    QStringList names;
+    for (const auto& piece : lock_pieces())
+        names += piece.name;
+    return names;
+}
+
+void make_lock_tables(MenderPlace& place)
+{
+    const QStringList there = tables_of(*place.session);
+    for (const auto& piece : lock_pieces()) {
+        if (!there.contains(piece.name, Qt::CaseInsensitive))
+            place.session->run_script(piece.statement + u';');
+    }
 }
 
 QString in_words(QStringView table)

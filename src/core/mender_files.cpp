@@ -1,5 +1,6 @@
 #include "core/mender_checks.h"
 
+#include "core/backup_files.h"
 #include "core/restore_swap.h"
 #include "core/side_files.h"
 
@@ -66,7 +67,7 @@ QStringList leftovers(const Paths& paths)
     QStringList found;
     for (const auto& [folder, patterns] :
          {Where{paths.folder(Folder::church), {unfinished, u"compact.kdl"_s}},
-          Where{paths.file(Folder::church, u"Backup1"_s), {unfinished, u"systembackup.new"_s}},
+          Where{own_backup_folder(paths, 1), {unfinished, u"systembackup.new"_s}},
           Where{paths.file(Folder::church, u"compact"_s), {unfinished}},
           Where{paths.file(Folder::church, u"mended"_s), {unfinished}},
           Where{paths.folder(Folder::portrait), {unfinished}}, Where{paths.folder(Folder::notebook), {unfinished}}}) {
@@ -74,11 +75,6 @@ QStringList leftovers(const Paths& paths)
             found += files.next();
     }
     return found;
-}
-
-bool restore_cut_off(const Paths& paths)
-{
-    return QFileInfo(paths.file(Folder::church, u"restore_work"_s)).isDir();
 }
 
 } // namespace
@@ -110,7 +106,7 @@ Findings examine_leftovers(MenderPlace& place)
                                 counted(static_cast<int>(files.size()), u"unfinished file"_s, u"unfinished files"_s),
                                 QFileInfo(files.first()).fileName()),
                             static_cast<int>(files.size()), Cure::mend, u"Moved into the folder 'mended'."_s});
-    if (restore_cut_off(place.paths))
+    if (restore_unsettled(place.paths))
         findings.push_back({u"leftovers"_s, u"A restore was cut off."_s, 1, Cure::mend,
                             u"It is brought to its end, or taken back where the database is still the old one."_s});
     return findings;
@@ -123,7 +119,7 @@ void mend_leftovers(MenderPlace& place)
         if (left.dir().dirName().compare(u"mended"_s, Qt::CaseInsensitive) == 0)
             remove_file(file); // Of an earlier mending, whose copy is not needed.
         else
-            move_file(file, mended_place(place, left.fileName().replace(u".unfinished"_s, u" unfinished"_s)));
+            move_privately(file, mended_place(place, left.fileName().replace(u".unfinished"_s, u" unfinished"_s)));
     }
 }
 
@@ -149,7 +145,9 @@ void mend_side_files(MenderPlace& place)
             continue;
         const QString path = place.paths.file(file->folder, QLatin1String(file->name));
         const auto content = read_file(path);
-        write_file(mended_place(place, QFileInfo(path).fileName()), *content);
+        const QString copy = mended_place(place, QFileInfo(path).fileName());
+        write_file(copy, *content);
+        keep_private(copy);
         write_side_file(place.paths, salvaged(*file, *content));
     }
 }

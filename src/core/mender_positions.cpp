@@ -80,17 +80,12 @@ int lists_in_disorder(Session& session, const Ordered& list)
     return number_from(session, u"SELECT COUNT(*) FROM (%1) d;"_s.arg(disorder(list)));
 }
 
-struct Place
-{
-    qint64 key, position;
-};
-
-/// The rows whose place is not the one that counting gives.
-std::vector<Place> right_places(Session& session, const Ordered& list)
+/// Key and place of the rows whose place is not the one that counting gives.
+std::vector<std::vector<Value>> right_places(Session& session, const Ordered& list)
 {
     auto rows = session.select(rows_in_disorder(list));
     const int columns = rows.column_count();
-    std::vector<Place> wrong;
+    std::vector<std::vector<Value>> wrong;
     std::vector<qint64> apart;
     qint64 place = 0;
     for (const Row& row : rows) {
@@ -100,7 +95,7 @@ std::vector<Place> right_places(Session& session, const Ordered& list)
         place = here == apart ? place + 1 : 1;
         apart = here;
         if (row.number(Column{1}) != place)
-            wrong.push_back({row.number(Column{0}), place});
+            wrong.push_back({row.value(Column{0}), place});
     }
     return wrong;
 }
@@ -130,10 +125,10 @@ void mend_positions(MenderPlace& place)
     for (const auto& list : ordered) {
         if (lists_in_disorder(*place.session, list) == 0)
             continue;
-        const QString update =
-            u"UPDATE [%1] SET [position]=? WHERE [%2]=?;"_s.arg(QStringView(list.table), QStringView(list.key));
-        for (const auto& [key, position] : right_places(*place.session, list))
-            place.session->execute(update, position, key);
+        place.session->fill_temporary(u"mender_places"_s, {u"key"_s, u"place"_s}, right_places(*place.session, list));
+        place.session->execute(
+            u"UPDATE [%1] SET [position]=(SELECT r.[place] FROM [mender_places] r WHERE r.[key]=[%1].[%2]) "
+            "WHERE [%2] IN (SELECT [key] FROM [mender_places]);"_s.arg(QStringView(list.table), QStringView(list.key)));
     }
 }
 

@@ -1,5 +1,6 @@
 #include "core/mender_checks.h"
 
+#include "core/backup_manifest.h"
 #include "core/locks.h"
 #include "core/references.h"
 #include "core/removal.h"
@@ -82,12 +83,18 @@ const Home& home_of(Entity entity)
     return *std::ranges::find(homes(), entity, &Home::entity);
 }
 
-/// Keys of the reference that its own entity lacks: "FROM … WHERE …" behind a SELECT. Templates share one entity.
-QString lost(const char* table, const char* field, Entity to)
+bool has(const QStringList& tables, const char* table)
+{
+    return tables.contains(name_of(table), Qt::CaseInsensitive);
+}
+
+/// Keys of the reference that its own entity lacks: "FROM … WHERE …" behind a SELECT. Templates share one entity; one
+/// of which no table is there lacks every key.
+QString lost(const QStringList& tables, const char* table, const char* field, Entity to)
 {
     QString text = u"FROM [%1] o WHERE o.[%2] IS NOT NULL AND o.[%2]<>0"_s.arg(name_of(table), name_of(field));
     for (const auto& home : homes()) {
-        if (home.entity == to)
+        if (home.entity == to && has(tables, home.table))
             text += u" AND o.[%1] NOT IN (SELECT [%2] FROM [%3])"_s.arg(name_of(field), name_of(home.field),
                                                                         name_of(home.table));
     }
@@ -111,15 +118,15 @@ std::vector<int> keys_from(Session& session, const QString& statement)
     return keys;
 }
 
-std::vector<int> lost_keys(Session& session, const Revival& revival)
+std::vector<int> lost_keys(Session& session, const QStringList& tables, const Revival& revival)
 {
     return keys_from(session, u"SELECT DISTINCT o.[%1] %2 ORDER BY o.[%1];"_s.arg(
-                                  name_of(revival.field), lost(revival.table, revival.field, revival.entity)));
+                                  name_of(revival.field), lost(tables, revival.table, revival.field, revival.entity)));
 }
 
-void revive(Session& session, const Revival& revival)
+void revive(Session& session, const QStringList& tables, const Revival& revival)
 {
-    const auto keys = lost_keys(session, revival);
+    const auto keys = lost_keys(session, tables, revival);
     if (keys.empty())
         return;
     const Home& home = home_of(revival.entity);
@@ -150,10 +157,42 @@ const Home* own_home(const Reference& reference)
     return found == all.end() ? nullptr : &*found;
 }
 
-/// Removes the entries of the reference whose owner is gone, with what hangs on them.
-void remove_lost(Session& session, const Reference& reference)
+/// Owners that entries name and that are gone for good, beside those that are there.
+struct Owners
 {
-    const QString from = lost(reference.table, reference.field, reference.to);
+    int missing = 0, present = 0;
+
+    /// Not a few owners are gone but most of their table, and what hangs on them must not follow.
+    [[nodiscard]] bool lost() const { return missing > present; }
+};
+
+Owners owners_of(Session& session, const QStringList& tables, const Reference& reference)
+{
+    const QString field = name_of(reference.field);
+    QString from = lost(tables, reference.table, reference.field, reference.to);
+    Owners owners;
+    for (const auto& revival : revivals) {
+        if (revival.entity != reference.to || !has(tables, revival.table))
+            continue;
+        from += u" AND o.[%1] NOT IN (SELECT r.[%2] FROM [%3] r WHERE r.[%2] IS NOT NULL)"_s.arg(
+            field, name_of(revival.field), name_of(revival.table));
+        owners.present += static_cast<int>(lost_keys(session, tables, revival).size());
+    }
+    owners.missing = number_from(session, u"SELECT COUNT(DISTINCT o.[%1]) %2;"_s.arg(field, from));
+    for (const auto& home : homes()) {
+        if (home.entity == reference.to && has(tables, home.table))
+            owners.present += number_from(session, u"SELECT COUNT(*) FROM [%1];"_s.arg(name_of(home.table)));
+    }
+    return owners;
+}
+
+/// Removes the entries of the reference whose owner is gone, with what hangs on them.
+void remove_lost(Session& session, const QStringList& tables, const Reference& reference)
+{
+    const QString from = lost(tables, reference.table, reference.field, reference.to);
+    const int count = number_from(session, u"SELECT COUNT(*) %1;"_s.arg(from));
+    if (count == 0 || owners_of(session, tables, reference).lost())
+        return;
     if (const Home* home = own_home(reference)) {
         remove_entities(session, home->entity,
                         keys_from(session, u"SELECT o.[%1] %2;"_s.arg(name_of(home->field), from)));
@@ -182,6 +221,16 @@ Finding lost_finding(const Reference& reference, int count)
                                                                               in_words(name_of(reference.table)),
                                                                               owner_in_words(reference.to)),
             count, Cure::mend, u"They are removed; the copy made before mending keeps them."_s};
+}
+
+Finding lost_table_finding(Entity entity, const Owners& owners)
+{
+    return {u"lost_table"_s,
+            u"Most of '%1' is gone: other entries speak of %2 that are missing, and %3 %4 left."_s.arg(
+                owner_in_words(entity), QString::number(owners.missing), QString::number(owners.present),
+                owners.present == 1 ? u"is"_s : u"are"_s),
+            owners.missing, Cure::by_hand,
+            u"Put back a backup, which has them. Until then nothing that hangs on them is removed."_s};
 }
 
 QString lacking(const Companion& pair)
@@ -222,31 +271,43 @@ std::map<QString, qint64> counters_behind(Session& session)
 
 Findings examine_orphans(MenderPlace& place)
 {
+    Session& session = *place.session;
+    const QStringList tables = tables_of(session);
     Findings findings;
+    std::map<Entity, Owners> lost_tables;
     for (const auto& reference : references()) {
-        if (reference.bond == Bond::keep)
+        if (reference.bond == Bond::keep || !has(tables, reference.table))
             continue;
-        const int count = number_from(*place.session, u"SELECT COUNT(*) "_s +
-                                                          lost(reference.table, reference.field, reference.to) + u';');
-        if (count > 0)
+        const QString from = lost(tables, reference.table, reference.field, reference.to);
+        const int count = number_from(session, u"SELECT COUNT(*) %1;"_s.arg(from));
+        if (count == 0)
+            continue;
+        const Owners owners = revival_by(reference) ? Owners{} : owners_of(session, tables, reference);
+        if (!owners.lost()) {
             findings.push_back(lost_finding(reference, count));
+        } else if (auto& worst = lost_tables[reference.to]; worst.missing < owners.missing) {
+            worst = owners;
+        }
     }
+    for (const auto& [entity, owners] : lost_tables)
+        findings.push_back(lost_table_finding(entity, owners));
     return findings;
 }
 
 void mend_orphans(MenderPlace& place)
 {
     Session& session = *place.session;
+    const QStringList tables = tables_of(session);
     for (int number = 1; number <= entity_count; ++number) {
         const auto entity = static_cast<Entity>(number);
         // Entries of who is gone went before, so that nothing comes back for their sake.
         for (const auto& revival : revivals) {
             if (revival.entity == entity)
-                revive(session, revival);
+                revive(session, tables, revival);
         }
         for (const auto& reference : references()) {
             if (reference.to == entity && reference.bond != Bond::keep)
-                remove_lost(session, reference);
+                remove_lost(session, tables, reference);
         }
     }
 }
@@ -316,6 +377,15 @@ void mend_counters(MenderPlace& place)
 Findings examine_locks(MenderPlace& place)
 {
     Findings findings;
+    const QStringList there = tables_of(*place.session);
+    for (const auto& table : lock_tables()) {
+        if (there.contains(table, Qt::CaseInsensitive))
+            continue;
+        findings.push_back({u"locks"_s, u"Without the table '%1' nobody can tell who is in the church."_s.arg(table), 1,
+                            Cure::unlock, u"When nobody is inside, unlock the church: the table is made again."_s});
+    }
+    if (!findings.empty())
+        return findings;
     for (const auto& lock : Locks(*place.session, place.workstation, place.clock).all()) {
         if (lock.holder.this_workstation && !lock.stale)
             continue; // A program that is at work here.

@@ -12,6 +12,7 @@
 #include "core/sqlite_session.h"
 
 #include <QDir>
+#include <QFile>
 #include <QFileInfo>
 
 #include <algorithm>
@@ -35,14 +36,24 @@ const QString church_unknown =
     "it nevertheless?"_s;
 const QString replace_question = u"Do you wish to replace the data of '%1' by the backup of %2?"_s;
 const QString present_unkept =
-    u"Unable to back up the present data, so restoring could not be taken back. Do you wish to restore nevertheless?"_s;
+    u"Unable to back up the present data, so restoring could not be taken back. Do you wish to restore nevertheless? "
+    "The present files are copied as they are."_s;
+const QString inside_unknown =
+    u"It cannot be told whether somebody is working in this church. Do you wish to restore nevertheless?"_s;
+const QString unchecked = u"unchecked_"_s;
 const QString newer = u"This backup was made by a newer edition of Kindrel, you need to obtain the latest update."_s;
 const QString older = u"This backup was made by an edition of Kindrel that is too old to be restored."_s;
 
 /// True when nobody holds a lock. Those that a program of this workstation left behind when it failed do not count.
 bool nobody_inside(Office& office)
 {
-    auto held = Locks(office).all();
+    std::vector<HeldLock> held;
+    try {
+        held = Locks(office).all();
+    } catch (const DatabaseError& error) { // A damage that the restore would take away.
+        return office.dialogue.confirm({.text = inside_unknown, .more = error.text(), .icon = Icon::question},
+                                       Answer::no);
+    }
     std::erase_if(held, &HeldLock::stale);
     if (held.empty())
         return true;
@@ -162,8 +173,33 @@ std::vector<Swap> swaps_for(const Office& office, const Manifest& manifest, cons
     return swaps;
 }
 
-/// The present state, compared like any backup; empty when its database is too damaged and the person goes on.
-QString keep_present(Office& office, const Manifest& manifest, Progress& progress)
+/// Leaves out what cannot be read.
+void copy_readable(const QString& from, const QString& to)
+{
+    if (QFile(from).open(QIODevice::ReadOnly)) {
+        make_private_folder(QFileInfo(to).path());
+        copy_file(from, to);
+    }
+}
+
+/// The present database and files as they are, in a folder of their own. Throws FileError.
+QString copy_unchecked(const Office& office, const QString& folder)
+{
+    demand_space(office, folder, bytes_of_church(office, {}));
+    const QString target = folder + unchecked + QFileInfo(archive_name(office, folder)).completeBaseName() + u'/';
+    for (const QString& ending : {QString(), u"-journal"_s})
+        copy_readable(office.paths.database() + ending, target + database_entry + ending);
+    for (const BackupPart& part : backup_parts()) {
+        const QString from = office.paths.folder(part.folder);
+        for (const auto& name : files_within(from))
+            copy_readable(from + name, target + QString::fromUtf16(part.name) + name);
+    }
+    return as_folder(target);
+}
+
+/// Keeps the present state: compared like any backup, or as it is when it is too damaged for that and the person goes
+/// on.
+void keep_present(Office& office, RestoreReport& report, Progress& progress)
 {
     const QString folder = backup_rules::safety_folder(office);
     make_private_folder(folder);
@@ -171,16 +207,17 @@ QString keep_present(Office& office, const Manifest& manifest, Progress& progres
     try {
         const auto contents = write_archive(
             office,
-            {.folder = folder, .name = archive_name(office, folder), .church_code = manifest.church.church_code},
+            {.folder = folder, .name = archive_name(office, folder), .church_code = report.restored.church.church_code},
             progress);
         backup_rules::remember(office, contents);
-        return contents.file;
-    } catch (const DatabaseError& error) {
-        why = error.text();
+        report.before = contents.file;
+        return;
+    } catch (const std::runtime_error& error) { // Of the database, a file or the archive.
+        why = QString::fromUtf8(error.what());
     }
     if (!office.dialogue.confirm({.text = present_unkept, .more = why}, Answer::no))
         throw Cancelled();
-    return {};
+    report.before_unchecked = copy_unchecked(office, folder);
 }
 
 void remove_oldest_safety_backups(const Office& office, const QString& just_restored)
@@ -190,6 +227,9 @@ void remove_oldest_safety_backups(const Office& office, const QString& just_rest
         if (QFileInfo(folder + name) != QFileInfo(just_restored))
             remove_file(folder + name);
     }
+    QStringList copies = QDir(folder).entryList({unchecked + u'*'}, QDir::Dirs, QDir::Name | QDir::Reversed);
+    for (const auto& name : copies.mid(safety_backups_kept))
+        QDir(folder + name).removeRecursively();
 }
 
 /// From here on nothing is asked and nothing can be stopped.
@@ -197,12 +237,14 @@ void exchange(Office& office, RestoreWork& work, const std::vector<Swap>& swaps)
 {
     try {
         work.swap(swaps);
+        work.demand_undisturbed();
         office.session->replace_content(work.unpacked() + database_entry);
+        work.demand_undisturbed();
     } catch (...) {
-        settle_interrupted_restore(office.paths, *office.session);
+        work.settle(*office.session);
         throw;
     }
-    settle_interrupted_restore(office.paths, *office.session);
+    work.settle(*office.session);
 }
 
 void demand_space_for(const Office& office, const Manifest& manifest)
@@ -224,7 +266,7 @@ RestoreReport replace(Office& office, const OpenBackup& backup, const RestoreReq
     const auto swaps = swaps_for(office, manifest, work, request.with_shared_files);
 
     RestoreReport report{.restored = contents_of(backup, request.file), .before = {}};
-    report.before = keep_present(office, manifest, progress);
+    keep_present(office, report, progress);
     exchange(office, work, swaps);
     remove_oldest_safety_backups(office, request.file);
     return report;

@@ -17,6 +17,7 @@ struct RestoreReport
 {
     BackupContents restored;
     QString before; ///< The backup of the state before, by which this restore can be taken back; empty without one.
+    QString before_unchecked = {}; ///< Without one: the folder of the files before, copied as they were.
 };
 
 /// Replaces the church by a backup of it, after asking and after backing up the present state. Everything in the

@@ -112,41 +112,64 @@ QSet<qint64> keys_of(Session& session, const QString& statement)
     return keys;
 }
 
-/// The photographs and pages of families and people that are not in the church.
-QStringList orphaned_files(MenderPlace& place)
+/// Photographs and notebook pages by what they belong to.
+struct OwnedFiles
+{
+    QStringList orphaned; ///< Of nobody in the church.
+    QStringList waiting;  ///< The same, where more owners are gone than are left: they may come back with a backup.
+};
+
+OwnedFiles orphaned_files(MenderPlace& place)
 {
     if (!place.session)
         return {};
-    const auto families = keys_of(*place.session, u"SELECT [Surname_ID] FROM [tbl_surname];"_s);
-    const auto people = keys_of(*place.session, u"SELECT [person_id] FROM [tbl_people];"_s);
+    const std::array owners{keys_of(*place.session, u"SELECT [person_id] FROM [tbl_people];"_s),
+                            keys_of(*place.session, u"SELECT [Surname_ID] FROM [tbl_surname];"_s)};
     static const QRegularExpression own(u"^(f?)([0-9]+)[.](jpg|fll)$"_s, QRegularExpression::CaseInsensitiveOption);
-    QStringList found;
+    std::array<QStringList, 2> found;
+    std::array<QSet<qint64>, 2> missing;
     for (const auto folder : {Folder::portrait, Folder::notebook}) {
         for (QDirIterator files(place.paths.folder(folder), QDir::Files); files.hasNext();) {
             const QString path = files.next();
             const auto match = own.match(files.fileName());
-            const auto& owners = match.captured(1).isEmpty() ? people : families;
-            if (match.hasMatch() && !owners.contains(match.captured(2).toLongLong()))
-                found += path;
+            const std::size_t whose = match.captured(1).isEmpty() ? 0 : 1;
+            const qint64 key = match.captured(2).toLongLong();
+            if (!match.hasMatch() || owners[whose].contains(key))
+                continue;
+            found[whose] += path;
+            missing[whose] += key;
         }
     }
-    return found;
+    OwnedFiles sorted;
+    for (const std::size_t whose : {0U, 1U})
+        (missing[whose].size() > owners[whose].size() ? sorted.waiting : sorted.orphaned) += found[whose];
+    return sorted;
+}
+
+QString files_of_nobody(qsizetype count)
+{
+    return u"%1 of families or people who are not in the church."_s.arg(
+        core::counted(static_cast<int>(count), u"photograph or notebook page"_s, u"photographs and notebook pages"_s));
 }
 
 Findings examine_files(MenderPlace& place)
 {
-    const auto count = static_cast<int>(orphaned_files(place).size());
-    if (count == 0)
-        return {};
-    return {{u"orphaned_files"_s,
-             u"%1 of families or people who are not in the church."_s.arg(
-                 core::counted(count, u"photograph or notebook page"_s, u"photographs and notebook pages"_s)),
-             count, Cure::mend, u"Moved into the folder 'mended'; nothing is deleted."_s}};
+    const auto [orphaned, waiting] = orphaned_files(place);
+    Findings findings;
+    if (!orphaned.isEmpty())
+        findings.push_back({u"orphaned_files"_s, files_of_nobody(orphaned.size()), static_cast<int>(orphaned.size()),
+                            Cure::mend, u"Moved into the folder 'mended'; nothing is deleted."_s});
+    if (!waiting.isEmpty())
+        findings.push_back({u"lost_table"_s, files_of_nobody(waiting.size()), static_cast<int>(waiting.size()),
+                            Cure::by_hand,
+                            u"More of these are gone than are left, so the files stay where they are. Put back a "
+                            "backup, which has them, or move the files away."_s});
+    return findings;
 }
 
 void mend_files(MenderPlace& place)
 {
-    for (const auto& file : orphaned_files(place))
+    for (const auto& file : orphaned_files(place).orphaned)
         core::set_aside(place, file);
 }
 

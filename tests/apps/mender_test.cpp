@@ -26,11 +26,17 @@ protected:
     [[nodiscard]] QString church() const { return drive.filePath(u"Kindrel_10_Data/church1/"_s); }
     [[nodiscard]] QString database() const { return church() + u"KR10_records.kdl"_s; }
     void in_church(const QString& statement) { open_sqlite(database())->execute(statement); }
-    [[nodiscard]] int families()
+    [[nodiscard]] int count(const QString& statement)
     {
         const auto session = open_sqlite(database());
-        auto rows = session->select(u"SELECT COUNT(*) FROM [tbl_surname];"_s);
+        auto rows = session->select(statement);
         return rows.first()->integer(Column{0});
+    }
+    [[nodiscard]] int families() { return count(u"SELECT COUNT(*) FROM [tbl_surname];"_s); }
+    [[nodiscard]] int hanging_on_people()
+    {
+        return count(u"SELECT (SELECT COUNT(*) FROM [tbl_status])+(SELECT COUNT(*) FROM [tbl_group])+"
+                     "(SELECT COUNT(*) FROM [tbl_ministry])+(SELECT COUNT(*) FROM [tbl_individual_date]);"_s);
     }
 };
 
@@ -117,10 +123,31 @@ TEST_F(MenderProgramTest, ADatabaseThatCannotBeOpenedIsRecoveredIntoANewFileAndT
     EXPECT_EQ(DataFolder::read(database()), content);
 
     ASSERT_TRUE(QFile::rename(database(), database() + u".damaged"_s) && QFile::rename(fresh, database()));
+    const int hanging = hanging_on_people();
+    ASSERT_GT(hanging, 0);
     const auto mended = mender({u"mend"_s, u"--yes"_s});
-    EXPECT_EQ(mended.status, 0) << mended;
+    EXPECT_EQ(mended.status, 1) << mended;
+    EXPECT_TRUE(mended.out.contains("Most of 'people' is gone")) << "What was cut off held them. " << mended;
     EXPECT_EQ(run({u"totals"_s}).status, 0);
     EXPECT_GT(families(), 0);
+    EXPECT_EQ(hanging_on_people(), hanging) << "They wait for the people to come back.";
+}
+
+TEST_F(MenderProgramTest, AChurchThatDoesNotOpenIsSetAsideAndComesBackFromItsBackup)
+{
+    const auto made = run({u"backup"_s});
+    const QString backup = QString::fromUtf8(made.out).section(u": "_s, 1).trimmed();
+    EXPECT_EQ(mender({u"set-aside"_s, u"--yes"_s}).status, 1) << "It is sound.";
+    DataFolder::write(database(), "no database");
+    EXPECT_EQ(run({u"restore"_s, backup, u"--yes"_s}).status, 1);
+    EXPECT_TRUE(mender({u"check"_s}).out.contains("kindrel-mender set-aside"));
+
+    const auto aside = mender({u"set-aside"_s, u"--yes"_s});
+    ASSERT_EQ(aside.status, 0) << aside;
+    EXPECT_EQ(DataFolder::read(QString::fromUtf8(aside.out).section(u'\'', 1, 1)), "no database") << aside;
+    const auto restored = run({u"restore"_s, backup, u"--yes"_s});
+    EXPECT_EQ(restored.status, 0) << restored;
+    EXPECT_EQ(families(), 30);
 }
 
 TEST_F(MenderProgramTest, WrongUsageIsToldAndNothingIsDone)
@@ -129,6 +156,7 @@ TEST_F(MenderProgramTest, WrongUsageIsToldAndNothingIsDone)
                                      {u"heal"_s},
                                      {u"recover"_s},
                                      {u"check"_s, u"more"_s},
+                                     {u"set-aside"_s, u"more"_s},
                                      {u"--church"_s, u"10"_s, u"check"_s},
                                      {u"--nonsense"_s, u"check"_s}}) {
         const auto ended = mender(words);

@@ -57,7 +57,7 @@ protected:
         {
             const auto session = open_sqlite(file);
             session->execute(u"UPDATE [tbl_startup] SET [church_code]='here';"_s);
-            manifest.church = summary_of(*session, tables_of_file(*session));
+            manifest.church = summary_of(*session, tables_of(*session));
         }
         manifest.made = QDateTime(QDate(2024, 5, 15), QTime(10, 30));
         manifest.parts = {u"church/Portrait/"_s};

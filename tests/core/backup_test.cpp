@@ -153,6 +153,41 @@ TEST_P(BackupTest, GivenUpAtAnyStepNothingIsLeft)
     EXPECT_TRUE(place->dialogue().told.isEmpty());
 }
 
+/// Somebody saves a photograph anew at each of these steps.
+class ChangingProgress : public SilentProgress
+{
+public:
+    ChangingProgress(const QString& file, int first, int last) : m_file(file), m_first(first), m_last(last) {}
+    bool step(const QString&) override
+    {
+        if (++m_step >= m_first && m_step <= m_last)
+            DataFolder::write(m_file, QByteArray(m_step, 'x'));
+        return true;
+    }
+
+private:
+    QString m_file;
+    int m_first, m_last, m_step = 0;
+};
+
+TEST_P(BackupTest, AFileThatChangesMeanwhileIsReadOnceMoreAndThenToldByItsKind)
+{
+    const QString photograph = place->church() + u"Portrait/1.jpg"_s;
+    ChangingProgress once(photograph, 6, 6);
+    const auto report = make_backup(place->office(), {}, once);
+    ASSERT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
+    EXPECT_TRUE(place->leftovers().isEmpty());
+
+    const auto before = place->archives();
+    ChangingProgress always(photograph, 6, 1000);
+    EXPECT_FALSE(make_backup(place->office(), {}, always));
+    ASSERT_EQ(place->dialogue().told.size(), 1);
+    EXPECT_TRUE(place->dialogue().told.first().contains(u"One of the photographs was changed while the backup"))
+        << place->dialogue().told.first().toStdString();
+    EXPECT_EQ(place->archives(), before);
+    EXPECT_TRUE(place->leftovers().isEmpty());
+}
+
 TEST_P(BackupTest, ABusyChurchIsNotBackedUp)
 {
     DataFolder::write(place->church() + u"Lock.dat"_s, "1234567890");

@@ -2,9 +2,9 @@
 
 #include "core/church_recovery.h"
 #include "core/sqlite_session.h"
-#include "support/processes.h"
+#include "core/verified_copy.h"
 
-#include <QElapsedTimer>
+#include <QRandomGenerator>
 
 // Damages of a church file, which only the embedded engine has.
 namespace kindrel::test {
@@ -16,6 +16,27 @@ namespace {
 
 constexpr int page_size = 4096;
 constexpr int families = 20000;
+
+/// Empties a page, fills it with noise or with another page, or flips bits of it.
+void harm(QByteArray& content, quint32 page, QRandomGenerator& random)
+{
+    const auto start = static_cast<qsizetype>(page) * page_size;
+    const auto other = static_cast<qsizetype>(random.bounded(static_cast<quint32>(content.size() / page_size)));
+    switch (random.bounded(4)) {
+    case 0:
+        content.replace(start, page_size, QByteArray(page_size, '\0'));
+        break;
+    case 1:
+        content.replace(start, page_size, content.mid(other * page_size, page_size));
+        break;
+    case 2:
+        std::generate_n(content.begin() + start, page_size, [&] { return static_cast<char>(random.generate()); });
+        break;
+    default:
+        for (int flip = 0; flip < 20; ++flip)
+            content[start + random.bounded(page_size)] ^= static_cast<char>(1 << random.bounded(7));
+    }
+}
 
 int rows_of(const std::vector<RecoveredTable>& tables, const QString& table)
 {
@@ -131,6 +152,49 @@ TEST_P(MenderFileTest, AnOverwrittenPageCostsItsOwnRowsOnly)
     EXPECT_EQ(DataFolder::read(church->file()), content);
 }
 
+TEST_P(MenderFileTest, ADamagedEndOfATableCostsTheRowsThereOnly)
+{
+    fill_many();
+    const QByteArray whole = closed_content();
+    const QString first = u"Family 100"_s, last = u"Family %1"_s.arg(99 + families);
+    for (const QStringList& damaged : {QStringList{first}, {last}, {first, last}}) {
+        QByteArray content = whole;
+        for (const auto& family : damaged)
+            content.replace(whole.indexOf(family.toUtf8()) / page_size * page_size, page_size,
+                            QByteArray(page_size, 'Z'));
+        DataFolder::write(church->file(), content);
+        QFile::remove(fresh());
+        const auto tables = recover_church(church->file(), fresh());
+        EXPECT_GT(rows_of(tables, u"tbl_surname"_s), families - 1000) << damaged.join(u' ').toStdString();
+        EXPECT_LT(rows_of(tables, u"tbl_surname"_s), families) << damaged.join(u' ').toStdString();
+        expect_true_families(fresh(), rows_of(tables, u"tbl_surname"_s));
+    }
+}
+
+TEST_P(MenderFileTest, PagesDamagedAtRandomNeverBringTheRecoveryDown)
+{
+    fill_many();
+    const QByteArray whole = closed_content();
+    const auto pages = static_cast<quint32>(whole.size() / page_size);
+    QRandomGenerator random(1205);
+    int recovered = 0;
+    for (int round = 0; round < 12; ++round) {
+        QByteArray content = whole;
+        for (int damage = 0; damage <= round % 8; ++damage)
+            harm(content, random.bounded(1U, pages), random);
+        DataFolder::write(church->file(), content);
+        QFile::remove(fresh());
+        try {
+            (void)recover_church(church->file(), fresh());
+            EXPECT_NO_THROW(check_church_file(fresh())) << round;
+            ++recovered;
+        } catch (const DatabaseError&) {
+            EXPECT_FALSE(QFile::exists(fresh())) << round;
+        }
+    }
+    EXPECT_GT(recovered, 6);
+}
+
 TEST_P(MenderFileTest, OfATruncatedFileComesBackWhatIsLeft)
 {
     fill_many();
@@ -147,6 +211,31 @@ TEST_P(MenderFileTest, OfATruncatedFileComesBackWhatIsLeft)
         expect_true_families(fresh(), told);
         EXPECT_EQ(DataFolder::read(church->file()), content);
     }
+}
+
+TEST_P(MenderFileTest, ADamagedChurchFileIsSetAsideAndASoundOneIsNot)
+{
+    place->session.reset();
+    church->close();
+    const QString file = in_church(u"KR10_records.kdl"_s);
+    ASSERT_TRUE(QFile::rename(church->file(), file));
+    place->session = open_sqlite(file);
+    EXPECT_THROW((void)set_database_aside(*place), FileError);
+    place->session.reset();
+
+    DataFolder::write(file, "no database");
+    DataFolder::write(file + u"-journal"_s, "its journal");
+    DataFolder::write(in_church(u"lock.dat"_s), "1234567890");
+    EXPECT_THROW((void)set_database_aside(*place), FileError);
+    EXPECT_TRUE(QFile::exists(file));
+
+    QFile::remove(in_church(u"lock.dat"_s));
+    const QString aside = set_database_aside(*place);
+    EXPECT_FALSE(QFile::exists(file));
+    EXPECT_FALSE(QFile::exists(file + u"-journal"_s));
+    EXPECT_EQ(DataFolder::read(aside), "no database");
+    EXPECT_EQ(DataFolder::read(aside + u"-journal"_s), "its journal");
+    EXPECT_TRUE(aside.startsWith(in_church(u"mended/"_s))) << aside.toStdString();
 }
 
 TEST_P(MenderFileTest, RecoveringNeverWritesOverAFileAndLeavesNothingOfAFailure)

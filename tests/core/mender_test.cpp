@@ -4,6 +4,8 @@
 #include "core/restore_swap.h"
 #include "core/sqlite_session.h"
 
+#include <map>
+
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
@@ -65,11 +67,11 @@ const std::array row_damages{
               u"1 entry in 'group memberships' without an owner: what stood in 'people' is gone."_s,
               u"SELECT COUNT(*) FROM [tbl_group];"_s,
               3},
-    RowDamage{{u"DELETE FROM [tbl_roll_date];"_s},
+    RowDamage{{u"INSERT INTO [tbl_roll_attendance] ([roll_date_id],[person_id],[Attendance]) VALUES (99,10,192);"_s},
               u"orphans"_s,
               u"1 entry in 'roll attendance' without an owner: what stood in 'roll date' is gone."_s,
               u"SELECT COUNT(*) FROM [tbl_roll_attendance];"_s,
-              0},
+              1},
     RowDamage{{u"UPDATE [tbl_people] SET [position]=5 WHERE [person_id]=11;"_s},
               u"positions"_s,
               u"The people of 1 family are not numbered from 1 without gaps and doubles."_s,
@@ -133,12 +135,81 @@ TEST_P(MenderTest, EveryDamageOfRowsIsFoundToldMendedAndGone)
 
 TEST_P(MenderTest, TheCopyHoldsTheChurchAsItWasBefore)
 {
-    run({u"DELETE FROM [tbl_roll_date];"_s, u"UPDATE [tbl_people] SET [position]=9 WHERE [person_id]=20;"_s});
+    run({u"DELETE FROM [tbl_people] WHERE [person_id]=10;"_s,
+         u"UPDATE [tbl_people] SET [position]=9 WHERE [person_id]=20;"_s});
     const auto mending = mend_church(*place, {});
     const auto copy = open_sqlite(mending.copy);
-    EXPECT_EQ(number_of(*copy, u"SELECT COUNT(*) FROM [tbl_roll_attendance];"_s), 1);
+    EXPECT_EQ(number_of(*copy, u"SELECT COUNT(*) FROM [tbl_group] WHERE [person_id]=10;"_s), 1);
     EXPECT_EQ(number_of(*copy, u"SELECT [position] FROM [tbl_people] WHERE [person_id]=20;"_s), 9);
     EXPECT_EQ(mended_files(), QStringList{u"KR10_records before mending 2024-05-15 103000.kdl"_s});
+}
+
+TEST_P(MenderTest, WhatHangsOnALostTableStays)
+{
+    const QStringList hanging{u"tbl_group"_s, u"tbl_personal_details"_s, u"tbl_address"_s, u"tbl_roll_attendance"_s,
+                              u"tbl_finance_data"_s};
+    const QString drop = GetParam() == EngineKind::sqlite ? u"DROP TABLE [%1];"_s : u"DROP TABLE [%1] CASCADE;"_s;
+    std::map<QString, qint64> before;
+    for (const auto& table : hanging)
+        before[table] = number_of(session(), u"SELECT COUNT(*) FROM [%1];"_s.arg(table));
+    int lost = 0;
+    for (const auto& table : {u"tbl_roll_date"_s, u"tbl_finance_date"_s, u"tbl_people"_s, u"tbl_surname"_s}) {
+        ++lost;
+        for (const auto& damage : {u"DELETE FROM [%1];"_s, drop}) {
+            run({damage.arg(table), u"INSERT INTO [tbl_locked_family_files] ([surname_id]) VALUES (1);"_s});
+            EXPECT_EQ(mend_church(*place, {}).refusal.isEmpty(), damage != drop);
+            EXPECT_EQ(unlock_church(*place).size(), 1);
+            const auto mending = mend_church(*place, {});
+            EXPECT_EQ(std::ranges::count(mending.left, u"lost_table"_s, &Finding::kind), lost) << told(mending.left);
+            EXPECT_EQ(std::ranges::count(mending.left, Cure::by_hand, &Finding::cure), lost) << told(mending.left);
+            for (const auto& [name, rows] : before)
+                EXPECT_EQ(number_of(session(), u"SELECT COUNT(*) FROM [%1];"_s.arg(name)), rows)
+                    << name.toStdString() << " after " << damage.arg(table).toStdString();
+        }
+    }
+}
+
+TEST_P(MenderTest, ATableThatLostMostOfItsRowsTakesNothingAlong)
+{
+    run({u"DELETE FROM [tbl_people] WHERE [person_id]<>20;"_s});
+    const auto mending = mend_church(*place, {});
+    ASSERT_EQ(mending.left.size(), 1U) << told(mending.left);
+    EXPECT_EQ(mending.left.front().words,
+              u"Most of 'people' is gone: other entries speak of 2 that are missing, and 1 is left."_s);
+    EXPECT_EQ(number_of(session(), u"SELECT COUNT(*) FROM [tbl_group];"_s), 3);
+}
+
+TEST_P(MenderTest, WithoutALockTableNobodyKnowsWhoIsInsideUntilTheChurchIsUnlocked)
+{
+    run({u"DROP TABLE [tbl_locked_area];"_s, u"DELETE FROM [tbl_address];"_s});
+    const auto found = examine();
+    EXPECT_EQ(std::ranges::count(found, Cure::unlock, &Finding::cure), 1) << told(found);
+    EXPECT_TRUE(mend_church(*place, {}).refusal.startsWith(u"It cannot be told whether somebody is working"));
+    EXPECT_EQ(number_of(session(), u"SELECT COUNT(*) FROM [tbl_address];"_s), 0);
+
+    (void)unlock_church(*place);
+    EXPECT_EQ(mend_church(*place, {}).refusal, QString());
+    EXPECT_TRUE(examine().empty()) << told(examine());
+}
+
+TEST_P(MenderTest, TheLocksAreLookedAtBehindTheMarkerThatKeepsOthersOut)
+{
+    struct Watching : FakeWorkstation
+    {
+        [[nodiscard]] bool process_runs(qint64) const override
+        {
+            behind_marker = behind_marker || QFile::exists(marker);
+            return false;
+        }
+        QString marker;
+        mutable bool behind_marker = false;
+    } watching;
+    watching.marker = in_church(u"lock.dat"_s);
+    MenderPlace watched{.paths = *paths, .workstation = watching, .clock = clock, .session = church->another()};
+    ASSERT_TRUE(Locks(session(), watching, clock).take(LockKind::family, 1));
+    run({u"DELETE FROM [tbl_address];"_s});
+    EXPECT_EQ(mend_church(watched, {}).refusal, QString());
+    EXPECT_TRUE(watching.behind_marker);
 }
 
 TEST_P(MenderTest, WhoMayBeInsideKeepsTheMenderOutUntilTheChurchIsUnlocked)
@@ -251,6 +322,56 @@ TEST_P(MenderTest, ARestoreThatWasCutOffIsTakenBack)
     EXPECT_EQ(examine().front().words, u"A restore was cut off."_s);
     EXPECT_TRUE(mend_church(*place, {}).left.empty());
     EXPECT_EQ(DataFolder::read(portrait), "old");
+}
+
+TEST_P(MenderTest, ARestoreThatIsStillRunningIsNotUnlocked)
+{
+    const QString portrait = in_church(u"Portrait/10.jpg"_s);
+    DataFolder::write(portrait, "old");
+    DataFolder::write(in_church(u"lock.dat"_s), "1234567890");
+    RestoreWork work(place->paths);
+    for (const bool exchanged : {false, true}) {
+        if (exchanged) {
+            DataFolder::write(work.unpacked() + u"church/Portrait/10.jpg"_s, "fresh");
+            work.swap({{u"unpacked/church/Portrait/"_s, Folder::portrait, {}}});
+        }
+        EXPECT_THROW(unlock_church(*place), FileError);
+        EXPECT_EQ(DataFolder::read(portrait), exchanged ? "fresh" : "old");
+        EXPECT_TRUE(QFile::exists(in_church(u"lock.dat"_s)));
+        EXPECT_TRUE(restore_unsettled(place->paths));
+    }
+    work.settle(*place->session);
+    EXPECT_EQ(DataFolder::read(portrait), "old");
+}
+
+TEST_P(MenderTest, ARestoreWhoseRecordIsDamagedIsSetAsideAndTold)
+{
+    for (const bool mending : {true, false}) {
+        DataFolder::write(in_church(u"restore_work/journal.json"_s), "{");
+        DataFolder::write(in_church(u"restore_work/kept/0"_s), "the church's own");
+        const auto told_of = mending ? mend_church(*place, {}).left.front().words : unlock_church(*place).value(0);
+        EXPECT_TRUE(told_of.contains(u"cannot be told how far")) << told_of.toStdString();
+        EXPECT_TRUE(examine().empty()) << told(examine());
+        const QString aside = mending ? u"mended/restore_work"_s : u"mended/restore_work (2)"_s;
+        EXPECT_EQ(DataFolder::read(in_church(aside + u"/kept/0"_s)), "the church's own");
+    }
+}
+
+TEST_P(MenderTest, TheFolderOfWhatWasMendedIsForOwnerAndGroupAlone)
+{
+    const auto others = QFile::ReadOther | QFile::WriteOther | QFile::ExeOther;
+    const auto open_to_all = QFile::ReadOwner | QFile::WriteOwner | QFile::ReadOther;
+    const QStringList files{in_church(u"compact/KR10_records.kdl.unfinished"_s),
+                            paths->folder(Folder::global) + u"Church_S.Dat"_s};
+    for (const auto& file : files) {
+        DataFolder::write(file, "half");
+        QFile::setPermissions(file, open_to_all);
+    }
+    EXPECT_TRUE(mend_church(*place, {}).left.empty());
+    EXPECT_FALSE(QFile::permissions(in_church(u"mended"_s)) & others);
+    EXPECT_EQ(mended_files().size(), 3) << mended_files().join(u' ').toStdString();
+    for (const auto& file : mended_files())
+        EXPECT_FALSE(QFile::permissions(in_church(u"mended/"_s + file)) & others) << file.toStdString();
 }
 
 TEST_P(MenderTest, LeftoversOfWorkThatWasCutOffAreSetAside)

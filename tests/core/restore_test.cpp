@@ -9,6 +9,24 @@
 
 #include <filesystem>
 
+#include <dlfcn.h>
+
+namespace {
+
+/// What a test does when something is flushed to the disk.
+std::function<void()> on_flush; // NOLINT: set and unset by one test.
+
+} // namespace
+
+/// Stands in front of the system's own.
+extern "C" int syncfs(int opened) noexcept
+{
+    if (on_flush)
+        on_flush();
+    static const auto own = reinterpret_cast<int (*)(int)>(dlsym(RTLD_NEXT, "syncfs"));
+    return own(opened);
+}
+
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
@@ -33,6 +51,7 @@ protected:
     {
         return restore_backup(place->office(), request, place->started->silent);
     }
+    void TearDown() override { on_flush = nullptr; }
     void expect_refusal(const QString& words)
     {
         EXPECT_FALSE(restore({.file = backup}));
@@ -207,7 +226,73 @@ TEST_P(RestoreTest, ADamagedChurchIsReplacedAfterAsking)
     ASSERT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
     EXPECT_TRUE(place->dialogue().asked.last().startsWith(u"Unable to back up the present data"));
     EXPECT_TRUE(report->before.isEmpty());
+    EXPECT_EQ(DataFolder::read(report->before_unchecked + u"database/KR10_records.kdl"_s), content);
+    EXPECT_EQ(DataFolder::read(report->before_unchecked + u"church/Portrait/1.jpg"_s),
+              new_state[u"church1/Portrait/1.jpg"_s]);
     EXPECT_EQ(place->state(), old_state);
+}
+
+TEST_P(RestoreTest, AFileThatCannotBeBackedUpDoesNotKeepTheBackupOut)
+{
+    const QString odd = u"Portrait/two\nlines.jpg"_s;
+    DataFolder::write(place->church() + odd, "odd");
+
+    const auto report = restore({.file = backup});
+
+    ASSERT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
+    EXPECT_TRUE(place->dialogue().asked.last().startsWith(u"Unable to back up the present data"));
+    EXPECT_EQ(DataFolder::read(report->before_unchecked + u"church/"_s + odd), "odd");
+    EXPECT_EQ(place->state(), old_state);
+}
+
+TEST_P(RestoreTest, TablesThatAreMissingComeBack)
+{
+    if (GetParam() != EngineKind::sqlite)
+        GTEST_SKIP() << "The content of a server's tables is replaced, so the Mender makes them again first.";
+    for (const auto& table : {u"tbl_finance_date"_s, u"tbl_locked_area"_s, u"tbl_surname"_s, u"tbl_setting"_s})
+        place->session().execute(u"DROP TABLE [%1];"_s.arg(table));
+
+    const auto report = restore({.file = backup});
+
+    ASSERT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
+    EXPECT_EQ(place->state(), old_state);
+    EXPECT_TRUE(Locks(place->office()).all().empty());
+}
+
+TEST_P(RestoreTest, WhatIsExchangedIsOnTheDiskBeforeTheDatabaseFollows)
+{
+    QStringList flushed;
+    on_flush = [&] {
+        const bool begun = QFile::exists(place->church() + u"restore_work/journal.json"_s);
+        const bool exchanged =
+            DataFolder::read(place->church() + u"Portrait/1.jpg"_s) == old_state[u"church1/Portrait/1.jpg"_s];
+        flushed += begun ? exchanged ? u"exchanged"_s : u"begun"_s : u"prepared"_s;
+    };
+
+    ASSERT_TRUE(restore({.file = backup, .with_shared_files = false}));
+
+    EXPECT_EQ(flushed.mid(flushed.indexOf(u"begun"_s)), (QStringList{u"begun"_s, u"exchanged"_s, u"exchanged"_s}));
+}
+
+TEST_P(RestoreTest, ARestoreThatSomebodyTookBackMeanwhileChangesNothing)
+{
+    on_flush = [&] { // As an older Mender would, between the exchange of the files and that of the database.
+        const QString journal = place->church() + u"restore_work/journal.json"_s;
+        const QString portrait = place->church() + u"Portrait"_s;
+        if (!QFile::exists(journal) ||
+            DataFolder::read(portrait + u"/1.jpg"_s) != old_state[u"church1/Portrait/1.jpg"_s])
+            return;
+        on_flush = nullptr;
+        ASSERT_TRUE(QDir(portrait).removeRecursively());
+        ASSERT_TRUE(QDir().rename(place->church() + u"restore_work/kept/0"_s, portrait));
+        QFile::remove(journal);
+    };
+
+    EXPECT_FALSE(restore({.file = backup}));
+
+    EXPECT_EQ(place->state()[u"families"_s], new_state[u"families"_s]);
+    EXPECT_EQ(place->state()[u"church1/Portrait/1.jpg"_s], new_state[u"church1/Portrait/1.jpg"_s]);
+    EXPECT_TRUE(place->dialogue().told.value(0).contains(u"Somebody else ended this restore meanwhile"));
 }
 
 TEST_P(RestoreTest, SomebodyInsideIsNamedAndNothingChanges)

@@ -99,16 +99,21 @@ TEST_F(StartupRestoreTest, ARestoreUnderWayAtAnotherWorkstationIsLeftAlone)
     EXPECT_TRUE(QFile::exists(journal));
 }
 
-TEST_F(StartupRestoreTest, ARestoreThatCannotBeSettledEndsTheStartAndLosesNothing)
+TEST_F(StartupRestoreTest, ARestoreThatCannotBeSettledIsToldAndSetAsideForTheNextStart)
 {
     DataFolder::write(journal, "{");
-    dialogue.expect_box(u"The record of an interrupted restore, '%1', is damaged."_s.arg(journal),
-                        u"Kindrel is now going to shut down."_s);
+    dialogue.expect_box(
+        u"The record of an interrupted restore is damaged, so that it cannot be told how far the restore came. What it "
+        "had made ready and what it had replaced was moved to '%1mended/restore_work'. The church's database is whole "
+        "and stays as it is; of the pictures, notebook pages, letters and settings some may be those of the backup. "
+        "Look at them, or restore a backup once more."_s.arg(church),
+        u"Kindrel is now going to shut down."_s);
 
     EXPECT_FALSE(start());
 
-    EXPECT_EQ(DataFolder::read(church + u"restore_work/kept/0/1.jpg"_s), "old");
+    EXPECT_EQ(DataFolder::read(church + u"mended/restore_work/kept/0/1.jpg"_s), "old");
     EXPECT_FALSE(QFile::exists(church + u"lock.dat"_s));
+    EXPECT_TRUE(start());
 }
 
 } // namespace kindrel::test
