@@ -4,7 +4,7 @@ set_target_properties(kindrel kindrelctl kindrel-mender PROPERTIES INSTALL_RPATH
 install(TARGETS kindrel kindrelctl kindrel-mender RUNTIME DESTINATION ${program_folder})
 install(DIRECTORY ${CMAKE_RUNTIME_OUTPUT_DIRECTORY}/master ${CMAKE_RUNTIME_OUTPUT_DIRECTORY}/Training
     DESTINATION ${program_folder})
-install(FILES packaging/kindrel.desktop DESTINATION ${CMAKE_INSTALL_DATADIR}/applications)
+install(FILES packaging/kindrel.desktop packaging/kindrel-mender.desktop DESTINATION ${CMAKE_INSTALL_DATADIR}/applications)
 install(FILES packaging/kindrel.svg DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps)
 foreach(program kindrel kindrelctl kindrel-mender)
     install(CODE "

@@ -3,9 +3,12 @@
 
 #include "core/mender_place.h"
 #include "core/system_workstation.h"
+#include "desktop/mender/mender_program.h"
 
 #include <QCommandLineParser>
 #include <QCoreApplication>
+
+#include <algorithm>
 
 using namespace kindrel;
 using namespace Qt::StringLiterals;
@@ -16,12 +19,13 @@ constexpr int done = 0, findings = 1, wrong_usage = 2;
 
 QString help_text()
 {
-    return u"Usage: kindrel-mender [OPTIONS] check|mend|unlock|recover FILE\n\n"
-           "Looks after a church's records that Kindrel cannot or must not open.\n\n"
+    return u"Usage: kindrel-mender [OPTIONS] check|mend|unlock|recover FILE|set-aside\n\n"
+           "Looks after a church's records that Kindrel cannot or must not open. Without a command it opens its window.\n\n"
            "  check         tell what is wrong; nothing is changed\n"
            "  mend          put it right, after a copy of the database was laid into the church's folder 'mended'\n"
            "  unlock        remove every lock and marker that keeps people out; make sure first that nobody is inside\n"
-           "  recover FILE  write what can be read of a damaged church file into FILE, a new church file\n\n"
+           "  recover FILE  write what can be read of a damaged church file into FILE, a new church file\n"
+           "  set-aside     move a damaged church file away, so that Kindrel starts and a backup can be restored\n\n"
            "Options:\n"
            "  --data-drive DIR  the folder that holds Kindrel_10_Data (default: the workstation's own)\n"
            "  --church N        the church: 1 to 7, 8 for training data, 9 for booked-out data\n"
@@ -45,6 +49,43 @@ void declare_options(QCommandLineParser& parser)
                        {u"help"_s, {}}});
 }
 
+/// 0 where none is named, nullopt for what is no church.
+std::optional<int> church_of(const QCommandLineParser& parser)
+{
+    if (!parser.isSet(u"church"_s))
+        return 0;
+    bool number = false;
+    const int church = parser.value(u"church"_s).toInt(&number);
+    const bool known = number && church >= 1 && church <= core::booked_out_church;
+    return known ? std::optional(church) : std::nullopt;
+}
+
+bool has_display()
+{
+#if defined(Q_OS_WIN) || defined(Q_OS_MACOS)
+    return true;
+#else
+    return !qEnvironmentVariableIsEmpty("DISPLAY") || !qEnvironmentVariableIsEmpty("WAYLAND_DISPLAY");
+#endif
+}
+
+/// The place to begin with when the window is meant: there is a display, and nothing is asked for but a place.
+std::optional<core::StartRequest> window_request(int& count, char** words)
+{
+    const QCoreApplication application(count, words);
+    QCommandLineParser parser;
+    declare_options(parser);
+    if (!has_display() || !parser.parse(QCoreApplication::arguments()) || !parser.positionalArguments().isEmpty())
+        return std::nullopt;
+    const auto is_place = [](const QString& option) {
+        return option == u"data-drive" || option == u"church";
+    };
+    const auto church = church_of(parser);
+    if (!church || !std::ranges::all_of(parser.optionNames(), is_place))
+        return std::nullopt;
+    return core::StartRequest{core::Purpose::command_line, *church, parser.value(u"data-drive"_s)};
+}
+
 /// Nullopt where the command line cannot be understood; `fault` says why.
 std::optional<apps::MenderOrder> order_of(const QCommandLineParser& parser, QString& fault)
 {
@@ -55,18 +96,15 @@ std::optional<apps::MenderOrder> order_of(const QCommandLineParser& parser, QStr
                             .json = parser.isSet(u"json"_s),
                             .ask = !parser.isSet(u"yes"_s),
                             .remove_locks = parser.isSet(u"remove-locks"_s)};
-    bool number = true;
-    order.request = {core::Purpose::command_line, 0, parser.value(u"data-drive"_s)};
-    if (parser.isSet(u"church"_s))
-        order.request.church = parser.value(u"church"_s).toInt(&number);
+    const auto church = church_of(parser);
+    order.request = {core::Purpose::command_line, church.value_or(0), parser.value(u"data-drive"_s)};
     const int expected = order.command == apps::recover_command() ? 2 : 1;
-    const bool in_range = order.request.church >= 1 && order.request.church <= core::booked_out_church;
     if (!order.command)
-        fault = u"Say what to do: check, mend, unlock or recover FILE."_s;
+        fault = u"Say what to do: check, mend, unlock, recover FILE or set-aside."_s;
     else if (words.size() != expected)
         fault = words.size() < expected ? u"The name of the new church file is missing."_s
                                         : u"There are too many arguments."_s;
-    else if (parser.isSet(u"church"_s) && !(number && in_range))
+    else if (!church)
         fault = u"The church is a number from 1 to %1."_s.arg(core::booked_out_church);
     return fault.isEmpty() ? std::optional(order) : std::nullopt;
 }
@@ -96,6 +134,8 @@ int run(const apps::MenderOrder& order, core::Dialogue& dialogue, QTextStream& o
 
 int main(int count, char** words)
 {
+    if (const auto request = window_request(count, words))
+        return desktop::run_mender(count, words, *request);
     const QCoreApplication application(count, words);
     QCommandLineParser parser;
     declare_options(parser);

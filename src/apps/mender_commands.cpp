@@ -1,6 +1,6 @@
 #include "apps/mender_commands.h"
 
-#include "core/church_recovery.h"
+#include "core/mender_words.h"
 #include "people/mender_people.h"
 
 #include <QJsonArray>
@@ -16,11 +16,10 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+namespace words = core::mender_words;
 using core::Cure;
 using core::Finding;
 using core::Findings;
-
-const QString running_here = u"Kindrel is running on this workstation: leave it first."_s;
 
 QString word_of(Cure cure)
 {
@@ -103,7 +102,7 @@ qsizetype unlock_and_tell(const MenderContext& context)
 
 QString mending_question(const MenderContext& context)
 {
-    const QString question = u"Mend church %1? A copy of its database is kept."_s.arg(context.place.church);
+    const QString question = words::mending_question(context.place.church);
     return context.order.remove_locks
                ? question + u" Every lock and marker is removed first: nobody may be inside or at work on it."_s
                : question;
@@ -112,9 +111,9 @@ QString mending_question(const MenderContext& context)
 bool mend(const MenderContext& context)
 {
     if (!free_to_work(context))
-        return refuse(context, running_here);
+        return refuse(context, words::running_here());
     if (!agreed(context, mending_question(context)))
-        return refuse(context, u"Nothing was changed."_s);
+        return refuse(context, words::nothing_changed());
     if (context.order.remove_locks)
         unlock_and_tell(context);
     const auto mending = core::mend_church(context.place, people::mender_checks());
@@ -138,10 +137,9 @@ bool mend(const MenderContext& context)
 bool unlock(const MenderContext& context)
 {
     if (!free_to_work(context))
-        return refuse(context, running_here);
-    if (!agreed(context, u"Remove every lock and marker of church %1? Nobody may be inside or at work on it."_s.arg(
-                             context.place.church)))
-        return refuse(context, u"Nothing was changed."_s);
+        return refuse(context, words::running_here());
+    if (!agreed(context, words::unlocking_question(context.place.church)))
+        return refuse(context, words::nothing_changed());
     if (unlock_and_tell(context) == 0)
         context.out << church_in_words(context.place) << " was not locked.\n";
     return true;
@@ -152,34 +150,27 @@ bool recover(const MenderContext& context)
     const auto& order = context.order;
     const QString damaged = order.damaged.isEmpty() ? context.place.paths.database() : order.damaged;
     context.place.session.reset();
-    if (!agreed(context, u"Write what can be read of '%1' into '%2'?"_s.arg(damaged, order.target)))
+    if (!agreed(context, words::recovering_question(damaged, order.target)))
         return refuse(context, u"Nothing was written."_s);
     const auto tables = core::recover_church(damaged, order.target);
     bool whole = true;
     for (const auto& table : tables) {
-        const bool lost = !table.whole || table.refused > 0;
-        whole = whole && !lost;
-        if (table.rows == 0 && !lost)
-            continue;
-        context.out << table.table << ": " << core::counted(table.rows, u"row"_s, u"rows"_s)
-                    << (table.refused > 0 ? u", %1 refused"_s.arg(table.refused) : QString())
-                    << (table.whole ? QString() : u", a part could not be read"_s) << '\n';
+        whole = whole && words::came_whole(table);
+        if (table.rows > 0 || !words::came_whole(table))
+            context.out << table.table << ": " << words::came_of(table) << '\n';
     }
-    context.out << "The new church file is '" << order.target << "'; '" << damaged << "' was left as it is.\n"
-                << "To work with it, set the damaged file aside (kindrel-mender set-aside), give the new one its name, "
-                   "then mend the church.\n";
+    context.out << words::where_recovered(damaged, order.target) << '\n' << words::after_recovering() << '\n';
     return whole;
 }
 
 bool set_aside(const MenderContext& context)
 {
     if (!free_to_work(context))
-        return refuse(context, running_here);
-    if (!agreed(context, u"Set the damaged church file of church %1 aside, so that the next start begins an empty "
-                         "church? Nobody may be inside."_s.arg(context.place.church)))
-        return refuse(context, u"Nothing was changed."_s);
-    context.out << "The damaged church file lies in '" << core::set_database_aside(context.place) << "' now.\n"
-                << "Start Kindrel, which begins an empty church, and put back a backup with 'Restore Data'.\n";
+        return refuse(context, words::running_here());
+    if (!agreed(context, words::setting_aside_question(context.place.church)))
+        return refuse(context, words::nothing_changed());
+    context.out << words::where_set_aside(core::set_database_aside(context.place)) << '\n'
+                << words::after_setting_aside() << '\n';
     return true;
 }
 

@@ -17,6 +17,7 @@
 #include <QListWidget>
 #include <QPushButton>
 #include <QTabWidget>
+#include <QTableWidget>
 #include <QTextStream>
 
 namespace kindrel::apps {
@@ -28,6 +29,7 @@ namespace {
 
 constexpr QSize smallest_screen{1024, 690};
 constexpr QSize narrow_window{800, 560};
+constexpr QSize least_window{720, 480};
 
 /// Writes under "name-light.png" and "name-dark.png".
 class Camera
@@ -115,6 +117,30 @@ void take_tabs(QWidget& window, const QString& name, Camera& camera)
     for (int tab = 0; tabs && tab < tabs->count(); ++tab) {
         tabs->setCurrentIndex(tab);
         camera.take(window, u"%1-%2"_s.arg(name).arg(tab + 1));
+    }
+}
+
+void type_into(QWidget& page, const QString& field, const QString& text)
+{
+    if (auto* line = page.findChild<QLineEdit*>(field))
+        line->setText(text);
+}
+
+void take_backups(desktop::Running& running, Camera& camera)
+{
+    auto& window = *running.window();
+    open_area(running, u"backup"_s);
+    camera.take(window, u"backup"_s);
+    type_into(*window.page(), u"password"_s, u"correct horse"_s);
+    type_into(*window.page(), u"password_again"_s, u"correct house"_s);
+    if (auto* last = window.page()->findChild<QLineEdit*>(u"password_again"_s))
+        Q_EMIT last->returnPressed();
+    camera.take(window, u"backup-password"_s);
+    open_area(running, u"restore"_s);
+    auto* known = window.page()->findChild<QTableWidget*>(u"backups"_s);
+    for (int row = 0; known && row < known->rowCount(); ++row) {
+        known->selectRow(row);
+        camera.take(window, u"restore-%1"_s.arg(row + 1));
     }
 }
 
@@ -216,11 +242,14 @@ int take_pictures(desktop::Running& running, desktop::Look& look, const QString&
     open_area(running, u"labels"_s);
     take_tabs(*running.window(), u"label_tabs"_s, camera);
     take_registers(running, camera);
+    take_backups(running, camera);
     take_speed_find(running, camera);
     take_dialogs(running.desk()->office, camera);
     open_area(running, u"main_menu"_s);
     running.window()->resize(narrow_window);
     camera.take(*running.window(), u"main-menu-narrow"_s);
+    running.window()->resize(least_window);
+    camera.take(*running.window(), u"main-menu-least"_s);
     return camera.failed() ? 1 : 0;
 }
 

@@ -14,11 +14,6 @@ namespace {
 
 constexpr int own_churches = 7;
 
-Paths paths_at(const Paths& from, const QString& root, Mode mode, int church)
-{
-    return {from.folder(Folder::program), from.data_drive(), root, mode, church};
-}
-
 /// The settings of the network; a damaged file leaves the workstation to its own data.
 SideRecord network_settings(const Paths& paths)
 {
@@ -29,25 +24,17 @@ SideRecord network_settings(const Paths& paths)
     }
 }
 
-Mode mode_of(int church, Mode otherwise)
-{
-    if (church == training_church)
-        return Mode::training;
-    return church == booked_out_church ? Mode::booked_out : otherwise;
-}
-
 /// The only church in use, or the first when none is.
-int only_church(const Paths& paths, Mode mode)
+int only_church(const Paths& local)
 {
-    QStringList in_use;
-    for (int church = 1; church <= own_churches; ++church) {
-        if (paths_at(paths, paths.folder(Folder::data_root), mode, church)
-                .exists(Folder::church, QLatin1String(side_files::set_up.name)))
-            in_use += QString::number(church);
+    const auto in_use = churches_in_use(local);
+    if (in_use.size() > 1) {
+        QStringList numbers;
+        for (const int church : in_use)
+            numbers += QString::number(church);
+        throw FileError(u"Several churches are in use (%1): name one."_s.arg(numbers.join(u", ")));
     }
-    if (in_use.size() > 1)
-        throw FileError(u"Several churches are in use (%1): name one."_s.arg(in_use.join(u", ")));
-    return in_use.isEmpty() ? 1 : in_use.first().toInt();
+    return in_use.empty() ? 1 : in_use.front();
 }
 
 void open(MenderPlace& place)
@@ -66,23 +53,37 @@ void open(MenderPlace& place)
 
 } // namespace
 
+Paths church_paths(const Paths& local, int church)
+{
+    const SideRecord network = network_settings(local);
+    const bool shared = network.flag("network") && church != booked_out_church;
+    const Mode own = shared ? Mode::network : Mode::normal;
+    const Mode mode = church == training_church ? Mode::training : church == booked_out_church ? Mode::booked_out : own;
+    return {local.folder(Folder::program), local.data_drive(),
+            shared ? network.text("path") : local.folder(Folder::data_root), mode, church};
+}
+
+std::vector<int> churches_in_use(const Paths& local)
+{
+    std::vector<int> in_use;
+    for (int church = 1; church <= own_churches; ++church) {
+        if (church_paths(local, church).exists(Folder::church, QLatin1String(side_files::set_up.name)))
+            in_use.push_back(church);
+    }
+    return in_use;
+}
+
 MenderPlace find_church_to_mend(const StartRequest& request, Workstation& workstation, Clock& clock)
 {
-    Paths paths = startup_steps::first_paths(request, workstation);
-    if (!QFileInfo(paths.folder(Folder::local_settings)).isDir())
-        throw FileError(u"There is no data folder at '%1%2'."_s.arg(paths.data_drive(), data_folder));
-    const SideRecord network = network_settings(paths);
-    const bool shared = network.flag("network") && request.church != booked_out_church;
-    if (shared)
-        paths = paths_at(paths, network.text("path"), Mode::network, 1);
-    if (!QFileInfo(paths.folder(Folder::data_root)).isDir())
-        throw FileError(u"The network's data folder '%1' cannot be reached."_s.arg(network.text("path")));
-    const Mode mode = shared ? Mode::network : Mode::normal;
-    const int church = request.church > 0 ? request.church : only_church(paths, mode);
-    MenderPlace place{.paths = paths_at(paths, paths.folder(Folder::data_root), mode_of(church, mode), church),
-                      .church = church,
-                      .workstation = workstation,
-                      .clock = clock};
+    const Paths local = startup_steps::first_paths(request, workstation);
+    if (!QFileInfo(local.folder(Folder::local_settings)).isDir())
+        throw FileError(u"There is no data folder at '%1%2'."_s.arg(local.data_drive(), data_folder));
+    const QString root = church_paths(local, std::max(request.church, 1)).folder(Folder::data_root);
+    if (!QFileInfo(root).isDir())
+        throw FileError(u"The network's data folder '%1' cannot be reached."_s.arg(root));
+    const int church = request.church > 0 ? request.church : only_church(local);
+    MenderPlace place{
+        .paths = church_paths(local, church), .church = church, .workstation = workstation, .clock = clock};
     open(place);
     return place;
 }

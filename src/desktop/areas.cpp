@@ -1,5 +1,7 @@
 #include "desktop/areas.h"
 
+#include "desktop/backup/backup_page.h"
+#include "desktop/backup/restore_page.h"
 #include "desktop/core/global_variables_page.h"
 #include "desktop/core/network_page.h"
 #include "desktop/core/security_page.h"
@@ -58,6 +60,9 @@ constexpr std::array areas{
     AreaDefinition{"vision", "Vision", "flag", core::AreaId::vision_setup, Parked::leave_first, enter<VisionPage>},
     AreaDefinition{"global_data", "Global Data", "globe", core::AreaId::global_data, Parked::leave_first,
                    enter<GlobalVariablesPage>},
+    AreaDefinition{"backup", "Backup", "backup", core::AreaId::backup, Parked::leave_first, enter<BackupPage>},
+    AreaDefinition{"restore", "Restore", "document-revert", core::AreaId::restore, Parked::leave_first,
+                   enter<RestorePage>},
 };
 
 } // namespace

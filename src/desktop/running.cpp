@@ -1,6 +1,9 @@
 #include "desktop/running.h"
 
 #include "desktop/areas.h"
+#include "desktop/backup/backup_page.h"
+#include "desktop/backup/exit_question.h"
+#include "desktop/backup/restore_page.h"
 #include "desktop/church_choice.h"
 #include "desktop/people/editor_page.h"
 #include "desktop/people/speed_find.h"
@@ -45,6 +48,8 @@ void Running::build()
         if (m_surroundings.ended)
             m_surroundings.ended();
     });
+    connect(m_window.get(), &MainWindow::page_made, this, &Running::listen_to);
+    m_window->set_last_question([this] { return may_exit(); });
     m_window->show();
 }
 
@@ -123,6 +128,57 @@ void Running::switch_to(int church)
         mark_as_set_up(*m_office);
     if (!started && m_surroundings.ended)
         m_surroundings.ended();
+}
+
+void Running::listen_to(Page* page)
+{
+    // Put off until the page's own slot has returned: the page may have to go.
+    if (auto* restoring = qobject_cast<RestorePage*>(page))
+        connect(
+            restoring, &RestorePage::restore_wanted, this,
+            [this, still_there = QPointer(restoring)] {
+                if (still_there)
+                    restore(*still_there);
+            },
+            Qt::QueuedConnection);
+    if (auto* backup = qobject_cast<BackupPage*>(page))
+        connect(backup, &BackupPage::exit_wanted, this, &Running::exit_after_backup, Qt::QueuedConnection);
+}
+
+void Running::restore(RestorePage& page)
+{
+    if (!m_window->make_way_for(u"restore"_s))
+        return;
+    const auto report = core::restore_backup(*m_office, page.request(), m_surroundings.progress);
+    if (!report) {
+        page.say_unchanged();
+        return;
+    }
+    const core::Message restored = restored_message(*report, m_office->day_order());
+    const int church = m_office->church;
+    close();
+    m_surroundings.dialogue.show(restored);
+    if (!start(church) && m_surroundings.ended)
+        m_surroundings.ended();
+}
+
+bool Running::may_exit()
+{
+    if (m_exit_backup_made)
+        return true;
+    const auto backup_first = wants_backup_before_exit(*m_office);
+    if (!backup_first || !*backup_first)
+        return backup_first.has_value();
+    m_window->open_area(u"backup"_s);
+    if (auto* page = qobject_cast<BackupPage*>(m_window->page()))
+        page->exit_afterwards();
+    return false;
+}
+
+void Running::exit_after_backup()
+{
+    m_exit_backup_made = true;
+    m_exit_backup_made = !m_window->close();
 }
 
 } // namespace kindrel::desktop

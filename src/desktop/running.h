@@ -11,7 +11,9 @@ namespace kindrel::desktop {
 
 class EditorPage;
 class MainWindow;
+class Page;
 class QtDialogue;
+class RestorePage;
 class SpeedFindWindow;
 
 /// What the running program was given to work with.
@@ -54,6 +56,13 @@ private:
     /// Enters the editor; it is closed again when nothing could be opened in it.
     void in_editor(std::function<bool(EditorPage&)> act);
     void switch_to(int church);
+    /// What pages ask for that only the running program can do.
+    void listen_to(Page* page);
+    /// Everything that is open leaves, and the program starts anew into the restored church.
+    void restore(RestorePage& page);
+    /// False: the person stays, or makes a backup first.
+    [[nodiscard]] bool may_exit();
+    void exit_after_backup();
     void build();
     void close();
 
@@ -63,6 +72,7 @@ private:
     std::unique_ptr<Windows> m_windows;
     std::unique_ptr<Desk> m_desk;
     std::unique_ptr<MainWindow> m_window;
+    bool m_exit_backup_made = false;
     QPointer<SpeedFindWindow> m_speed_find; ///< The main window's; null until it is first wanted.
 };
 

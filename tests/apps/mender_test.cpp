@@ -16,6 +16,10 @@ protected:
     [[nodiscard]] Ended mender(const QStringList& words)
     {
         QProcess program;
+        auto environment = QProcessEnvironment::systemEnvironment();
+        for (const auto& display : {u"DISPLAY"_s, u"WAYLAND_DISPLAY"_s})
+            environment.remove(display); // Where there is one, a window opens when no command is given.
+        program.setProcessEnvironment(environment);
         program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrel-mender"_s,
                       QStringList{u"--data-drive"_s, drive.path()} + words);
         program.closeWriteChannel();

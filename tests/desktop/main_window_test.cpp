@@ -210,6 +210,7 @@ TEST_F(MainWindowTest, AnAreaThatLetsNobodyInLeavesThePageInFront)
 TEST_F(MainWindowTest, ClosingTheWindowEndsTheProgram)
 {
     begin();
+    place.dialogue.expect_confirm_or_cancel(u"Backup Kindrel files before exiting?"_s, false);
     window().close();
     EXPECT_EQ(ended, 1);
 }

@@ -113,6 +113,7 @@ TEST_F(ProjectSetupPageTest, AnIncompleteProjectIsDroppedAndThePageLeftWithoutIt
     place.in_database(u"DROP VIEW [Qry_roll_load_project];"_s);
     place.dialogue.expect_confirm_or_cancel(leave_question, false);
     place.dialogue.expect_box(u"Unable to read the projects"_s);
+    place.dialogue.expect_confirm_or_cancel(u"Backup Kindrel files before exiting?"_s, false);
     EXPECT_TRUE(window().close());
 }
 

@@ -42,15 +42,23 @@ struct Task
     std::function<void()> run;
 };
 
+std::function<void()> to_area(Desk& desk, const QString& key)
+{
+    return [&desk, key] {
+        desk.navigation.open_area(key);
+    };
+}
+
 std::vector<Task> tasks_of(Desk& desk)
 {
     return {
         {u"reports"_s, u"Create Reports and Data Analysis"_s,
          u"Directories, lists, labels, albums and every other report."_s, u"office-report"_s,
-         core::Area::report_outputs,
-         [&desk] {
-             desk.navigation.open_area(u"reports"_s);
-         }},
+         core::Area::report_outputs, to_area(desk, u"reports"_s)},
+        {u"backup"_s, u"Backup Data"_s, u"Compress and backup the database files."_s, u"backup"_s,
+         core::Area::backup_data, to_area(desk, u"backup"_s)},
+        {u"restore"_s, u"Restore Data"_s, u"Restore a backup."_s, u"document-revert"_s, core::Area::restore_data,
+         to_area(desk, u"restore"_s)},
         {u"load_church"_s, u"Load a New Church Database"_s,
          u"Load a completely different and Independent database for keeping records."_s, u"document-open-folder"_s,
          std::nullopt,

@@ -175,6 +175,7 @@ bool MainWindow::make_page(std::size_t place)
     connect(
         made, &Page::finished, this, [this, place] { close_place(place); }, Qt::QueuedConnection);
     show_marks();
+    Q_EMIT page_made(made);
     return true;
 }
 
@@ -185,12 +186,6 @@ void MainWindow::show_marks()
         const bool locked = page && page->holds_lock();
         m_rail->mark(int(place), {.altered = page && page->altered(), .locked = locked, .idle = locked && m_idle});
     }
-}
-
-void MainWindow::set_idle(bool idle)
-{
-    m_idle = idle;
-    show_marks();
 }
 
 void MainWindow::close_page()
@@ -205,6 +200,11 @@ bool MainWindow::leave_all()
     return m_stack->leave_all();
 }
 
+bool MainWindow::make_way_for(const QString& key)
+{
+    return m_stack->make_way(place_of(key));
+}
+
 void MainWindow::show_status()
 {
     m_count->setText(page()->status());
@@ -217,7 +217,8 @@ void MainWindow::show_help()
 
 void MainWindow::closeEvent(QCloseEvent* event)
 {
-    if (!leave_all()) {
+    const bool unasked = m_session_end.under_way() || !m_may_close;
+    if (!leave_all() || !(unasked || m_may_close())) {
         event->ignore();
         return;
     }

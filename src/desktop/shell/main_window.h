@@ -2,9 +2,11 @@
 
 #include "desktop/shell/area.h"
 #include "desktop/shell/look.h"
+#include "desktop/shell/session_end.h"
 
 #include <QMainWindow>
 
+#include <functional>
 #include <span>
 
 class QLabel;
@@ -31,8 +33,13 @@ public:
     [[nodiscard]] Page* page() const;
     /// Asks every page that is open, in front; false when one of them stays.
     [[nodiscard]] bool leave_all();
+    /// Asks and closes the pages that the area of this key does not work beside; false when one of them stays.
+    [[nodiscard]] bool make_way_for(const QString& key);
+    /// What is asked when every page has left and a person closes the window; false: it stays open.
+    void set_last_question(std::function<bool()> may_close) { m_may_close = std::move(may_close); }
 
 Q_SIGNALS:
+    void page_made(Page* page);
     void closed();
 
 protected:
@@ -54,7 +61,11 @@ private:
     [[nodiscard]] bool make_page(std::size_t place);
     /// What the rail shows of the pages' states.
     void show_marks();
-    void set_idle(bool idle);
+    void set_idle(bool idle)
+    {
+        m_idle = idle;
+        show_marks();
+    }
     void close_page();
     void show_status();
     void show_help();
@@ -67,6 +78,8 @@ private:
     PageStack* m_stack;
     QLabel* m_mode;
     QLabel* m_count;
+    SessionEnd m_session_end;
+    std::function<bool()> m_may_close;
     bool m_idle = false;
 };
 

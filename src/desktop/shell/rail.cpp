@@ -3,7 +3,11 @@
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
 
+#include <QKeyEvent>
 #include <QPainter>
+#include <QScrollArea>
+#include <QScrollBar>
+#include <QToolButton>
 #include <QVBoxLayout>
 
 #include <algorithm>
@@ -14,138 +18,57 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr int icon_size = 22;
-constexpr int inset = 4;
-constexpr int button_height = 40;
-constexpr int dot_size = 8;
-constexpr int mark_size = 16;
-constexpr QStringView still_locked = u"still locked for others";
+constexpr int gap = 2;
+constexpr int arrow_height = 18;
 
 } // namespace
 
-RailButton::RailButton(const QString& icon_name, const QString& text)
-{
-    setIcon(desktop::icon(icon_name));
-    setText(text);
-    setAccessibleName(text);
-    setToolTip(text);
-    setFocusPolicy(Qt::TabFocus);
-    setAttribute(Qt::WA_Hover);
-    setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Fixed);
-}
-
-void RailButton::set_narrow(bool narrow)
-{
-    m_narrow = narrow;
-    update();
-}
-
-void RailButton::set_tip(const QString& tip)
-{
-    m_tip = tip;
-    set_marks(m_marks);
-}
-
-void RailButton::set_marks(const RailMarks& marks)
-{
-    m_marks = marks;
-    const QString words = mark_words();
-    setToolTip(words.isEmpty() ? m_tip : m_tip + u'\n' + words);
-    setAccessibleDescription(words);
-    update();
-}
-
-QString RailButton::mark_words() const
-{
-    QStringList words;
-    if (m_marks.altered)
-        words += u"has unsaved work"_s;
-    if (m_marks.locked)
-        words += m_marks.idle ? still_locked.toString() : u"locked for others"_s;
-    return words.join(u'\n');
-}
-
-QSize RailButton::sizeHint() const
-{
-    return {m_narrow ? Rail::narrow : Rail::wide, std::max(button_height, fontMetrics().height() + 2 * space::field)};
-}
-
-void RailButton::paint_ground(QPainter& painter) const
-{
-    const QRectF place = QRectF(rect()).adjusted(inset, 2, -inset, -2);
-    if (stands_out() || (isEnabled() && underMouse())) {
-        painter.setPen(Qt::NoPen);
-        painter.setBrush(stands_out() ? palette().color(QPalette::Highlight) : hover_colour(shade_of(palette())));
-        painter.drawRoundedRect(place, 5, 5);
-    }
-    if (!hasFocus())
-        return;
-    painter.setBrush(Qt::NoBrush);
-    painter.setPen(QPen(palette().color(stands_out() ? QPalette::HighlightedText : QPalette::Highlight), 2));
-    painter.drawRoundedRect(place.adjusted(2, 2, -2, -2), 4, 4);
-}
-
-void RailButton::paint_words(QPainter& painter, QRect place) const
-{
-    const auto elided = [&](const QString& words) {
-        return painter.fontMetrics().elidedText(words, Qt::ElideRight, place.width(), Qt::TextShowMnemonic);
-    };
-    painter.setPen(palette().color(stands_out() ? QPalette::HighlightedText : QPalette::WindowText));
-    if (!m_marks.idle) {
-        painter.drawText(place, Qt::AlignVCenter | Qt::TextShowMnemonic, elided(text()));
-        return;
-    }
-    place.adjust(0, inset, 0, -inset);
-    painter.drawText(place, Qt::AlignTop | Qt::TextShowMnemonic, elided(text()));
-    painter.setFont(font_for(TextSize::secondary));
-    painter.drawText(place.adjusted(0, 0, dot_size + mark_size, 0), Qt::AlignBottom, still_locked.toString());
-}
-
-void RailButton::paint_marks(QPainter& painter) const
-{
-    // On the icon's corners when there is no room beside the name.
-    const int right = width() - inset - (m_narrow ? 2 : space::field);
-    const int middle = m_narrow || m_marks.idle ? inset + mark_size / 2 + 2 : height() / 2;
-    int place = right;
-    if (m_marks.locked) {
-        place -= mark_size;
-        desktop::icon(u"object-locked"_s)
-            .paint(&painter,
-                   QRect(place, m_narrow ? height() - inset - mark_size : middle - mark_size / 2, mark_size, mark_size),
-                   Qt::AlignCenter, stands_out() ? QIcon::Selected : QIcon::Normal);
-        place = m_narrow ? right : place - inset;
-    }
-    if (m_marks.altered) {
-        painter.setPen(Qt::NoPen);
-        painter.setBrush(stands_out() ? palette().color(QPalette::HighlightedText)
-                                      : state_colour(State::altered, shade_of(palette())));
-        painter.drawEllipse(QRectF(place - dot_size, middle - dot_size / 2.0, dot_size, dot_size));
-    }
-}
-
-void RailButton::paintEvent(QPaintEvent*)
-{
-    QPainter painter(this);
-    painter.setRenderHint(QPainter::Antialiasing);
-    paint_ground(painter);
-    const QRect picture(m_narrow ? (width() - icon_size) / 2 : space::margin, (height() - icon_size) / 2, icon_size,
-                        icon_size);
-    icon().paint(&painter, picture, Qt::AlignCenter,
-                 !isEnabled()   ? QIcon::Disabled
-                 : stands_out() ? QIcon::Selected
-                                : QIcon::Normal);
-    const int marks = (m_marks.altered ? dot_size + inset : 0) + (m_marks.locked ? mark_size + inset : 0);
-    if (!m_narrow)
-        paint_words(painter, rect().adjusted(picture.right() + space::field + 2, 0, -space::field - marks, 0));
-    paint_marks(painter);
-}
-
-Rail::Rail(QWidget* parent) : QWidget(parent), m_column(new QVBoxLayout(this))
+Rail::Rail(QWidget* parent)
+    : QWidget(parent), m_column(new QVBoxLayout), m_foot_column(new QVBoxLayout), m_scroll(new QScrollArea),
+      m_earlier(make_arrow(u"go-up"_s, u"Earlier areas"_s, -1)),
+      m_further(make_arrow(u"go-down"_s, u"Further areas"_s, 1))
 {
     setFixedWidth(wide);
-    m_column->setContentsMargins(0, space::field, 1, space::field);
-    m_column->setSpacing(2);
+    auto* areas = new QWidget;
+    areas->setLayout(m_column);
+    m_column->setContentsMargins(0, 0, 0, 0);
+    m_column->setSpacing(gap);
     m_column->addStretch(1);
+    m_scroll->setFrameShape(QFrame::NoFrame);
+    m_scroll->setFocusPolicy(Qt::NoFocus);
+    m_scroll->setWidgetResizable(true);
+    m_scroll->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    m_scroll->setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    m_scroll->setWidget(areas);
+    areas->setAutoFillBackground(false); // A scroll area turns it on.
+    m_scroll->viewport()->setAutoFillBackground(false);
+    m_foot_column->setSpacing(gap);
+    auto* column = new QVBoxLayout(this);
+    column->setContentsMargins(0, space::field, 1, space::field);
+    column->setSpacing(gap);
+    column->addWidget(m_scroll, 1);
+    column->addLayout(m_foot_column);
+    const QScrollBar* bar = m_scroll->verticalScrollBar();
+    connect(bar, &QAbstractSlider::valueChanged, this, &Rail::place_arrows);
+    connect(bar, &QAbstractSlider::rangeChanged, this, &Rail::place_arrows);
+}
+
+QToolButton* Rail::make_arrow(const QString& icon_name, const QString& words, int step)
+{
+    auto* arrow = new QToolButton(this);
+    arrow->setIcon(icon(icon_name));
+    arrow->setToolTip(words);
+    arrow->setAccessibleName(words);
+    arrow->setFocusPolicy(Qt::NoFocus);
+    arrow->setAutoRepeat(true);
+    arrow->setAutoFillBackground(true);
+    arrow->setBackgroundRole(QPalette::Button);
+    arrow->hide();
+    connect(arrow, &QAbstractButton::clicked, this, [this, step] {
+        auto* bar = m_scroll->verticalScrollBar();
+        bar->setValue(bar->value() + 2 * step * RailButton::low_height);
+    });
+    return arrow;
 }
 
 RailButton* Rail::add_area(const QString& icon_name, const QString& text)
@@ -153,6 +76,7 @@ RailButton* Rail::add_area(const QString& icon_name, const QString& text)
     auto* button = new RailButton(icon_name, text);
     button->setCheckable(true);
     button->setAutoExclusive(true);
+    button->installEventFilter(this);
     const int place = int(m_areas.size());
     m_column->insertWidget(place, button);
     m_areas.push_back(button);
@@ -163,7 +87,7 @@ RailButton* Rail::add_area(const QString& icon_name, const QString& text)
 RailButton* Rail::add_foot(const QString& icon_name, const QString& text)
 {
     auto* button = new RailButton(icon_name, text);
-    m_column->addWidget(button);
+    m_foot_column->addWidget(button);
     m_foot.push_back(button);
     return button;
 }
@@ -176,9 +100,77 @@ void Rail::set_narrow(bool shortened)
             button->set_narrow(shortened);
 }
 
+void Rail::fit()
+{
+    int needed = 2 * space::field;
+    for (const auto* group : {&m_areas, &m_foot})
+        for (const RailButton* button : *group)
+            needed += button->full_height() + gap;
+    for (const auto* group : {&m_areas, &m_foot})
+        for (RailButton* button : *group)
+            button->set_low(needed > height());
+    place_arrows();
+}
+
+void Rail::bring_into_view(QWidget& button)
+{
+    const QRect place = button.geometry();
+    m_scroll->ensureVisible(0, place.bottom() + gap, 0, arrow_height);
+    m_scroll->ensureVisible(0, place.top() - gap, 0, arrow_height);
+}
+
+void Rail::place_arrows()
+{
+    const QScrollBar* bar = m_scroll->verticalScrollBar();
+    const QRect place = m_scroll->geometry();
+    m_earlier->setGeometry(place.left(), place.top(), place.width(), arrow_height);
+    m_further->setGeometry(place.left(), place.bottom() + 1 - arrow_height, place.width(), arrow_height);
+    m_earlier->setVisible(bar->value() > bar->minimum());
+    m_further->setVisible(bar->value() < bar->maximum());
+    for (auto* arrow : {m_earlier, m_further})
+        arrow->raise();
+}
+
+bool Rail::event(QEvent* event)
+{
+    const bool done = QWidget::event(event);
+    if (event->type() == QEvent::Resize || event->type() == QEvent::FontChange ||
+        event->type() == QEvent::LayoutRequest)
+        fit();
+    return done;
+}
+
+void Rail::go(const QObject* from, int step)
+{
+    const int count = int(m_areas.size());
+    int place = int(std::ranges::find(m_areas, from) - m_areas.begin()) + step;
+    while (place >= 0 && place < count && !m_areas[std::size_t(place)]->isEnabled())
+        place += step;
+    if (place >= 0 && place < count)
+        m_areas[std::size_t(place)]->setFocus(step < 0 ? Qt::BacktabFocusReason : Qt::TabFocusReason);
+}
+
+bool Rail::eventFilter(QObject* target, QEvent* event)
+{
+    if (event->type() == QEvent::FocusIn)
+        bring_into_view(*static_cast<QWidget*>(target));
+    if (event->type() != QEvent::KeyPress)
+        return QWidget::eventFilter(target, event);
+    const int key = static_cast<QKeyEvent*>(event)->key();
+    if (key == Qt::Key_Up || key == Qt::Key_Down) // The button itself would open every area on the way.
+        go(target, key == Qt::Key_Up ? -1 : 1);
+    else if (key == Qt::Key_Return || key == Qt::Key_Enter)
+        static_cast<RailButton*>(target)->click();
+    else
+        return QWidget::eventFilter(target, event);
+    return true;
+}
+
 void Rail::choose(int area)
 {
-    m_areas.at(std::size_t(area))->setChecked(true);
+    RailButton& button = *m_areas.at(std::size_t(area));
+    button.setChecked(true);
+    bring_into_view(button);
 }
 
 void Rail::mark(int area, const RailMarks& marks)

@@ -1,63 +1,24 @@
 #pragma once
 
-#include <QAbstractButton>
-#include <QWidget>
+#include "desktop/shell/rail_button.h"
 
 #include <vector>
 
+class QScrollArea;
+class QToolButton;
 class QVBoxLayout;
 
 namespace kindrel::desktop {
 
-/// What the rail shows of a page beside its name.
-struct RailMarks
-{
-    bool altered = false; ///< A dot.
-    bool locked = false;  ///< A padlock.
-    bool idle = false;    ///< A reminder that others still wait for the lock.
-
-    friend bool operator==(const RailMarks&, const RailMarks&) = default;
-};
-
-/// One area of the rail: icon and name, or the icon alone when space is short.
-class RailButton : public QAbstractButton
-{
-    Q_OBJECT
-
-public:
-    RailButton(const QString& icon_name, const QString& text);
-
-    void set_narrow(bool narrow);
-    void set_tip(const QString& tip);
-    void set_marks(const RailMarks& marks);
-    [[nodiscard]] const RailMarks& marks() const { return m_marks; }
-    /// The marks in words, a line each.
-    [[nodiscard]] QString mark_words() const;
-    [[nodiscard]] QSize sizeHint() const override;
-
-protected:
-    void paintEvent(QPaintEvent* event) override;
-
-private:
-    void paint_ground(QPainter& painter) const;
-    void paint_words(QPainter& painter, QRect place) const;
-    void paint_marks(QPainter& painter) const;
-    /// Chosen or pressed: on the ground of a selection.
-    [[nodiscard]] bool stands_out() const { return isChecked() || isDown(); }
-
-    QString m_tip;
-    RailMarks m_marks;
-    bool m_narrow = false;
-};
-
-/// The areas at the left of the window, one of them chosen, and the program's own menus at the foot.
+/// The areas at the left of the window, one of them chosen, and the program's own menus at the foot. In a low window
+/// the areas come closer together and scroll, with arrows where there are more.
 class Rail : public QWidget
 {
     Q_OBJECT
 
 public:
-    static constexpr int wide = 168;
-    static constexpr int narrow = 48;
+    static constexpr int wide = RailButton::wide;
+    static constexpr int narrow = RailButton::narrow;
 
     explicit Rail(QWidget* parent = nullptr);
 
@@ -72,9 +33,23 @@ Q_SIGNALS:
 
 protected:
     void paintEvent(QPaintEvent* event) override;
+    bool event(QEvent* event) override;
+    bool eventFilter(QObject* target, QEvent* event) override;
 
 private:
+    [[nodiscard]] QToolButton* make_arrow(const QString& icon_name, const QString& words, int step);
+    /// Full or low buttons, by the height there is.
+    void fit();
+    void bring_into_view(QWidget& button);
+    /// The next area that is open in this direction gets the focus; nothing is opened.
+    void go(const QObject* from, int step);
+    void place_arrows();
+
     QVBoxLayout* m_column;
+    QVBoxLayout* m_foot_column;
+    QScrollArea* m_scroll;
+    QToolButton* m_earlier;
+    QToolButton* m_further;
     std::vector<RailButton*> m_areas, m_foot;
 };
 
