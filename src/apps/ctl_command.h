@@ -84,5 +84,6 @@ struct Command
 [[nodiscard]] Status run_backups(Context& context);
 [[nodiscard]] Status run_show_backup(Context& context);
 [[nodiscard]] Status run_restore(Context& context);
+[[nodiscard]] Status run_copy_church(Context& context);
 
 } // namespace kindrel::apps

@@ -54,6 +54,12 @@ constexpr std::array restore_options{
     backup_password,
     Option{"yes", nullptr, "replace the present state without asking; it is kept as a backup all the same"},
 };
+constexpr std::array copy_church_options{
+    Option{"from", "N", "the church to copy (default: the one in use)"},
+    Option{"to", "END", "a church file (FILE.kdl), a server's keywords, or a file that holds them (FILE.server)"},
+    Option{"replace", nullptr, "take the place of an older copy of the same church"},
+    Option{"yes", nullptr, "replace it without asking"},
+};
 
 constexpr std::array command_table{
     Command{"install",
@@ -106,6 +112,12 @@ constexpr std::array command_table{
             "Replaces the church by a backup of it, once everything in the backup was compared. The state before is\n"
             "kept as a backup first. Asks on the terminal; where nobody sits at it, nothing changes without --yes.",
             Needs::church, core::Area::restore_data, 1, restore_options, run_restore},
+    Command{
+        "copy-church", "[--from N] --to END [--replace] [--yes]", "copy a church to a server, or back to a file",
+        "Copies a church's database into an empty database of a server (--to \"host=HOST dbname=NAME user=NAME\")\n"
+        "or into a church file, and compares every table of the copy before it appears. Refused while anybody works\n"
+        "in the church. The church itself does not change, and is used as before until its folder says otherwise.",
+        Needs::nothing, core::Area::backup_data, 0, copy_church_options, run_copy_church},
 };
 
 } // namespace

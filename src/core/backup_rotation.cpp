@@ -1,5 +1,6 @@
 #include "core/backup_rotation.h"
 
+#include "core/backup_files.h"
 #include "core/marker.h"
 #include "core/open_church.h"
 #include "core/side_files.h"
@@ -48,7 +49,7 @@ void rotate_system_backups(const Paths& paths, int church, const QDate& today)
 {
     if (church < 1 || church >= training_church || !church_present(paths))
         return;
-    const QString folder = as_folder(paths.file(Folder::church, u"Backup1"_s));
+    const QString folder = own_backup_folder(paths, 1);
     if (!due(backup_path(folder, 0), today))
         return;
     const auto busy = Marker::take(paths, side_files::busy);

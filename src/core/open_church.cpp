@@ -1,5 +1,6 @@
 #include "core/open_church.h"
 
+#include "core/copy_church_tables.h"
 #include "core/marker.h"
 #include "core/postgres_session.h"
 #include "core/side_files.h"
@@ -27,8 +28,11 @@ std::optional<Marker> wait_for_turn(const Paths& paths, Clock& clock, Progress& 
     return std::nullopt;
 }
 
+/// A database of a server may have been made for a church that was not copied into it yet.
 void prime(Session& session)
 {
+    if (session.engine() == EngineKind::postgres && church_tables(session).isEmpty())
+        throw DatabaseError(u"The database on the server is empty: no church was copied into it yet."_s);
     auto rows = session.select(u"SELECT COUNT(*) FROM [qry_search_window];"_s);
     (void)rows.first();
 }
@@ -39,6 +43,13 @@ void refuse_entry(Dialogue& dialogue)
     dialogue.show(information(
         u"Unable to Enter %1 as a security lock is on, please use the Kindrel Mender Program to reset the security "
         "lock so that access can be granted into the program"_s.arg(product)));
+}
+
+/// The server that the church folder names; nullopt for a church file.
+std::optional<QString> server_of(const Paths& paths)
+{
+    const auto connection = read_file(paths.file(Folder::church, connection_file.toString()));
+    return connection ? std::optional(QString::fromUtf8(*connection).trimmed()) : std::nullopt;
 }
 
 bool answers(Session& session)
@@ -77,8 +88,14 @@ bool church_present(const Paths& paths)
 
 std::unique_ptr<Session> connect_church(const Paths& paths)
 {
-    const auto connection = read_file(paths.file(Folder::church, connection_file.toString()));
-    return connection ? open_postgres(QString::fromUtf8(*connection).trimmed()) : open_sqlite(paths.database());
+    const auto server = server_of(paths);
+    return server ? open_postgres(*server) : open_sqlite(paths.database());
+}
+
+std::unique_ptr<Session> connect_to_read(const Paths& paths)
+{
+    const auto server = server_of(paths);
+    return server ? open_postgres_snapshot(*server) : open_sqlite(paths.database());
 }
 
 std::unique_ptr<Session> connect_in_turn(const Paths& paths, Mode mode, Clock& clock, Progress& progress)
@@ -128,7 +145,8 @@ Message busy_notice()
 
 bool network_guard(const Office& office)
 {
-    if (office.mode != Mode::network || (church_present(office.paths) && answers(*office.session)))
+    const bool folder_there = office.mode != Mode::network || church_present(office.paths);
+    if (!office.shared() || (folder_there && answers(*office.session)))
         return true;
     office.dialogue.show(
         information(u"Unable to access your network files."_s,

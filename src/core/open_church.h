@@ -13,7 +13,10 @@ inline constexpr QStringView connection_file = u"KR10_records.server";
 /// Opens what the church folder names: the server of the connection file, else the church file. Throws DatabaseError
 /// or FileError.
 [[nodiscard]] std::unique_ptr<Session> connect_church(const Paths& paths);
-/// The same, in network mode behind the `security.dat` looks. Null when it did not become this workstation's turn.
+/// The same for reading alone: what a transaction reads is of one moment.
+[[nodiscard]] std::unique_ptr<Session> connect_to_read(const Paths& paths);
+/// What connect_church() does, in network mode behind the `security.dat` looks. Null when it did not become this
+/// workstation's turn.
 [[nodiscard]] std::unique_ptr<Session> connect_in_turn(const Paths& paths, Mode mode, Clock& clock, Progress& progress);
 
 /// Opens the church's session behind the `security.dat` looks of network mode. On failure the stated message is shown

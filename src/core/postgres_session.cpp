@@ -2,11 +2,7 @@
 
 #include "core/dialect.h"
 #include "core/postgres_copy.h"
-
-#include <QHash>
-
-#include <libpq-fe.h>
-#include <pqxx/pqxx>
+#include "core/postgres_link.h"
 
 #include <cstdlib>
 
@@ -21,63 +17,59 @@ constexpr std::size_t values_per_statement = 30000;
 constexpr std::size_t rows_worth_counting = 200;
 constexpr unsigned bytea_type = 17;
 constexpr std::array<unsigned, 3> whole_number_types{20, 21, 23};
-/// First half of the advisory locks' keys; the second is the entity's number.
-constexpr int counter_locks = 0x4B444C;
+/// First half of the advisory locks' keys; the second is a counter's entity, or 0 for the turn to write.
+constexpr int advisory_locks = 0x4B444C;
+/// How long a write waits for its turn.
+constexpr int patience_milliseconds = 15000;
 
-template <class Work>
-auto guarded(Work&& work) -> decltype(work())
+/// What becomes of a statement when the connection is lost before its answer: one that changes nothing is sent once
+/// more, outside a transaction; any other never is.
+enum class Loss { repeat, nothing_stored, unsure };
+
+QString words_of(Loss loss)
 {
-    try {
-        return work();
-    } catch (const pqxx::integrity_constraint_violation& error) {
-        throw DatabaseError(QString::fromUtf8(error.what()), true);
-    } catch (const pqxx::pqxx_exception& error) {
-        throw DatabaseError(QString::fromUtf8(error.base().what()));
+    switch (loss) {
+    case Loss::repeat:
+        return u"The connection to the database server was lost twice in a row. Nothing was changed."_s;
+    case Loss::nothing_stored:
+        return u"The connection to the database server was lost. Nothing of what was to be stored has been stored: "
+               "please do it again."_s;
+    case Loss::unsure:
+        break;
     }
+    return u"The connection to the database server was lost while a change was being stored. It may have been stored "
+           "or not: please look before you do it again."_s;
 }
 
-/// The values as libpq takes them: texts, or null.
-class Parameters
+DatabaseError with_cause(const QString& words, const DatabaseError& cause)
 {
-public:
-    explicit Parameters(std::size_t expected)
-    {
-        m_texts.reserve(expected);
-        m_null.reserve(expected);
-    }
-    void add(const Value& value)
-    {
-        m_null.push_back(std::holds_alternative<std::monostate>(value));
-        m_texts.push_back(as_text(value));
-    }
-    void add_all(std::span<const Value> values)
-    {
-        for (const auto& value : values)
-            add(value);
-    }
-    [[nodiscard]] std::vector<const char*> pointers() const
-    {
-        std::vector<const char*> found(m_texts.size());
-        for (std::size_t i = 0; i < found.size(); ++i)
-            found[i] = m_null[i] ? nullptr : m_texts[i].c_str();
-        return found;
-    }
+    return DatabaseError(u"%1\n%2"_s.arg(words, cause.text().trimmed()));
+}
 
-private:
-    static std::string as_text(const Value& value)
-    {
-        if (const auto* number = std::get_if<qint64>(&value))
-            return std::to_string(*number);
-        if (const auto* bytes = std::get_if<QByteArray>(&value))
-            return "\\x" + bytes->toHex().toStdString();
-        const auto* text = std::get_if<QString>(&value);
-        if (text && text->contains(QChar::Null))
-            throw DatabaseError(u"A text holds a null character."_s);
-        return text ? text->toStdString() : std::string();
-    }
-    std::vector<std::string> m_texts;
-    std::vector<bool> m_null;
+/// Adds rows in as few statements as the protocol allows.
+void insert_all(PostgresLink& link, const QString& table, const QStringList& fields,
+                std::span<const std::vector<Value>> rows)
+{
+    const auto at_once = std::max<std::size_t>(1, values_per_statement / static_cast<std::size_t>(fields.size()));
+    for (std::size_t start = 0; start < rows.size(); start += at_once)
+        link.insert(table, fields, rows.subspan(start, std::min(at_once, rows.size() - start)));
+}
+
+/// A session's own table, kept so that it can be laid again on another connection.
+struct Temporary
+{
+    QStringList columns;
+    std::vector<std::vector<Value>> rows;
 };
+
+void lay(PostgresLink& link, const QString& table, const QStringList& columns, std::span<const std::vector<Value>> rows)
+{
+    link.exec(temporary_table(table, columns), {});
+    link.exec(u"TRUNCATE [%1]"_s.arg(table), {});
+    insert_all(link, table, columns, rows);
+    if (rows.size() > rows_worth_counting)
+        link.exec(u"ANALYZE [%1]"_s.arg(table), {});
+}
 
 class PostgresCursor : public Cursor
 {
@@ -129,36 +121,36 @@ class PostgresSession : public Session
 {
 public:
     explicit PostgresSession(const QString& connection)
-        : m_connection(connection.toStdString()), m_quiet(m_connection), m_work(m_connection)
+        : m_keywords(complete_keywords(connection)), m_link(std::make_unique<PostgresLink>(m_keywords))
     {
-        m_connection.set_client_encoding("UTF8");
     }
 
     EngineKind engine() const override { return EngineKind::postgres; }
 
     void insert(const QString& table, const QStringList& fields, std::span<const std::vector<Value>> rows) override
     {
-        const auto at_once = std::max<std::size_t>(1, values_per_statement / static_cast<std::size_t>(fields.size()));
-        for (std::size_t start = 0; start < rows.size(); start += at_once)
-            insert_some(table, fields, rows.subspan(start, std::min(at_once, rows.size() - start)));
+        if (rows.empty())
+            return;
+        std::optional<Transaction> transaction;
+        if (transaction_depth() == 0)
+            transaction.emplace(*this);
+        on_link(Loss::nothing_stored, [&](PostgresLink& link) { insert_all(link, table, fields, rows); });
+        if (transaction)
+            transaction->commit();
     }
 
     void fill_temporary(const QString& table, const QStringList& columns,
                         std::span<const std::vector<Value>> rows) override
     {
-        run(temporary_table(table, columns), {});
-        run(u"TRUNCATE [%1]"_s.arg(table), {});
-        insert(table, columns, rows);
-        if (rows.size() > rows_worth_counting)
-            run(u"ANALYZE [%1]"_s.arg(table), {});
+        on_link(outside_transaction(Loss::repeat), [&](PostgresLink& link) { lay(link, table, columns, rows); });
+        m_temporaries.insert(table, {columns, {rows.begin(), rows.end()}});
     }
 
     void run_script(const QString& script) override
     {
-        guarded([&] {
-            for (const auto& statement : split_script(script))
-                m_work.exec(schema_for_postgres(statement).toStdString());
-        });
+        for (const auto& statement : split_script(script))
+            on_link(outside_transaction(Loss::unsure),
+                    [&](PostgresLink& link) { link.exec_as_is(schema_for_postgres(statement)); });
     }
 
     qint64 change_mark() override
@@ -167,88 +159,124 @@ public:
         return rows.first()->number(Column{0});
     }
 
-    void copy_to(const QString& file) override { copy_to_file(*this, file); }
+    void copy_to(const QString& file) override { copy_to_file(*open_postgres_snapshot(m_keywords), file); }
     void replace_content(const QString& file) override { replace_from_file(*this, file); }
 
 protected:
     std::unique_ptr<Cursor> run_select(const QString& text, std::span<const Value> values) override
     {
-        return std::make_unique<PostgresCursor>(exec(text, values));
+        const bool reads = text.startsWith(u"SELECT"_s, Qt::CaseInsensitive);
+        const auto loss = outside_transaction(reads ? Loss::repeat : Loss::unsure);
+        return std::make_unique<PostgresCursor>(
+            on_link(loss, [&](PostgresLink& link) { return link.exec(text, values); }));
     }
     int run(const QString& text, std::span<const Value> values) override
     {
-        return static_cast<int>(exec(text, values).affected_rows());
+        if (text == u"ROLLBACK" && !connected())
+            return 0; // The server has rolled back by itself.
+        const auto loss = text == u"COMMIT" ? Loss::unsure : outside_transaction(Loss::unsure);
+        const auto result = on_link(loss, [&](PostgresLink& link) { return link.exec(text, values); });
+        return static_cast<int>(result.affected_rows());
     }
     void hold_counter(Entity entity) override
     {
-        (void)select(u"SELECT pg_advisory_xact_lock(CAST(? AS integer), CAST(? AS integer))"_s, counter_locks, entity);
+        (void)select(u"SELECT pg_advisory_xact_lock(CAST(? AS integer), CAST(? AS integer))"_s, advisory_locks, entity);
     }
-    void begin_outermost() override { run(u"BEGIN"_s, {}); }
+    /// Those who write take turns, as on a church file: what a transaction has read is still so when it writes.
+    void begin_outermost() override
+    {
+        begin_with(u"BEGIN; SET LOCAL lock_timeout = %1; SELECT pg_advisory_xact_lock(%2, 0)"_s.arg(
+            QString::number(patience_milliseconds), QString::number(advisory_locks)));
+    }
+    void begin_with(const QString& text)
+    {
+        try {
+            on_link(Loss::repeat, [&](PostgresLink& link) { link.exec_as_is(text); });
+        } catch (const DatabaseError&) {
+            end_failed_begin();
+            throw;
+        }
+    }
 
 private:
-    pqxx::result exec(const QString& text, std::span<const Value> values)
+    void end_failed_begin()
     {
-        return guarded([&] {
-            if (values.empty())
-                return m_work.exec(for_postgres(text).toStdString());
-            Parameters parameters(values.size());
-            parameters.add_all(values);
-            return m_work.exec_prepared(prepared(text), pqxx::prepare::make_dynamic_params(parameters.pointers()));
-        });
+        try {
+            run(u"ROLLBACK"_s, {});
+        } catch (const DatabaseError&) {
+            // The connection is gone, and the transaction with it.
+        }
     }
 
-    std::string prepared(const QString& text)
+    /// A transaction is gone with its connection: what was done in it is known not to be stored.
+    [[nodiscard]] Loss outside_transaction(Loss loss) const
     {
-        const auto kept = m_names.constFind(text);
-        if (kept != m_names.cend())
-            return *kept;
-        const auto name = "statement_" + std::to_string(m_names.size());
-        m_connection.prepare(name, for_postgres(text).toStdString());
-        m_names.insert(text, name);
-        return name;
+        return transaction_depth() > 0 ? Loss::nothing_stored : loss;
     }
 
-    void insert_some(const QString& table, const QStringList& fields, std::span<const std::vector<Value>> rows)
+    [[nodiscard]] bool connected()
     {
-        const QString row_marks = u'(' + QStringList(fields.size(), u"?"_s).join(u',') + u')';
-        const QStringList marks(static_cast<qsizetype>(rows.size()), row_marks);
-        const auto text = u"INSERT INTO [%1] ([%2]) VALUES %3"_s.arg(table, fields.join(u"],["_s), marks.join(u','));
-        Parameters parameters(rows.size() * static_cast<std::size_t>(fields.size()));
-        for (const auto& row : rows)
-            parameters.add_all(row);
-        guarded([&] {
-            m_work.exec_params(for_postgres(text).toStdString(),
-                               pqxx::prepare::make_dynamic_params(parameters.pointers()));
-        });
+        if (m_link && m_link->ended())
+            m_link.reset();
+        return m_link != nullptr;
     }
 
-    pqxx::connection m_connection;
-    pqxx::quiet_errorhandler m_quiet;
-    pqxx::nontransaction m_work;
-    QHash<QString, std::string> m_names;
+    /// Runs `work` on the connection, which is made anew where it was lost meanwhile.
+    template <class Work>
+    auto on_link(Loss loss, Work&& work) -> decltype(work(std::declval<PostgresLink&>()))
+    {
+        for (bool first = true;; first = false) {
+            if (!connected())
+                connect_again();
+            try {
+                return work(*m_link);
+            } catch (const LinkLost& lost) {
+                m_link.reset();
+                if (loss != Loss::repeat || !first)
+                    throw with_cause(words_of(loss), lost);
+            }
+        }
+    }
+
+    void connect_again()
+    {
+        if (transaction_depth() > 0)
+            throw DatabaseError(words_of(Loss::nothing_stored));
+        try {
+            auto link = std::make_unique<PostgresLink>(m_keywords);
+            for (auto kept = m_temporaries.cbegin(); kept != m_temporaries.cend(); ++kept)
+                lay(*link, kept.key(), kept->columns, kept->rows);
+            m_link = std::move(link);
+        } catch (const DatabaseError& error) {
+            throw with_cause(u"The database server cannot be reached. Nothing was changed; please try again later."_s,
+                             error);
+        }
+    }
+
+    QString m_keywords;
+    std::unique_ptr<PostgresLink> m_link;
+    QHash<QString, Temporary> m_temporaries;
 };
 
-bool holds_password(const QString& connection)
+class PostgresSnapshot : public PostgresSession
 {
-    char* fault = nullptr;
-    PQconninfoOption* options = PQconninfoParse(connection.toUtf8().constData(), &fault);
-    PQfreemem(fault);
-    if (!options)
-        return false; // Connecting will say what is wrong with it.
-    bool found = false;
-    for (const auto* option = options; option->keyword; ++option)
-        found = found || (option->val && QByteArray(option->keyword) == "password");
-    PQconninfoFree(options);
-    return found;
-}
+public:
+    using PostgresSession::PostgresSession;
+
+protected:
+    void begin_outermost() override { begin_with(u"BEGIN ISOLATION LEVEL REPEATABLE READ READ ONLY"_s); }
+};
 
 } // namespace
 
 std::unique_ptr<Session> open_postgres(const QString& connection)
 {
-    if (holds_password(connection))
-        throw DatabaseError(u"The connection file holds a password. Remove it and use libpq's password file."_s);
-    return guarded([&] { return std::unique_ptr<Session>(std::make_unique<PostgresSession>(connection)); });
+    return std::make_unique<PostgresSession>(connection);
+}
+
+std::unique_ptr<Session> open_postgres_snapshot(const QString& connection)
+{
+    return std::make_unique<PostgresSnapshot>(connection);
 }
 
 } // namespace kindrel::core

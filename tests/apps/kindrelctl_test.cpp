@@ -187,6 +187,7 @@ TEST_F(KindrelctlTest, EveryCommandOnAChurchAsksForItsRight)
         {{u"backups"_s}, "\"Backup Data\""},
         {{u"show-backup"_s, u"backup.zip"_s}, "\"Restore Data\""},
         {{u"restore"_s, u"backup.zip"_s, u"--yes"_s}, "\"Restore Data\""},
+        {{u"copy-church"_s, u"--to"_s, drive.filePath(u"copy.kdl"_s)}, "\"Backup Data\""},
     };
     QStringList asked{u"install"_s}; // It opens no church.
     for (const auto& [words, area] : cases) {

@@ -1,10 +1,12 @@
 #include "core/backup_rotation.h"
 
+#include "core/open_church.h"
 #include "core/settings.h"
 #include "core/sqlite_session.h"
 #include "core/verified_copy.h"
 #include "support/data_folder.h"
 #include "support/processes.h"
+#include "support/test_church.h"
 
 #include <QDir>
 #include <QFile>
@@ -154,6 +156,34 @@ TEST_F(BackupRotationTest, TheBackupHoldsWhatOtherWorkstationsHaveCommitted)
 
     EXPECT_EQ(read_settings(*open_sqlite(backups + u"systembackup.kdl"_s)).vision, u"To serve"_s);
     write_setting(*other, u"vision"_s, u"still open"_s);
+}
+
+TEST_F(BackupRotationTest, AChurchOnAServerIsBackedUpAsAChurchFileWithEveryRow)
+{
+    if (!TestChurch::available(EngineKind::postgres))
+        GTEST_SKIP() << "No server: run through ./test, or tests/support/with-postgres.";
+    TestChurch server(EngineKind::postgres);
+    std::vector<std::vector<Value>> families;
+    for (qint64 key = 1; key <= 12'000; ++key)
+        families.push_back({key, to_value(u"Ö %1"_s.arg(key))});
+    server.session().insert(u"tbl_surname"_s, {u"Surname_ID"_s, u"surname"_s}, families);
+    QFile::remove(church + u"KR10_records.kdl"_s);
+    DataFolder::write(church + connection_file.toString(), server.connection().toUtf8());
+    keep(u"systembackup.kdl"_s, 31);
+    {
+        Transaction somebody_writes(server.session());
+        server.session().execute(u"UPDATE [tbl_surname] SET [surname]='later';"_s);
+        rotate_system_backups(data.paths(), 1, today);
+    }
+    EXPECT_EQ(found(), QStringList({u"database"_s, u"systembackup.kdl"_s, u"-"_s, u"-"_s}));
+    const auto backup = open_sqlite(backups + u"systembackup.kdl"_s);
+    EXPECT_EQ(number_of(*backup, u"SELECT COUNT(*) FROM [tbl_surname] WHERE [surname]='Ö '||[Surname_ID];"_s), 12'000);
+
+    DataFolder::write(church + connection_file.toString(), "host=/nowhere dbname=church");
+    keep(u"systembackup.kdl"_s, 31);
+    EXPECT_THROW(rotate_system_backups(data.paths(), 1, today), DatabaseError);
+    EXPECT_EQ(found(), QStringList({u"systembackup.kdl"_s, u"systembackup.kdl"_s, u"-"_s, u"-"_s}));
+    EXPECT_FALSE(QFile::exists(church + u"lock.dat"_s));
 }
 
 } // namespace kindrel::test
