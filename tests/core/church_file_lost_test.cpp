@@ -1,5 +1,7 @@
-#include "core/sqlite_session.h"
-#include "support/test_church.h"
+#include "backup_place.h"
+
+#include "core/verified_copy.h"
+#include "support/processes.h"
 
 #include <QFile>
 #include <QRandomGenerator>
@@ -93,6 +95,39 @@ TEST_P(ChurchFileLostTest, ASaveIsRefusedAloudAndNeverGoesNowhere)
             DatabaseError);
         EXPECT_THROW(session.execute(u"UPDATE [tbl_surname] SET [surname]='Dahl';"_s), DatabaseError);
     }
+}
+
+TEST(ChurchFileTest, AFullDiskRefusesTheSaveAndKeepsAllThatWasStored)
+{
+    TestChurch church(EngineKind::sqlite);
+    church.session().execute(u"INSERT INTO [tbl_surname] ([Surname_ID],[surname]) VALUES (1,'Holm');"_s);
+    const qint64 full = QFile(church.file()).size() + 40'000;
+    church.close();
+    const auto save_on_full_disk = [&]() -> QByteArray {
+        fill_disk(static_cast<rlim_t>(full));
+        const auto own = church.another();
+        std::vector<std::vector<Value>> rows;
+        for (int family = 2; family < 5000; ++family)
+            rows.push_back({to_value(family), to_value(QString(100, u'x'))});
+        for (int attempt = 0; attempt < 3; ++attempt) {
+            try {
+                own->insert(u"tbl_surname"_s, {u"Surname_ID"_s, u"surname"_s}, rows);
+                return "stored";
+            } catch (const DatabaseError&) {
+                // The next attempt meets the same disk.
+            }
+        }
+        own->execute(u"UPDATE [tbl_surname] SET [surname]='Berg';"_s);
+        return "refused";
+    };
+    EXPECT_EQ(run_together({save_on_full_disk}).front(), "refused");
+
+    church.reopen();
+    EXPECT_EQ(number_of(church.session(), u"SELECT COUNT(*) FROM [tbl_surname];"_s), 1);
+    EXPECT_EQ(number_of(church.session(), u"SELECT COUNT(*) FROM [tbl_surname] WHERE [surname]='Berg';"_s), 1)
+        << "What has room is stored again.";
+    church.close();
+    EXPECT_NO_THROW(check_church_file(church.file()));
 }
 
 } // namespace kindrel::test
