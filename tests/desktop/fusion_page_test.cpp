@@ -316,4 +316,14 @@ TEST_F(FusionPageTest, ALostItemIsMarkedAndCountsForNothing)
               u"People who are active, or of no state; nobody, as the items of all its entries are gone."_s);
 }
 
+TEST_F(FusionPageTest, WhatIsGivenUpIsLeftThoughItCannotBeReadAgain)
+{
+    add_fusion(u"Helpers"_s);
+    place.in_database(u"DROP TABLE [Tbl_fusion_group];"_s);
+    place.dialogue.expect_confirm_or_cancel(leave_question, false);
+    place.dialogue.expect_box(u"What is stored could not be read again."_s);
+    place.dialogue.expect_confirm_or_cancel(u"Backup Kindrel files before exiting?"_s, false);
+    EXPECT_TRUE(window().close());
+}
+
 } // namespace kindrel::test

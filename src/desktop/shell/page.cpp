@@ -1,5 +1,6 @@
 #include "desktop/shell/page.h"
 
+#include "core/session.h"
 #include "desktop/shell/chip.h"
 #include "desktop/shell/elided_label.h"
 #include "desktop/shell/icons.h"
@@ -12,6 +13,8 @@
 #include <QToolButton>
 
 namespace kindrel::desktop {
+
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -80,7 +83,12 @@ bool Page::save_or_drop(core::Dialogue& dialogue, const QString& question, const
         return false;
     if (*wanted)
         return save();
-    drop(); // The page may stay, for another one may not let go.
+    try {
+        drop(); // The page may stay, for another one may not let go.
+    } catch (const core::DatabaseError& error) {
+        // What was given up must not keep anybody here.
+        dialogue.show({u"What is stored could not be read again."_s, error.text()});
+    }
     return true;
 }
 
