@@ -30,23 +30,6 @@ protected:
         EXPECT_TRUE(written.open(QFile::WriteOnly) && written.write(content) == content.size());
         return file;
     }
-    /// As if Ctrl+C were pressed the moment that the program can be given up.
-    [[nodiscard]] Ended run_interrupted(const QStringList& words)
-    {
-        QProcess program;
-        program.setChildProcessModifier([] {
-            sigset_t set;
-            sigemptyset(&set);
-            sigaddset(&set, SIGINT);
-            sigprocmask(SIG_BLOCK, &set, nullptr);
-            raise(SIGINT);
-        });
-        program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrelctl"_s,
-                      QStringList{u"--data-drive"_s, drive.path()} + words);
-        program.closeWriteChannel();
-        EXPECT_TRUE(program.waitForFinished());
-        return {program.exitCode(), program.readAllStandardOutput(), program.readAllStandardError()};
-    }
     void expect_refusal(const QStringList& words, const QByteArray& message)
     {
         const auto before = list({u"families"_s});
@@ -133,7 +116,7 @@ TEST_F(KindrelctlBackupTest, CtrlCGivesUpAndLeavesTheChurchOpenAndAsItWas)
     rename_families();
     const auto now = list({u"families"_s});
     for (const auto& words : {QStringList{u"backup"_s}, {u"restore"_s, backup, u"--yes"_s}}) {
-        const auto ended = run_interrupted(words);
+        const auto ended = run(words, press_ctrl_c);
         EXPECT_EQ(ended.status, 1) << ended;
         EXPECT_TRUE(ended.err.contains("Given up; nothing was changed.")) << ended;
         EXPECT_EQ(list({u"families"_s}), now);

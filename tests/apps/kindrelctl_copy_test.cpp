@@ -80,21 +80,9 @@ TEST_F(KindrelctlCopyTest, AnOlderCopyIsReplacedOnRequestAndOnlyWithAYes)
 
 TEST_F(KindrelctlCopyTest, CtrlCGivesUpAndLeavesNoCopy)
 {
-    QProcess program;
-    program.setChildProcessModifier([] {
-        sigset_t set;
-        sigemptyset(&set);
-        sigaddset(&set, SIGINT);
-        sigprocmask(SIG_BLOCK, &set, nullptr);
-        raise(SIGINT);
-    });
-    program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrelctl"_s,
-                  {u"--data-drive"_s, drive.path(), u"copy-church"_s, u"--to"_s, server->connection()});
-    program.closeWriteChannel();
-    ASSERT_TRUE(program.waitForFinished());
-
-    EXPECT_EQ(program.exitCode(), 1);
-    EXPECT_TRUE(program.readAllStandardError().contains("Given up; there is no copy."));
+    const auto ended = run({u"copy-church"_s, u"--to"_s, server->connection()}, press_ctrl_c);
+    EXPECT_EQ(ended.status, 1);
+    EXPECT_TRUE(ended.err.contains("Given up; there is no copy.")) << ended;
     EXPECT_EQ(copy(server->connection()).status, 0) << "Nothing may be left of the first run.";
 }
 

@@ -37,8 +37,6 @@ inline std::ostream& operator<<(std::ostream& stream, const Ended& ended)
     return stream << "status " << ended.status << "\n" << ended.out.toStdString() << "\n" << ended.err.toStdString();
 }
 
-enum class DiskSpace { plenty, scarce };
-
 /// Room for a few pages, not for the PDF with its fonts.
 inline void refuse_large_files()
 {
@@ -48,19 +46,30 @@ inline void refuse_large_files()
     signal(SIGXFSZ, SIG_IGN);
 }
 
+/// As if Ctrl+C were pressed the moment that the program can be given up.
+inline void press_ctrl_c()
+{
+    sigset_t set;
+    sigemptyset(&set);
+    sigaddset(&set, SIGINT);
+    sigprocmask(SIG_BLOCK, &set, nullptr);
+    raise(SIGINT);
+}
+
 /// The real program on a data drive of its own.
 class KindrelctlTest : public testing::Test
 {
 protected:
-    [[nodiscard]] Ended run(const QStringList& words, DiskSpace space = DiskSpace::plenty)
+    /// `beforehand` is done in the program's process before it begins.
+    [[nodiscard]] Ended run(const QStringList& words, void (*beforehand)() = nullptr)
     {
         QProcess program;
         // The leak check at a program's end stumbles over the threads of Qt's painter, which may still be ending then.
         auto environment = QProcessEnvironment::systemEnvironment();
         environment.insert(u"ASAN_OPTIONS"_s, u"detect_leaks=0"_s);
         program.setProcessEnvironment(environment);
-        if (space == DiskSpace::scarce)
-            program.setChildProcessModifier(refuse_large_files);
+        if (beforehand)
+            program.setChildProcessModifier(beforehand);
         program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrelctl"_s,
                       QStringList{u"--data-drive"_s, drive.path()} + words);
         program.closeWriteChannel();

@@ -107,7 +107,7 @@ TEST_F(KindrelctlTest, AReportThatCannotBeWrittenLeavesTheOldFile)
     old.close();
     const auto files_before = QDir(drive.path()).entryList(QDir::Files | QDir::Hidden);
 
-    const auto ended = run({u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}, DiskSpace::scarce);
+    const auto ended = run({u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}, refuse_large_files);
 
     EXPECT_EQ(ended.status, 1) << ended;
     EXPECT_TRUE(ended.err.contains("report.pdf could not be written")) << ended;
