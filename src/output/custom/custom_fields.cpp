@@ -11,6 +11,7 @@ namespace kindrel::output {
 
 using namespace Qt::StringLiterals;
 using people::Address;
+using people::Family;
 using people::FamilyFile;
 using people::Part;
 using people::Person;
@@ -18,7 +19,7 @@ using people::SetupKind;
 
 namespace {
 
-constexpr CustomField of_run(const char* name, const char* words, FieldValues (*read)(const FieldSource&),
+constexpr CustomField of_run(const char* name, const char* words, CustomField::Reader read,
                              FieldScope scope = FieldScope::run)
 {
     return {name, words, scope, {}, read};
@@ -59,24 +60,26 @@ constexpr CustomField with_and(CustomField field)
     return field;
 }
 
-constexpr CustomField of_receipt(const char* name, const char* words, FieldValues (*read)(const FieldSource&))
+constexpr CustomField of_receipt(const char* name, const char* words, CustomField::Reader read)
 {
     return {name, words, FieldScope::receipt, {}, read};
 }
 
 const std::array fields{
-    of_run("today", "Today's date", custom::today),
-    of_run("church_name", "The name of the church", custom::church_name),
-    of_run("report_title", "The title of the report", custom::report_title),
-    of_run("filters", "The filters in use", custom::filters),
-    of_run("group", "The heading of the group", custom::group, FieldScope::group),
-    of_run("number", "Counts the families or people of a group, or of the report", custom::number, FieldScope::family),
-    of_run("family_count", "How many families the group or the report has", custom::family_count, FieldScope::totals),
-    of_run("person_count", "How many people the group or the report has", custom::person_count, FieldScope::totals),
-    of_run("page", "The number of the page", custom::page, FieldScope::page),
+    of_run("today", "Today's date", &RunFacts::shown_today),
+    of_run("church_name", "The name of the church", &RunFacts::church_name),
+    of_run("report_title", "The title of the report", &RunFacts::title),
+    of_run("filters", "The filters in use", &RunFacts::filters),
+    of_run("group", "The heading of the group", &RunFacts::group, FieldScope::group),
+    of_run("number", "Counts the families or people of a group, or of the report", &RunFacts::number,
+           FieldScope::family),
+    of_run("family_count", "How many families the group or the report has", &RunFacts::family_count,
+           FieldScope::totals),
+    of_run("person_count", "How many people the group or the report has", &RunFacts::person_count, FieldScope::totals),
+    of_run("page", "The number of the page", &RunFacts::page, FieldScope::page),
     of_run("pages", "The number of pages", custom::pages, FieldScope::page),
 
-    of_family("surname", "Surname", custom::surname),
+    of_family("surname", "Surname", &Family::surname),
     of_family("letter", "The letter under which the surname is filed", custom::letter),
     of_family("Primary_Name", "First name of the primary person", custom::primary_name),
     of_family("Spouse_Name", "First name of the spouse", custom::spouse_name),
@@ -94,10 +97,10 @@ const std::array fields{
     of_family("&_Family", "\"& Family\" where there are children", custom::and_family),
     of_family("people_in_family", "How many people the family has", custom::people_in_family),
     of_family("condition", "File status: Active, Privacy, Prospect or Archive", custom::condition),
-    of_family("created", "Day on which the file was created", custom::created),
-    of_family("last_edit", "Day of the last edit", custom::last_edit),
-    of_family("booked_out_person", "To whom the file is booked out", custom::booked_out_person),
-    of_family("booked_out_date", "Day on which the file was booked out", custom::booked_out_date),
+    of_family("created", "Day on which the file was created", &Family::created),
+    of_family("last_edit", "Day of the last edit", &Family::last_edit),
+    of_family("booked_out_person", "To whom the file is booked out", &Family::booked_out_person),
+    of_family("booked_out_date", "Day on which the file was booked out", &Family::booked_out_date),
 
     of_address("address", "Residential address, a value for each line", custom::residential_lines),
     of_address("res_street", "Residential street", &Address::res_street),
@@ -133,9 +136,9 @@ const std::array fields{
 
     of_person("Name", "The name under which the person is listed", custom::name),
     of_person("full_name", "Title, name and surname", custom::full_name, Part::details),
-    of_person("person_id", "The person's number in the register", custom::person_id),
+    of_person("person_id", "The person's number in the register", &Person::person_id),
     of_person("role", "Primary, Spouse, Adult or Child", custom::role),
-    of_person("position", "Place in the family", custom::position),
+    of_person("position", "Place in the family", &Person::position),
     of_person("preferred_name", "Preferred name", &Person::preferred_name),
     of_person("Active", "\"Yes\" for an active person", &Person::Active),
     of_person("Decease", "\"Yes\" for a deceased person", &Person::Decease),
@@ -144,7 +147,7 @@ const std::array fields{
     of_person("archive", "\"Yes\" for an archived person", &Person::archive),
     of_person("contact", "\"Yes\" for a contact", &Person::contact),
     of_details("Title", "Title", &Person::Title),
-    of_details("birthdate", "Birth date", custom::birthdate),
+    of_details("birthdate", "Birth date", &Person::birthdate),
     of_details("age", "Age in years", custom::age),
     of_details("school_year", "School year", custom::school_year),
     of_details("middle_name", "Middle name", &Person::middle_name),
@@ -167,12 +170,12 @@ const std::array fields{
     listed(of_person("dates", "Personal dates", &Person::dates, Part::dates), SetupKind::personal_dates),
     listed(of_person("occupations", "Occupations", &Person::occupations, Part::occupations), SetupKind::occupations),
 
-    of_receipt("project", "The project given to", custom::project),
-    of_receipt("from", "First day of the period", custom::from),
-    of_receipt("to", "Last day of the period", custom::to),
-    of_receipt("total", "The total given", custom::total),
-    of_receipt("gifts", "How many gifts", custom::gifts),
-    of_receipt("gift_list", "Each gift with its day", custom::gift_list),
+    of_receipt("project", "The project given to", &ReceiptFacts::project),
+    of_receipt("from", "First day of the period", &ReceiptFacts::from),
+    of_receipt("to", "Last day of the period", &ReceiptFacts::to),
+    of_receipt("total", "The total given", &ReceiptFacts::total),
+    of_receipt("gifts", "How many gifts", &ReceiptFacts::gifts),
+    of_receipt("gift_list", "Each gift with its day", &ReceiptFacts::gift_list),
 };
 
 /// Further names of a field: those of the letters' merge fields, old and new.
@@ -216,31 +219,46 @@ QHash<QString, const CustomField*> fields_by_name()
     return known;
 }
 
-FieldValues single(const QString& text)
+template <class Home>
+const Home& home_of(const FieldSource& source)
 {
-    return {{text}};
+    if constexpr (std::is_same_v<Home, RunFacts>)
+        return source.run;
+    else if constexpr (std::is_same_v<Home, ReceiptFacts>)
+        return *source.receipt;
+    else if constexpr (std::is_same_v<Home, Family>)
+        return source.family->family();
+    else if constexpr (std::is_same_v<Home, Address>)
+        return source.family->address();
+    else if constexpr (std::is_same_v<Home, FamilyFile>)
+        return source.family->file();
+    else
+        return *source.person;
 }
 
-FieldValues read(const CustomField& field, const FieldSource& source)
+/// Reads what is stored where the field lies.
+struct FieldReading
 {
-    struct Visitor
+    const FieldSource& source;
+
+    template <class Home, class Value>
+    FieldValues operator()(Value Home::*field) const
     {
-        const FieldSource& source;
-        FieldValues operator()(QString Address::*text) const { return single(source.family->address().*text); }
-        FieldValues operator()(QString Person::*text) const { return single(source.person->*text); }
-        FieldValues operator()(bool Person::*flag) const { return single(source.person->*flag ? u"Yes"_s : QString()); }
-        FieldValues operator()(std::vector<people::LinkRow> Person::*rows) const
-        {
-            return custom::values_of_rows(*source.family, source.person->*rows);
-        }
-        FieldValues operator()(std::vector<people::LinkRow> FamilyFile::*rows) const
-        {
-            return custom::values_of_rows(*source.family, source.family->file().*rows);
-        }
-        FieldValues operator()(FieldValues (*function)(const FieldSource&)) const { return function(source); }
-    };
-    return std::visit(Visitor{source}, field.read);
-}
+        return shown_as(home_of<Home>(source).*field);
+    }
+    FieldValues operator()(FieldValues (*function)(const FieldSource&)) const { return function(source); }
+
+private:
+    static FieldValues shown_as(const QString& text) { return custom::single(text); }
+    static FieldValues shown_as(const QStringList& texts) { return custom::listed(texts); }
+    static FieldValues shown_as(bool flag) { return custom::single(flag ? u"Yes"_s : QString()); }
+    static FieldValues shown_as(int number) { return custom::single(number); }
+    FieldValues shown_as(const std::optional<core::Date>& date) const { return custom::single(source, date); }
+    FieldValues shown_as(const std::vector<people::LinkRow>& rows) const
+    {
+        return custom::values_of_rows(*source.family, rows);
+    }
+};
 
 /// Whether all that the field is read from is there.
 bool has_source(const CustomField& field, const FieldSource& source)
@@ -286,7 +304,7 @@ FieldValues values_of(const CustomField& field, const QString& item, const Field
 {
     if (!has_source(field, source))
         return {};
-    auto values = read(field, source);
+    auto values = std::visit(FieldReading{source}, field.read);
     if (!item.isEmpty()) {
         const auto wanted = people::sameness(item);
         std::erase_if(values, [&](const auto& value) { return people::sameness(value.item) != wanted; });

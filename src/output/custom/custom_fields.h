@@ -27,7 +27,6 @@ struct RunFacts
     int family_count = 0; ///< Of the group at its end, of the whole report at the end.
     int person_count = 0; ///< Likewise.
     int page = 0;         ///< In headers and footers.
-    bool visits = false;  ///< Whether the user may read visits.
 };
 
 /// Where the values of fields come from; null where a section has nothing of the kind.
@@ -57,8 +56,12 @@ enum class FieldScope { run, group, totals, page, family, person, receipt };
 /// A name that a layout may print. Stored fields bear their stored names.
 struct CustomField
 {
+    /// What is stored, or a function where that is not all.
     using Reader =
-        std::variant<QString people::Address::*, QString people::Person::*, bool people::Person::*,
+        std::variant<QString RunFacts::*, int RunFacts::*, QString ReceiptFacts::*, int ReceiptFacts::*,
+                     QStringList ReceiptFacts::*, QString people::Family::*,
+                     std::optional<core::Date> people::Family::*, QString people::Address::*, QString people::Person::*,
+                     int people::Person::*, bool people::Person::*, std::optional<core::Date> people::Person::*,
                      std::vector<people::LinkRow> people::Person::*, std::vector<people::LinkRow> people::FamilyFile::*,
                      FieldValues (*)(const FieldSource&)>;
     const char* name;

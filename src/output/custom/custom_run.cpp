@@ -186,8 +186,7 @@ RunFacts facts_of(const ReportInput& input, const CustomLayout& layout)
             .shown_today = core::Date::from(today).shown(office.day_order()),
             .church_name = office.church_name,
             .title = input.options.title.isEmpty() ? layout.title : input.options.title,
-            .filters = input.list.criteria,
-            .visits = office.may(core::Area::visitation_tab)};
+            .filters = input.list.criteria};
 }
 
 pages::PageSetup page_of(const CustomLayout& layout, const RunOptions& options)

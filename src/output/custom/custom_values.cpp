@@ -15,8 +15,6 @@ using people::MinistryState;
 using people::Person;
 using people::SuburbType;
 
-namespace {
-
 FieldValues single(const QString& text)
 {
     return {{text}};
@@ -39,6 +37,8 @@ FieldValues listed(const QStringList& texts)
         values.push_back({text});
     return values;
 }
+
+namespace {
 
 FieldValues names(const FieldSource& source, std::span<const Person* const> people)
 {
@@ -100,59 +100,9 @@ FieldValues values_of_rows(const people::DisclosedFamily& family, const std::vec
     return values;
 }
 
-FieldValues today(const FieldSource& source)
-{
-    return single(source.run.shown_today);
-}
-
-FieldValues church_name(const FieldSource& source)
-{
-    return single(source.run.church_name);
-}
-
-FieldValues report_title(const FieldSource& source)
-{
-    return single(source.run.title);
-}
-
-FieldValues filters(const FieldSource& source)
-{
-    return single(source.run.filters);
-}
-
-FieldValues group(const FieldSource& source)
-{
-    return single(source.run.group);
-}
-
-FieldValues number(const FieldSource& source)
-{
-    return single(source.run.number);
-}
-
-FieldValues family_count(const FieldSource& source)
-{
-    return single(source.run.family_count);
-}
-
-FieldValues person_count(const FieldSource& source)
-{
-    return single(source.run.person_count);
-}
-
-FieldValues page(const FieldSource& source)
-{
-    return single(source.run.page);
-}
-
 FieldValues pages(const FieldSource&)
 {
     return single(QString(pages::page_total_mark));
-}
-
-FieldValues surname(const FieldSource& source)
-{
-    return single(source.family->family().surname);
 }
 
 FieldValues letter(const FieldSource& source)
@@ -236,26 +186,6 @@ FieldValues condition(const FieldSource& source)
     return status < words.size() ? single(words[status].toString()) : FieldValues();
 }
 
-FieldValues created(const FieldSource& source)
-{
-    return single(source, source.family->family().created);
-}
-
-FieldValues last_edit(const FieldSource& source)
-{
-    return single(source, source.family->family().last_edit);
-}
-
-FieldValues booked_out_person(const FieldSource& source)
-{
-    return single(source.family->family().booked_out_person);
-}
-
-FieldValues booked_out_date(const FieldSource& source)
-{
-    return single(source, source.family->family().booked_out_date);
-}
-
 FieldValues residential_lines(const FieldSource& source)
 {
     return listed(address_lines(*source.family, SuburbType::residential));
@@ -317,8 +247,6 @@ FieldValues events(const FieldSource& source)
 FieldValues visits(const FieldSource& source)
 {
     FieldValues values;
-    if (!source.run.visits)
-        return values;
     for (const auto& one : source.family->file().visits)
         values.push_back({joined(u" ", {shown(*source.family, one.date), joined(u": ", {one.visitor, one.comments})})});
     return values;
@@ -335,11 +263,6 @@ FieldValues full_name(const FieldSource& source)
         joined(u" ", {source.person->Title, source.family->name(*source.person), source.family->family().surname}));
 }
 
-FieldValues person_id(const FieldSource& source)
-{
-    return single(source.person->person_id);
-}
-
 FieldValues role(const FieldSource& source)
 {
     const auto household = people::household_of(source.family->people());
@@ -348,16 +271,6 @@ FieldValues role(const FieldSource& source)
                   : person == household.spouse ? u"Spouse"_s
                   : people::is_child(*person)  ? u"Child"_s
                                                : u"Adult"_s);
-}
-
-FieldValues position(const FieldSource& source)
-{
-    return single(source.person->position);
-}
-
-FieldValues birthdate(const FieldSource& source)
-{
-    return single(source, source.person->birthdate);
 }
 
 FieldValues age(const FieldSource& source)
@@ -390,36 +303,6 @@ FieldValues active_ministries(const FieldSource& source)
 FieldValues potential_ministries(const FieldSource& source)
 {
     return ministries_of(source, MinistryState::potential);
-}
-
-FieldValues project(const FieldSource& source)
-{
-    return single(source.receipt->project);
-}
-
-FieldValues from(const FieldSource& source)
-{
-    return single(source.receipt->from);
-}
-
-FieldValues to(const FieldSource& source)
-{
-    return single(source.receipt->to);
-}
-
-FieldValues total(const FieldSource& source)
-{
-    return single(source.receipt->total);
-}
-
-FieldValues gifts(const FieldSource& source)
-{
-    return single(source.receipt->gifts);
-}
-
-FieldValues gift_list(const FieldSource& source)
-{
-    return listed(source.receipt->gift_list);
 }
 
 } // namespace kindrel::output::custom
