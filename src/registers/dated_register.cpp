@@ -103,6 +103,7 @@ bool DatedRegister::choose_project(int key)
     if (std::ranges::find(m_projects, key, &Project::key) == m_projects.end())
         return lose_project();
     m_project = key;
+    m_dates.clear(); // Until they are read.
     remember_project(session(), m_kind, Page::entry, key);
     refresh_dates();
     return true;
@@ -241,8 +242,13 @@ bool DatedRegister::leave()
 void DatedRegister::show_date(const RegisterDate& date)
 {
     m_open = date;
-    m_mark = stored_mark();
-    load_rows();
+    try {
+        m_mark = stored_mark();
+        load_rows();
+    } catch (...) {
+        close(); // The rows in memory are another date's.
+        throw;
+    }
 }
 
 bool DatedRegister::open(int date_key)

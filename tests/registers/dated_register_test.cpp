@@ -292,4 +292,19 @@ TEST_P(DatedRegisterTest, TheHabitIsThatOfTheLastTwelveDates)
               u"14/05/2024 is a Tuesday, but most dates of this project are Mondays.");
 }
 
+TEST_P(DatedRegisterTest, ADateThatCannotBeReadIsNotOpenedOverTheFiguresOfAnother)
+{
+    start_with({first, second});
+    type(*weekly, {u"10"});
+    ASSERT_TRUE(weekly->save());
+    const int other_date = weekly->dates().back().key;
+    session().execute(u"DROP VIEW [qry_weekly_load_groups];"_s);
+
+    EXPECT_THROW((void)weekly->open(other_date), core::DatabaseError);
+
+    EXPECT_FALSE(weekly->open_date());
+    EXPECT_TRUE(weekly->rows().empty());
+    EXPECT_EQ(locks(), 0);
+}
+
 } // namespace kindrel::test

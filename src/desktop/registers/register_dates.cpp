@@ -29,7 +29,7 @@ RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, std::f
     m_new->setObjectName(u"new_date"_s);
     m_dates->setObjectName(u"dates"_s);
     lay_out();
-    connect(m_project, &QComboBox::activated, this, &RegisterDates::choose_project);
+    connect(m_project, &QComboBox::activated, this, settled(&RegisterDates::choose_project));
     // After the key or click, for the list is filled anew.
     const auto open_later = [this] {
         QMetaObject::invokeMethod(this, settled(&RegisterDates::open_chosen), Qt::QueuedConnection);
@@ -56,8 +56,14 @@ RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, std::f
 std::function<void()> RegisterDates::settled(void (RegisterDates::*act)())
 {
     return [this, act] {
-        if (m_finish_typing())
+        if (!m_finish_typing())
+            return show_register();
+        try {
             (this->*act)();
+        } catch (const core::DatabaseError&) {
+            done(false); // What is shown is what there is.
+            throw;
+        }
     };
 }
 
@@ -155,10 +161,7 @@ int RegisterDates::chosen() const
 
 void RegisterDates::focus_dates()
 {
-    if (m_dates->count() == 0)
-        focus_new_date();
-    else
-        m_dates->setFocus();
+    m_dates->count() == 0 ? focus_new_date() : m_dates->setFocus();
 }
 
 void RegisterDates::focus_new_date()
@@ -175,11 +178,9 @@ void RegisterDates::done(bool made)
         Q_EMIT opened();
 }
 
-void RegisterDates::choose_project(int place)
+void RegisterDates::choose_project()
 {
-    if (!m_finish_typing())
-        return show_register();
-    (void)m_register.choose_project(m_project->itemData(place).toInt());
+    (void)m_register.choose_project(m_project->currentData().toInt());
     Q_EMIT remarked({});
     done(false);
 }
@@ -187,10 +188,8 @@ void RegisterDates::choose_project(int place)
 void RegisterDates::open_chosen()
 {
     const auto& open = m_register.open_date();
-    if (open && open->key == chosen()) {
-        Q_EMIT opened();
-        return;
-    }
+    if (open && open->key == chosen())
+        return Q_EMIT opened();
     const bool made = m_register.open(chosen());
     Q_EMIT remarked({});
     done(made);

@@ -54,9 +54,9 @@ private:
     };
     [[nodiscard]] QPushButton* make_button(const Button& looks, void (RegisterDates::*act)());
     void show_dates();
-    /// `act`, once nothing is being typed on the open date any more.
+    /// `act`, once nothing is being typed on the open date any more. When it fails, what the register holds is shown.
     [[nodiscard]] std::function<void()> settled(void (RegisterDates::*act)());
-    void choose_project(int place);
+    void choose_project();
     void open_chosen();
     void add_typed();
     void change_date();
