@@ -96,7 +96,9 @@ QVariant WeeklyGridModel::headerData(int section, Qt::Orientation orientation, i
 Qt::ItemFlags WeeklyGridModel::flags(const QModelIndex& index) const
 {
     const auto flags = QAbstractTableModel::flags(index);
-    return checkIndex(index, CheckIndexOption::IndexIsValid) && index.column() == figure_column(index.row()) ? flags | Qt::ItemIsEditable : flags;
+    return checkIndex(index, CheckIndexOption::IndexIsValid) && index.column() == figure_column(index.row())
+               ? flags | Qt::ItemIsEditable
+               : flags;
 }
 
 bool WeeklyGridModel::setData(const QModelIndex& index, const QVariant& value, int role)
