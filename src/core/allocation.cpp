@@ -30,7 +30,6 @@ int Session::allocate(Entity entity, int count)
     if (table.isEmpty() || count < 1)
         return 0;
     Transaction transaction(*this);
-    hold_counter(entity);
     auto keys = handed_out(*this, table);
     const qint64 first = keys.empty() ? 1 : keys.back() + 1;
     for (qint64 key = first; key < first + count; ++key) {

@@ -55,7 +55,7 @@ void rotate_system_backups(const Paths& paths, int church, const QDate& today)
     const auto busy = Marker::take(paths, side_files::busy);
     if (!busy)
         return;
-    make_folder(folder);
+    make_private_folder(folder);
     const QString fresh = folder + u"systembackup.new"_s;
     verified_copy(*connect_church(paths), fresh);
     if (QFileInfo::exists(backup_path(folder, 0)))

@@ -37,7 +37,8 @@ int others_connected(Session& session)
     if (session.engine() != EngineKind::postgres)
         return 0;
     auto rows = session.select(u"SELECT COUNT(*) FROM pg_stat_activity WHERE datname=current_database() AND "
-                               "pid<>pg_backend_pid() AND backend_type='client backend'"_s);
+                               "pid<>pg_backend_pid() AND usesysid IS NOT NULL AND COALESCE(backend_type,'client "
+                               "backend')='client backend'"_s); // Of another role's only the rest is to be seen.
     return rows.first()->integer(Column{0});
 }
 
@@ -203,13 +204,14 @@ bool target_is_busy(const Office& office, const CopyEnd& to)
 
 CopyEnd copy_end(const QString& words)
 {
-    if (words.endsWith(u".server"_s, Qt::CaseInsensitive)) {
+    const bool server =
+        words.contains(u'=') || words.startsWith(u"postgresql://"_s) || words.startsWith(u"postgres://"_s);
+    if (words.endsWith(u".server"_s, Qt::CaseInsensitive) && (!server || QFileInfo::exists(words))) {
         const auto content = read_file(words);
         if (!content)
             throw FileError(u"'%1' is not there."_s.arg(words));
         return {.connection = QString::fromUtf8(*content).trimmed()};
     }
-    const bool server = words.contains(u'=') || words.startsWith(u"postgresql://"_s);
     return server && !words.endsWith(u".kdl"_s) ? CopyEnd{.connection = words}
                                                 : CopyEnd{.file = QFileInfo(words).absoluteFilePath()};
 }

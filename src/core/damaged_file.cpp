@@ -9,6 +9,7 @@
 #include <limits>
 #include <numeric>
 #include <optional>
+#include <unordered_set>
 
 namespace kindrel::core {
 
@@ -21,6 +22,7 @@ constexpr RowId first_row = std::numeric_limits<RowId>::min();
 constexpr RowId last_row = std::numeric_limits<RowId>::max();
 constexpr RowId highest_key = std::numeric_limits<int>::max();
 constexpr RowId looked_closely = 16384;
+constexpr int most_disorders = 1024;
 
 struct Finalize
 {
@@ -68,17 +70,20 @@ public:
     {
         if (!m_upward || !m_downward)
             return false;
-        const std::optional<Range> rest = trimmed({first_row, last_row});
-        if (!rest)
-            return true;
-        search(*rest);
-        return false;
+        if (const auto rest = trimmed({first_row, last_row}))
+            search(*rest);
+        return m_whole;
     }
 
 private:
     struct Range
     {
         RowId from, to;
+    };
+    struct Row
+    {
+        RowId key;
+        std::vector<Value> values;
     };
 
     static QString text(const QString& table, const QStringList& fields, const QString& direction)
@@ -87,32 +92,64 @@ private:
             fields.join(u"],["_s), table, direction);
     }
 
-    /// Hands on the rows from one end of the range and leaves in it what lies behind the first that cannot be read.
-    /// False when nothing is left. Damaged pages may lead anywhere: a row out of turn ends the pass.
-    bool pass(sqlite3_stmt& statement, Range& range, bool upward)
+    /// Hands on the rows of the range up to the first that cannot be read and tells where what is left begins; nullopt
+    /// when nothing is. Damaged pages may lead anywhere: a key counts once the next row is in turn behind it, and a row
+    /// without which its neighbours would be in turn has a wrong key and is left out.
+    std::optional<RowId> pass(sqlite3_stmt& statement, const Range& range, bool upward)
     {
+        const RowId end = upward ? range.to : range.from;
+        const auto in_turn = [upward](RowId row, RowId next) {
+            return upward ? row < next : next < row;
+        };
         sqlite3_bind_int64(&statement, 1, range.from);
         sqlite3_bind_int64(&statement, 2, range.to);
+        std::optional<RowId> before;
+        std::optional<Row> held;
         int code = SQLITE_ROW;
-        bool left = true;
-        while (left && (code = sqlite3_step(&statement)) == SQLITE_ROW) {
-            const RowId row = sqlite3_column_int64(&statement, 0);
-            if (row < range.from || row > range.to)
+        while (!(held && held->key == end) && (code = sqlite3_step(&statement)) == SQLITE_ROW) {
+            Row row = read(statement);
+            const bool orderly = !held || in_turn(held->key, row.key);
+            if ((!orderly || row.key < range.from || row.key > range.to) && !tolerated())
                 break;
-            hand_on(statement);
-            left = range.from < range.to && row != (upward ? range.to : range.from);
-            if (left)
-                (upward ? range.from : range.to) = upward ? row + 1 : row - 1;
+            const bool held_in_turn = orderly && (!before || in_turn(*before, held->key));
+            if (held && (held_in_turn || !before || !in_turn(*before, row.key))) {
+                before = held->key;
+                hand_on(std::move(*held));
+            }
+            held = std::move(row);
         }
         sqlite3_reset(&statement);
-        return left && code != SQLITE_DONE;
+        const bool ended = code == SQLITE_DONE || (held && held->key == end);
+        if (held)
+            hand_on(std::move(*held));
+        m_whole = m_whole && ended;
+        return ended ? std::nullopt : std::optional(behind(before, range, upward));
     }
 
-    /// What is left of the range once both its ends were read; nullopt when all of it was.
-    std::optional<Range> trimmed(Range range)
+    /// Where the range goes on behind the row; at its beginning without one.
+    static RowId behind(std::optional<RowId> row, const Range& range, bool upward)
     {
-        const bool left = pass(*m_upward, range, true) && pass(*m_downward, range, false);
-        return left ? std::optional(range) : std::nullopt;
+        if (!row)
+            return upward ? range.from : range.to;
+        return std::clamp(*row, range.from + (upward ? 0 : 1), range.to - (upward ? 1 : 0)) + (upward ? 1 : -1);
+    }
+
+    /// What is left of the range once both its ends were read; nullopt when all of it was. Where wrong keys let the
+    /// ends meet although something could not be read, all of it is left.
+    std::optional<Range> trimmed(const Range& range)
+    {
+        const auto from = pass(*m_upward, range, true);
+        const auto to = from ? pass(*m_downward, range, false) : std::nullopt;
+        if (!from || !to)
+            return std::nullopt;
+        return *from <= *to ? Range{*from, *to} : range;
+    }
+
+    /// Disorder is damage; so often only, lest pages that lead in a circle hold up the walk.
+    bool tolerated()
+    {
+        m_whole = false;
+        return ++m_disorders <= most_disorders;
     }
 
     /// Keys count from 1 and most follow each other: what is farther off is not looked through as closely.
@@ -120,14 +157,20 @@ private:
     {
         if (range.from < 1)
             (void)trimmed({range.from, std::min<RowId>(range.to, 0)});
+        if (range.to < 1)
+            return;
         range.from = std::max<RowId>(range.from, 1);
         if (range.to == last_row)
             range.to = std::max(range.from, highest_key);
-        RowId width = looked_closely;
-        halve({{range.from, std::min(range.to, range.from + width)}}, 4 * looked_closely);
+        const RowId reach = range.to - range.from;
+        RowId width = std::min(reach, looked_closely);
+        halve({{range.from, range.from + width}}, 4 * looked_closely);
         std::deque<Range> far;
-        for (; range.to - range.from > width; width *= 2)
-            far.push_back({range.from + width + 1, std::min(range.to, range.from + 2 * width)});
+        while (width < reach) {
+            const RowId next = width > reach / 2 ? reach : 2 * width;
+            far.push_back({range.from + width + 1, range.from + next});
+            width = next;
+        }
         halve(std::move(far), looked_closely);
     }
 
@@ -145,16 +188,26 @@ private:
         }
     }
 
-    void hand_on(sqlite3_stmt& row)
+    static Row read(sqlite3_stmt& statement)
     {
-        std::vector<Value> values;
-        for (int column = 1; column < sqlite3_column_count(&row); ++column)
-            values.push_back(value_at(&row, column));
-        m_sink(std::move(values));
+        Row row{sqlite3_column_int64(&statement, 0), {}};
+        for (int column = 1; column < sqlite3_column_count(&statement); ++column)
+            row.values.push_back(value_at(&statement, column));
+        return row;
+    }
+
+    /// Ways around damage cross: no key is handed on twice.
+    void hand_on(Row row)
+    {
+        if (m_handed_on.insert(row.key).second)
+            m_sink(std::move(row.values));
     }
 
     Statement m_upward, m_downward;
     const DamagedFile::Sink& m_sink;
+    std::unordered_set<RowId> m_handed_on;
+    int m_disorders = 0;
+    bool m_whole = true;
 };
 
 } // namespace

@@ -156,15 +156,6 @@ void add_row(Session& session, LockKind kind, const StoredLock& row)
         row.values());
 }
 
-/// Lets one workstation at a time look at the lock tables and take from them; ends with the transaction. On SQLite
-/// the transaction itself does that.
-void hold_lock_tables(Session& session)
-{
-    constexpr int lock_tables = 0x4B444D; // First half of the advisory lock's key.
-    if (session.engine() == EngineKind::postgres)
-        (void)session.select(u"SELECT pg_advisory_xact_lock(CAST(? AS integer), CAST(? AS integer))"_s, lock_tables, 0);
-}
-
 /// The row that a release takes: that of this program, else the first.
 std::optional<StoredLock> row_to_release(Session& session, LockKind kind, const LockKey& key, const StoredLock& own)
 {
@@ -186,7 +177,6 @@ std::optional<StoredLock> row_to_release(Session& session, LockKind kind, const 
 void release_one(Session& session, LockKind kind, const LockKey& key, const StoredLock& own)
 {
     Transaction transaction(session);
-    hold_lock_tables(session);
     if (const auto row = row_to_release(session, kind, key, own)) {
         const int gone = delete_rows(session, kind, *row);
         for (int twin = 1; twin < gone; ++twin)
@@ -229,7 +219,6 @@ int Locks::count(LockKind kind)
 bool Locks::take(LockKind kind, const LockKey& key, std::span<const LockCheck> unless)
 {
     Transaction transaction(m_session);
-    hold_lock_tables(m_session);
     const bool held = !is_people_area(kind) && check(kind, key);
     if (held || std::ranges::any_of(unless, [this](const LockCheck& other) { return found(other); }))
         return false;
@@ -306,7 +295,6 @@ std::vector<HeldLock> Locks::stale()
 int Locks::release_stale()
 {
     Transaction transaction(m_session);
-    hold_lock_tables(m_session);
     int released = 0;
     for (const HeldLock& lock : stale()) {
         const LockTable& table = table_of(lock.kind);

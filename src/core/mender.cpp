@@ -27,6 +27,8 @@ const QString backup_or_recover =
     u"Set the damaged file aside (kindrel-mender set-aside), start Kindrel, which begins an empty church then, and put "
     "back a backup with 'Restore Data'. Without a backup, let what can still be read be recovered into a new church "
     "file (kindrel-mender recover)."_s;
+const QString somebody_inside =
+    u"Somebody may be working in the church:\n%1\nWhen nobody is, unlock the church first."_s;
 const QString locked_by_marker =
     u"The church is locked by 'lock.dat': another user is either compacting files, backing them up or restoring them. "
     "When nobody is, unlock the church first."_s;
@@ -131,15 +133,27 @@ QString inside(MenderPlace& place)
 {
     try {
         const auto others = others_inside(place);
-        return others.isEmpty() ? QString()
-                                : u"Somebody may be working in the church:\n%1\nWhen nobody is, unlock the church "
-                                  "first."_s.arg(others.join(u'\n'));
+        return others.isEmpty() ? QString() : somebody_inside.arg(others.join(u'\n'));
     } catch (const DatabaseError& error) {
         if (nothing_locked(*place.session))
             return {};
         return u"It cannot be told whether somebody is working in the church, since its locks cannot be read: %1\nWhen "
                "nobody is, unlock the church first."_s.arg(error.text());
     }
+}
+
+/// Locks that cannot be read are part of the damage.
+void demand_nobody_known_inside(MenderPlace& place)
+{
+    QStringList others;
+    try {
+        if (place.session)
+            others = others_inside(place);
+    } catch (const DatabaseError&) {
+        return;
+    }
+    if (!others.isEmpty())
+        throw FileError(somebody_inside.arg(others.join(u'\n')));
 }
 
 /// The copy must be sound and hold as many rows as the church. What is about to be mended does not count.
@@ -324,12 +338,13 @@ QString set_database_aside(MenderPlace& place)
     const QString file = place.paths.database();
     if (!QFileInfo::exists(file))
         throw FileError(u"There is no church file: start Kindrel and restore a backup."_s);
-    const auto found = examine_church(place, {});
-    if (std::ranges::none_of(found, [](const Finding& finding) { return finding.cure == Cure::recover; }))
-        throw FileError(u"The church file is not damaged: start Kindrel to restore a backup."_s);
     const auto busy = Marker::take(place.paths, side_files::busy);
     if (!busy)
         throw FileError(locked_by_marker);
+    const auto found = examine_church(place, {});
+    if (std::ranges::none_of(found, [](const Finding& finding) { return finding.cure == Cure::recover; }))
+        throw FileError(u"The church file is not damaged: start Kindrel to restore a backup."_s);
+    demand_nobody_known_inside(place);
     place.session.reset();
     const QString time = place.clock.now().toString(u"yyyy-MM-dd HHmmss");
     const QString aside = mended_place(place, u"KR10_records set aside %1.kdl"_s.arg(time));

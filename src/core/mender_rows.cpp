@@ -171,6 +171,8 @@ Owners owners_of(Session& session, const QStringList& tables, const Reference& r
     const QString field = name_of(reference.field);
     QString from = lost(tables, reference.table, reference.field, reference.to);
     Owners owners;
+    if (number_from(session, u"SELECT COUNT(*) FROM (SELECT 1 %1 LIMIT 1) t;"_s.arg(from)) == 0)
+        return owners;
     for (const auto& revival : revivals) {
         if (revival.entity != reference.to || !has(tables, revival.table))
             continue;
@@ -186,13 +188,24 @@ Owners owners_of(Session& session, const QStringList& tables, const Reference& r
     return owners;
 }
 
+/// The tables most of which is gone by what any of the entries that hang on them tells, with the worst account.
+std::map<Entity, Owners> lost_tables(Session& session, const QStringList& tables)
+{
+    std::map<Entity, Owners> found;
+    for (const auto& reference : references()) {
+        if (reference.bond == Bond::keep || !has(tables, reference.table) || revival_by(reference))
+            continue;
+        const Owners owners = owners_of(session, tables, reference);
+        if (owners.lost() && found[reference.to].missing < owners.missing)
+            found[reference.to] = owners;
+    }
+    return found;
+}
+
 /// Removes the entries of the reference whose owner is gone, with what hangs on them.
 void remove_lost(Session& session, const QStringList& tables, const Reference& reference)
 {
     const QString from = lost(tables, reference.table, reference.field, reference.to);
-    const int count = number_from(session, u"SELECT COUNT(*) %1;"_s.arg(from));
-    if (count == 0 || owners_of(session, tables, reference).lost())
-        return;
     if (const Home* home = own_home(reference)) {
         remove_entities(session, home->entity,
                         keys_from(session, u"SELECT o.[%1] %2;"_s.arg(name_of(home->field), from)));
@@ -273,23 +286,17 @@ Findings examine_orphans(MenderPlace& place)
 {
     Session& session = *place.session;
     const QStringList tables = tables_of(session);
+    const auto lost_owners = lost_tables(session, tables);
     Findings findings;
-    std::map<Entity, Owners> lost_tables;
     for (const auto& reference : references()) {
-        if (reference.bond == Bond::keep || !has(tables, reference.table))
+        const bool stays = lost_owners.contains(reference.to) && !revival_by(reference);
+        if (reference.bond == Bond::keep || stays || !has(tables, reference.table))
             continue;
         const QString from = lost(tables, reference.table, reference.field, reference.to);
-        const int count = number_from(session, u"SELECT COUNT(*) %1;"_s.arg(from));
-        if (count == 0)
-            continue;
-        const Owners owners = revival_by(reference) ? Owners{} : owners_of(session, tables, reference);
-        if (!owners.lost()) {
+        if (const int count = number_from(session, u"SELECT COUNT(*) %1;"_s.arg(from)); count > 0)
             findings.push_back(lost_finding(reference, count));
-        } else if (auto& worst = lost_tables[reference.to]; worst.missing < owners.missing) {
-            worst = owners;
-        }
     }
-    for (const auto& [entity, owners] : lost_tables)
+    for (const auto& [entity, owners] : lost_owners)
         findings.push_back(lost_table_finding(entity, owners));
     return findings;
 }
@@ -298,6 +305,7 @@ void mend_orphans(MenderPlace& place)
 {
     Session& session = *place.session;
     const QStringList tables = tables_of(session);
+    const auto lost_owners = lost_tables(session, tables);
     for (int number = 1; number <= entity_count; ++number) {
         const auto entity = static_cast<Entity>(number);
         // Entries of who is gone went before, so that nothing comes back for their sake.
@@ -305,8 +313,10 @@ void mend_orphans(MenderPlace& place)
             if (revival.entity == entity)
                 revive(session, tables, revival);
         }
+        if (lost_owners.contains(entity))
+            continue;
         for (const auto& reference : references()) {
-            if (reference.to == entity && reference.bond != Bond::keep)
+            if (reference.to == entity && reference.bond != Bond::keep && has(tables, reference.table))
                 remove_lost(session, tables, reference);
         }
     }

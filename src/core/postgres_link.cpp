@@ -93,12 +93,11 @@ using ParsedKeywords = std::unique_ptr<PQconninfoOption, decltype(&PQconninfoFre
 
 ParsedKeywords parse(const QString& connection)
 {
-    char* fault = nullptr;
-    ParsedKeywords options(PQconninfoParse(connection.toUtf8().constData(), &fault), &PQconninfoFree);
-    const QString why = QString::fromUtf8(fault).trimmed();
-    PQfreemem(fault);
-    if (!options)
-        throw DatabaseError(why);
+    // libpq's own words may quote a password.
+    ParsedKeywords options(PQconninfoParse(connection.toUtf8().constData(), nullptr), &PQconninfoFree);
+    if (!options || connection.trimmed().isEmpty())
+        throw DatabaseError(
+            u"The connection to the server cannot be understood. It should read like: host=… dbname=… user=…"_s);
     return options;
 }
 

@@ -17,8 +17,8 @@ constexpr std::size_t values_per_statement = 30000;
 constexpr std::size_t rows_worth_counting = 200;
 constexpr unsigned bytea_type = 17;
 constexpr std::array<unsigned, 3> whole_number_types{20, 21, 23};
-/// First half of the advisory locks' keys; the second is a counter's entity, or 0 for the turn to write.
-constexpr int advisory_locks = 0x4B444C;
+/// First half of the advisory lock's key that is the turn to write; the second is 0.
+constexpr int turn_to_write = 0x4B444C;
 /// How long a write waits for its turn.
 constexpr int patience_milliseconds = 15000;
 
@@ -70,6 +70,25 @@ void lay(PostgresLink& link, const QString& table, const QStringList& columns, s
     if (rows.size() > rows_worth_counting)
         link.exec(u"ANALYZE [%1]"_s.arg(table), {});
 }
+
+/// Gives what is done outside any transaction one of its own, because whoever writes waits for the turn.
+class Turn
+{
+public:
+    explicit Turn(Session& session)
+    {
+        if (session.transaction_depth() == 0)
+            m_transaction.emplace(session);
+    }
+    void commit()
+    {
+        if (m_transaction)
+            m_transaction->commit();
+    }
+
+private:
+    std::optional<Transaction> m_transaction;
+};
 
 class PostgresCursor : public Cursor
 {
@@ -131,12 +150,9 @@ public:
     {
         if (rows.empty())
             return;
-        std::optional<Transaction> transaction;
-        if (transaction_depth() == 0)
-            transaction.emplace(*this);
+        Turn turn(*this);
         on_link(Loss::nothing_stored, [&](PostgresLink& link) { insert_all(link, table, fields, rows); });
-        if (transaction)
-            transaction->commit();
+        turn.commit();
     }
 
     void fill_temporary(const QString& table, const QStringList& columns,
@@ -148,9 +164,11 @@ public:
 
     void run_script(const QString& script) override
     {
+        Turn turn(*this);
         for (const auto& statement : split_script(script))
-            on_link(outside_transaction(Loss::unsure),
+            on_link(Loss::nothing_stored,
                     [&](PostgresLink& link) { link.exec_as_is(schema_for_postgres(statement)); });
+        turn.commit();
     }
 
     qint64 change_mark() override
@@ -172,21 +190,18 @@ protected:
     }
     int run(const QString& text, std::span<const Value> values) override
     {
-        if (text == u"ROLLBACK" && !connected())
-            return 0; // The server has rolled back by itself.
-        const auto loss = text == u"COMMIT" ? Loss::unsure : outside_transaction(Loss::unsure);
-        const auto result = on_link(loss, [&](PostgresLink& link) { return link.exec(text, values); });
-        return static_cast<int>(result.affected_rows());
-    }
-    void hold_counter(Entity entity) override
-    {
-        (void)select(u"SELECT pg_advisory_xact_lock(CAST(? AS integer), CAST(? AS integer))"_s, advisory_locks, entity);
+        if (text == u"ROLLBACK")
+            return connected() ? send(text, values) : 0; // Without a connection the server has done so by itself.
+        Turn turn(*this);
+        const int touched = send(text, values);
+        turn.commit();
+        return touched;
     }
     /// Those who write take turns, as on a church file: what a transaction has read is still so when it writes.
     void begin_outermost() override
     {
         begin_with(u"BEGIN; SET LOCAL lock_timeout = %1; SELECT pg_advisory_xact_lock(%2, 0)"_s.arg(
-            QString::number(patience_milliseconds), QString::number(advisory_locks)));
+            QString::number(patience_milliseconds), QString::number(turn_to_write)));
     }
     void begin_with(const QString& text)
     {
@@ -199,6 +214,14 @@ protected:
     }
 
 private:
+    /// What is sent is in a transaction, or ends one.
+    int send(const QString& text, std::span<const Value> values)
+    {
+        const auto loss = text == u"COMMIT" ? Loss::unsure : Loss::nothing_stored;
+        return static_cast<int>(
+            on_link(loss, [&](PostgresLink& link) { return link.exec(text, values); }).affected_rows());
+    }
+
     void end_failed_begin()
     {
         try {

@@ -26,6 +26,7 @@ namespace {
 
 constexpr std::size_t most_holders_named = 5;
 constexpr qsizetype safety_backups_kept = 3;
+constexpr qint64 read_at_once = 1 << 20;
 
 const QString failed = u"Restoring files failed because:-"_s;
 const QString cancel_question = u"Do you wish to stop restoring?"_s;
@@ -173,26 +174,58 @@ std::vector<Swap> swaps_for(const Office& office, const Manifest& manifest, cons
     return swaps;
 }
 
+bool reads_through(const QString& file)
+{
+    QFile source(file);
+    bool sound = source.open(QIODevice::ReadOnly);
+    while (sound && !source.atEnd())
+        sound = !source.read(read_at_once).isEmpty();
+    return sound;
+}
+
 /// Leaves out what cannot be read.
 void copy_readable(const QString& from, const QString& to)
 {
-    if (QFile(from).open(QIODevice::ReadOnly)) {
-        make_private_folder(QFileInfo(to).path());
+    if (!QFile(from).open(QIODevice::ReadOnly))
+        return;
+    make_private_folder(QFileInfo(to).path());
+    try {
         copy_file(from, to);
+    } catch (const FileError&) {
+        if (reads_through(from))
+            throw;
     }
 }
 
-/// The present database and files as they are, in a folder of their own. Throws FileError.
-QString copy_unchecked(const Office& office, const QString& folder)
+/// The database must be among the copies; of the files those that can be read.
+void copy_as_it_is(const Office& office, const QString& target)
 {
-    demand_space(office, folder, bytes_of_church(office, {}));
-    const QString target = folder + unchecked + QFileInfo(archive_name(office, folder)).completeBaseName() + u'/';
-    for (const QString& ending : {QString(), u"-journal"_s})
-        copy_readable(office.paths.database() + ending, target + database_entry + ending);
+    make_private_folder(QFileInfo(target + database_entry).path());
+    if (office.session->engine() == EngineKind::postgres)
+        office.session->copy_to(target + database_entry);
+    else
+        copy_file(office.paths.database(), target + database_entry);
+    copy_readable(office.paths.database() + u"-journal"_s, target + database_entry + u"-journal"_s);
     for (const BackupPart& part : backup_parts()) {
         const QString from = office.paths.folder(part.folder);
         for (const auto& name : files_within(from))
             copy_readable(from + name, target + QString::fromUtf16(part.name) + name);
+    }
+}
+
+/// The present database and files as they are, in a folder of their own. Throws FileError, and DatabaseError where the
+/// church of a server cannot be copied; nothing stays then.
+QString copy_unchecked(const Office& office, const QString& folder)
+{
+    demand_space(office, folder, bytes_of_church(office, {}));
+    const QString target = folder + unchecked + QFileInfo(archive_name(office, folder)).completeBaseName();
+    const QString unfinished = target + u".unfinished"_s;
+    try {
+        copy_as_it_is(office, as_folder(unfinished));
+        move_file(unfinished, target);
+    } catch (...) {
+        QDir(unfinished).removeRecursively();
+        throw;
     }
     return as_folder(target);
 }

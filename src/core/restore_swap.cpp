@@ -190,6 +190,8 @@ RestoreWork::RestoreWork(const Paths& paths)
     : m_paths(paths), m_id(QUuid::createUuid().toString(QUuid::Id128)), m_running(lock_file(paths))
 {
     hold(m_running);
+    if (QFileInfo::exists(journal_file(paths)))
+        throw FileError(u"Another restore was cut off meanwhile. Restore the backup once more."_s);
     QDir(work_folder(paths)).removeRecursively();
     make_private_folder(unpacked());
 }

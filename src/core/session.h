@@ -48,7 +48,7 @@ public:
         const std::array<Value, sizeof...(V)> bound{to_value(values)...};
         return Rows(run_select(text, bound));
     }
-    /// The number of rows touched.
+    /// The number of rows touched. Outside a transaction the statement is one of its own.
     template <class... V>
     int execute(const QString& text, const V&... values)
     {
@@ -84,8 +84,6 @@ public:
 protected:
     [[nodiscard]] virtual std::unique_ptr<Cursor> run_select(const QString& text, std::span<const Value> values) = 0;
     virtual int run(const QString& text, std::span<const Value> values) = 0;
-    /// Inside a transaction: keeps other workstations from allocating keys of the entity until it ends.
-    virtual void hold_counter(Entity entity) = 0;
     virtual void begin_outermost() = 0;
 
 private:

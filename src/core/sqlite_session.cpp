@@ -198,7 +198,6 @@ protected:
         return touched;
     }
 
-    void hold_counter(Entity) override {} // The outermost transaction holds the whole file's write lock.
     void begin_outermost() override { run(u"BEGIN IMMEDIATE"_s, {}); }
 
 private:

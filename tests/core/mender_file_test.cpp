@@ -1,6 +1,7 @@
 #include "mender_place.h"
 
 #include "core/church_recovery.h"
+#include "core/locks.h"
 #include "core/sqlite_session.h"
 #include "core/verified_copy.h"
 
@@ -36,6 +37,18 @@ void harm(QByteArray& content, quint32 page, QRandomGenerator& random)
         for (int flip = 0; flip < 20; ++flip)
             content[start + random.bounded(page_size)] ^= static_cast<char>(1 << random.bounded(7));
     }
+}
+
+/// Gives the row that holds the text another key of the same length: a cell is its size, its key, the sizes of its
+/// values and then these.
+void give_key(QByteArray& content, const QByteArray& text, int family, int key)
+{
+    const auto varint = [](int number) {
+        return QByteArray().append(static_cast<char>(0x80 | (number >> 7))).append(static_cast<char>(number & 0x7F));
+    };
+    const auto at = content.lastIndexOf(varint(family), content.indexOf(text));
+    ASSERT_LT(content.indexOf(text) - at, 100);
+    content.replace(at, varint(family).size(), varint(key));
 }
 
 int rows_of(const std::vector<RecoveredTable>& tables, const QString& table)
@@ -171,6 +184,23 @@ TEST_P(MenderFileTest, ADamagedEndOfATableCostsTheRowsThereOnly)
     }
 }
 
+TEST_P(MenderFileTest, AWrongKeyCostsItsOwnRowOnly)
+{
+    fill_many();
+    const QByteArray whole = closed_content();
+    for (const int key : {14146, 5954}) {
+        QByteArray content = whole;
+        give_key(content, "Family 10050", 10050, key);
+        ASSERT_EQ(content.size(), whole.size());
+        DataFolder::write(church->file(), content);
+        QFile::remove(fresh());
+        const auto tables = recover_church(church->file(), fresh());
+        EXPECT_GE(rows_of(tables, u"tbl_surname"_s), families - 10) << key;
+        EXPECT_FALSE(std::ranges::find(tables, u"tbl_surname"_s, &RecoveredTable::table)->whole) << key;
+        expect_true_families(fresh(), rows_of(tables, u"tbl_surname"_s));
+    }
+}
+
 TEST_P(MenderFileTest, PagesDamagedAtRandomNeverBringTheRecoveryDown)
 {
     fill_many();
@@ -236,6 +266,30 @@ TEST_P(MenderFileTest, ADamagedChurchFileIsSetAsideAndASoundOneIsNot)
     EXPECT_EQ(DataFolder::read(aside), "no database");
     EXPECT_EQ(DataFolder::read(aside + u"-journal"_s), "its journal");
     EXPECT_TRUE(aside.startsWith(in_church(u"mended/"_s))) << aside.toStdString();
+}
+
+TEST_P(MenderFileTest, AFileIsNotSetAsideUnderSomebodyWhoIsInside)
+{
+    FakeWorkstation other;
+    other.machine = u"office-2"_s;
+    ASSERT_TRUE(Locks(session(), other, clock).take(LockKind::family, 1));
+    session().execute(u"CREATE TABLE [unused] ([a]);"_s);
+    const auto page =
+        static_cast<quint32>(number_of(session(), u"SELECT [rootpage] FROM sqlite_master WHERE [name]='unused';"_s));
+    place->session.reset();
+    QByteArray content = closed_content();
+    content.replace(static_cast<qsizetype>(page - 1) * page_size, 8, QByteArray(8, 'x'));
+    const QString file = in_church(u"KR10_records.kdl"_s);
+    DataFolder::write(file, content);
+    place->session = open_sqlite(file);
+
+    EXPECT_THROW((void)set_database_aside(*place), FileError);
+    EXPECT_EQ(DataFolder::read(file), content);
+    EXPECT_FALSE(QFile::exists(in_church(u"lock.dat"_s)));
+
+    place->session->execute(u"DELETE FROM [tbl_locked_family_files];"_s);
+    (void)set_database_aside(*place);
+    EXPECT_FALSE(QFile::exists(file));
 }
 
 TEST_P(MenderFileTest, RecoveringNeverWritesOverAFileAndLeavesNothingOfAFailure)

@@ -179,6 +179,19 @@ TEST_P(MenderTest, ATableThatLostMostOfItsRowsTakesNothingAlong)
     EXPECT_EQ(number_of(session(), u"SELECT COUNT(*) FROM [tbl_group];"_s), 3);
 }
 
+TEST_P(MenderTest, WhatOneTableTellsOfALostTableHoldsForAll)
+{
+    run({u"INSERT INTO [tbl_people] ([person_id],[Surname_ID],[Name],[position]) VALUES (21,2,'Dan',2),(22,2,'Eve',3);"_s,
+         u"INSERT INTO [tbl_group] ([person_id],[group_id]) VALUES (101,5),(102,5),(103,5),(104,5),(105,5),(106,5);"_s,
+         u"INSERT INTO [tbl_roll_attendance] ([roll_date_id],[person_id],[Attendance]) VALUES (7,101,192);"_s});
+    const auto mending = mend_church(*place, {});
+    ASSERT_EQ(mending.left.size(), 1U) << told(mending.left);
+    EXPECT_EQ(mending.left.front().words,
+              u"Most of 'people' is gone: other entries speak of 6 that are missing, and 5 are left."_s);
+    EXPECT_EQ(number_of(session(), u"SELECT COUNT(*) FROM [tbl_group];"_s), 9);
+    EXPECT_EQ(number_of(session(), u"SELECT COUNT(*) FROM [tbl_roll_attendance];"_s), 2) << "Not even the few.";
+}
+
 TEST_P(MenderTest, WithoutALockTableNobodyKnowsWhoIsInsideUntilTheChurchIsUnlocked)
 {
     run({u"DROP TABLE [tbl_locked_area];"_s, u"DELETE FROM [tbl_address];"_s});

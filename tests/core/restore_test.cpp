@@ -242,6 +242,11 @@ TEST_P(RestoreTest, AFileThatCannotBeBackedUpDoesNotKeepTheBackupOut)
     ASSERT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
     EXPECT_TRUE(place->dialogue().asked.last().startsWith(u"Unable to back up the present data"));
     EXPECT_EQ(DataFolder::read(report->before_unchecked + u"church/"_s + odd), "odd");
+    const auto kept = open_sqlite(report->before_unchecked + u"database/KR10_records.kdl"_s);
+    EXPECT_EQ(place->state(*kept)[u"families"_s], new_state[u"families"_s]);
+    EXPECT_EQ(QDir(QFileInfo(QDir(report->before_unchecked).absolutePath()).path())
+                  .entryList({u"*.unfinished"_s}, QDir::Dirs),
+              QStringList());
     EXPECT_EQ(place->state(), old_state);
 }
 
