@@ -194,7 +194,9 @@ void measure_report(Church& church, const BareDatabase& database, const register
     const auto ours = [&] {
         core::SilentProgress progress;
         pages::PageSpool spool;
-        if (!registers::run_weekly_report(church.office, request, pages::Paper::a4, progress, spool) ||
+        registers::ReportCheck check{church.office.dialogue};
+        const auto plan = registers::plan_weekly_report(church.office, request, check);
+        if (!plan || !registers::write_weekly_report(church.office, *plan, pages::Paper::a4, progress, spool) ||
             !pages::write_pdf(spool, target))
             throw std::runtime_error(report.name);
         pages.clear();

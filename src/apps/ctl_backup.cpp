@@ -99,10 +99,8 @@ void print_backup(QTextStream& out, const core::BackupContents& backup, const co
 void print_records(QTextStream& out, const core::BackupContents& backup, const core::ChurchSummary& present)
 {
     Listing listing({{u"records"_s, u"Records"_s}, {u"backup"_s, u"In the backup"_s}, {u"present"_s, u"Now"_s}});
-    const auto then = core::kinds_of(backup.church);
-    const auto now = core::kinds_of(present);
-    for (std::size_t kind = 0; kind < then.size(); ++kind)
-        listing.add({then[kind].words, then[kind].rows, now[kind].rows});
+    for (const auto& kind : core::compared_kinds(backup.church, present))
+        listing.add({kind.words, kind.then, kind.now});
     listing.print(out, false);
 }
 

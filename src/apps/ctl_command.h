@@ -80,6 +80,7 @@ struct Command
 [[nodiscard]] Status run_people(Context& context);
 [[nodiscard]] Status run_reports(Context& context);
 [[nodiscard]] Status run_report(Context& context);
+[[nodiscard]] Status run_weekly_report(Context& context);
 [[nodiscard]] Status run_backup(Context& context);
 [[nodiscard]] Status run_backups(Context& context);
 [[nodiscard]] Status run_show_backup(Context& context);

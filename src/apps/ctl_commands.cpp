@@ -39,9 +39,19 @@ constexpr std::array people_options{
     Option{"fields", "A,B,C", "what to list; \"help\" names them (default surname,name,res_street,suburb,phone)"},
     Option{"format", "FORMAT", "text, csv or json (default text)"},
 };
-constexpr std::array report_options{
-    Option{"pdf", "FILE", "the file to write; one that is there is replaced once the report is complete"},
-    Option{"paper", "SIZE", "a4 or letter (default a4)"},
+constexpr Option pdf{"pdf", "FILE", "the file to write; one that is there is replaced once the report is complete"};
+constexpr Option paper{"paper", "SIZE", "a4 or letter (default a4)"};
+constexpr std::array report_options{pdf, paper};
+constexpr std::array weekly_report_options{
+    Option{"project", "NAME", "the weekly project (default: the only one)"},
+    Option{"category", "NAME", "a category to include, may be given again for another one (default: all)"},
+    Option{"year", "YYYY", "the calendar year"},
+    Option{"financial-year", "YYYY", "the financial year that begins in it"},
+    Option{"from", "DATE|YYYY", "the first day, or the first of several years"},
+    Option{"to", "DATE|YYYY", "the last day, or the last of several years"},
+    Option{"chart", "STYLE", "\"3D Bar\" for example (default: none, or 3D Bar where the report is about its chart)"},
+    pdf,
+    paper,
 };
 constexpr std::array backup_options{
     Option{"to", "FOLDER", "where to put it (default: the next of the church's own folders Backup1 to Backup5)"},
@@ -97,6 +107,11 @@ constexpr std::array command_table{
     Command{"report", "KEY|NAME --pdf FILE [--paper SIZE]", "write a report of the active families to a PDF file",
             "Runs the report with this key or name (see \"reports\") over the active families.",
             Needs::church_and_fonts, core::Area::report_outputs, 1, report_options, run_report},
+    Command{"weekly-report", "NAME --pdf FILE [--project NAME] [--year YYYY] [--from DATE --to DATE]",
+            "write a report of weekly statistics to a PDF file",
+            "Runs the report with this name, \"Monthly Totals\" or \"weekly_table_report\" for example, over the\n"
+            "figures of a period. A name that is none lists them all.",
+            Needs::church_and_fonts, core::Area::weekly_statistics, 1, weekly_report_options, run_weekly_report},
     Command{"backup", "[--to FOLDER] [--encrypt --backup-password-file FILE] [--without LIST]", "back the church up",
             "Backs the church up, with its pictures, documents and letters, and compares everything in the backup.\n"
             "In the church's own folders it takes the place of the backup made five times before.",

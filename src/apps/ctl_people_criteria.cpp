@@ -176,9 +176,12 @@ Criteria read(Context& context)
     if (given.has(u"surname"_s))
         filter.surnames = surnames_of(given.value(u"surname"_s));
     criteria.sort = order_called(*context.office->session, given.value(u"sort"_s, u"family"_s));
-    const bool by_birth = filter.ages || !filter.dates.empty() || criteria.sort.by == SortBy::birth_date;
-    if (by_birth && !core::permitted(*context.office, core::Area::birth_dates))
-        throw Fault{Status::refused, {}};
+    const auto of_order = people::right_for(criteria.sort.by);
+    const auto of_filter = people::asks_for_birth_dates(filter) ? std::optional(core::Area::birth_dates) : std::nullopt;
+    for (const auto right : {of_filter, of_order}) {
+        if (right && !core::permitted(*context.office, *right))
+            throw Fault{Status::refused, {}};
+    }
     return criteria;
 }
 

@@ -2,6 +2,12 @@
 
 #include "core/files.h"
 
+#include <array>
+#include <cerrno>
+#include <csignal>
+
+#include <poll.h>
+#include <sys/signalfd.h>
 #include <termios.h>
 #include <unistd.h>
 
@@ -18,6 +24,26 @@ std::optional<bool> yes_or_no(const QString& answer)
     if (word == "y"_L1 || word == "yes"_L1)
         return true;
     return word == "n"_L1 || word == "no"_L1 ? std::optional(false) : std::nullopt;
+}
+
+/// Waits until something was typed. False when Ctrl+C or a request to end came instead, where those are held back.
+bool somebody_typed()
+{
+    sigset_t held, wanted;
+    sigprocmask(SIG_BLOCK, nullptr, &held);
+    sigemptyset(&wanted);
+    for (const int each : {SIGINT, SIGTERM, SIGHUP}) {
+        if (sigismember(&held, each) == 1)
+            sigaddset(&wanted, each);
+    }
+    const int requests = signalfd(-1, &wanted, SFD_CLOEXEC);
+    std::array<pollfd, 2> waiting{pollfd{STDIN_FILENO, POLLIN, 0}, pollfd{requests, POLLIN, 0}};
+    while (poll(waiting.data(), waiting.size(), -1) < 0 && errno == EINTR) {
+    }
+    signalfd_siginfo taken{};
+    const bool ended = (waiting[1].revents & POLLIN) != 0 && read(requests, &taken, sizeof taken) > 0;
+    close(requests);
+    return !ended;
 }
 
 /// Keeps what is typed from being shown.
@@ -63,7 +89,7 @@ void TerminalDialogue::show(const core::Message& message)
 std::optional<QString> TerminalDialogue::ask(const QString& prompt)
 {
     m_err << prompt << Qt::flush;
-    const auto answer = m_attended ? m_in.readLine() : QString();
+    const auto answer = m_attended && somebody_typed() ? m_in.readLine() : QString();
     if (!answer.isNull())
         return answer;
     m_err << Qt::endl;

@@ -74,7 +74,7 @@ int run(desktop::Application& application, const Options& options)
              [&boxes](const core::Office& office) { boxes.set_audio_folder(office.paths.folder(core::Folder::audio)); },
          .ended =
              [] {
-                 QCoreApplication::quit();
+                 QCoreApplication::exit(); // Everything was asked, so that no window is to be asked again.
              }});
     if (!running.start(options.church))
         return 1;

@@ -19,13 +19,14 @@ constexpr int done = 0, findings = 1, wrong_usage = 2;
 
 QString help_text()
 {
-    return u"Usage: kindrel-mender [OPTIONS] check|mend|unlock|recover FILE|set-aside\n\n"
+    return u"Usage: kindrel-mender [OPTIONS] check|mend|unlock|recover FILE|put-in-place FILE|set-aside\n\n"
            "Looks after a church's records that Kindrel cannot or must not open. Without a command it opens its window.\n\n"
-           "  check         tell what is wrong; nothing is changed\n"
-           "  mend          put it right, after a copy of the database was laid into the church's folder 'mended'\n"
-           "  unlock        remove every lock and marker that keeps people out; make sure first that nobody is inside\n"
-           "  recover FILE  write what can be read of a damaged church file into FILE, a new church file\n"
-           "  set-aside     move a damaged church file away, so that Kindrel starts and a backup can be restored\n\n"
+           "  check              tell what is wrong; nothing is changed\n"
+           "  mend               put it right, after a copy of the database was laid into the church's folder 'mended'\n"
+           "  unlock             remove every lock and marker that keeps people out; make sure that nobody is inside\n"
+           "  recover FILE       write what can be read of a damaged church file into FILE, a new church file\n"
+           "  put-in-place FILE  set the damaged church file aside, put the recovered FILE in its place and mend\n"
+           "  set-aside          move a damaged church file away, so that Kindrel starts and a backup can be restored\n\n"
            "Options:\n"
            "  --data-drive DIR  the folder that holds Kindrel_10_Data (default: the workstation's own)\n"
            "  --church N        the church: 1 to 7, 8 for training data, 9 for booked-out data\n"
@@ -98,12 +99,12 @@ std::optional<apps::MenderOrder> order_of(const QCommandLineParser& parser, QStr
                             .remove_locks = parser.isSet(u"remove-locks"_s)};
     const auto church = church_of(parser);
     order.request = {core::Purpose::command_line, church.value_or(0), parser.value(u"data-drive"_s)};
-    const int expected = order.command == apps::recover_command() ? 2 : 1;
+    const int expected = apps::takes_file(order.command) ? 2 : 1;
     if (!order.command)
-        fault = u"Say what to do: check, mend, unlock, recover FILE or set-aside."_s;
+        fault = u"Say what to do: check, mend, unlock, recover FILE, put-in-place FILE or set-aside."_s;
     else if (words.size() != expected)
-        fault = words.size() < expected ? u"The name of the new church file is missing."_s
-                                        : u"There are too many arguments."_s;
+        fault =
+            words.size() < expected ? u"The name of the church file is missing."_s : u"There are too many arguments."_s;
     else if (!church)
         fault = u"The church is a number from 1 to %1."_s.arg(core::booked_out_church);
     return fault.isEmpty() ? std::optional(order) : std::nullopt;

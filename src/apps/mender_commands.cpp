@@ -108,15 +108,8 @@ QString mending_question(const MenderContext& context)
                : question;
 }
 
-bool mend(const MenderContext& context)
+bool tell(const MenderContext& context, const core::Mending& mending)
 {
-    if (!free_to_work(context))
-        return refuse(context, words::running_here());
-    if (!agreed(context, mending_question(context)))
-        return refuse(context, words::nothing_changed());
-    if (context.order.remove_locks)
-        unlock_and_tell(context);
-    const auto mending = core::mend_church(context.place, people::mender_checks());
     if (!mending.refusal.isEmpty())
         return refuse(context, mending.refusal);
     if (!mending.copy.isEmpty())
@@ -132,6 +125,17 @@ bool mend(const MenderContext& context)
         print(context.out, mending.left);
     }
     return mending.left.empty();
+}
+
+bool mend(const MenderContext& context)
+{
+    if (!free_to_work(context))
+        return refuse(context, words::running_here());
+    if (!agreed(context, mending_question(context)))
+        return refuse(context, words::nothing_changed());
+    if (context.order.remove_locks)
+        unlock_and_tell(context);
+    return tell(context, core::mend_church(context.place, people::mender_checks()));
 }
 
 bool unlock(const MenderContext& context)
@@ -174,13 +178,27 @@ bool set_aside(const MenderContext& context)
     return true;
 }
 
+bool put_in_place(const MenderContext& context)
+{
+    const QString& recovered = context.order.target;
+    if (!free_to_work(context))
+        return refuse(context, words::running_here());
+    if (!agreed(context, words::placing_question(context.place.church, recovered)))
+        return refuse(context, words::nothing_changed());
+    const auto placement = core::put_in_place(context.place, recovered, people::mender_checks());
+    for (const auto& line : words::where_put(placement, context.place.paths.database()))
+        context.out << line << '\n';
+    return tell(context, placement.mending);
+}
+
 struct Named
 {
     const char16_t* word;
     MenderCommand command;
 };
-constexpr std::array commands{Named{u"check", check}, Named{u"mend", mend}, Named{u"unlock", unlock},
-                              Named{u"recover", recover}, Named{u"set-aside", set_aside}};
+constexpr std::array commands{Named{u"check", check},         Named{u"mend", mend},
+                              Named{u"unlock", unlock},       Named{u"recover", recover},
+                              Named{u"set-aside", set_aside}, Named{u"put-in-place", put_in_place}};
 
 } // namespace
 
@@ -191,9 +209,9 @@ MenderCommand mender_command(const QString& word)
     return found == commands.end() ? nullptr : found->command;
 }
 
-MenderCommand recover_command()
+bool takes_file(MenderCommand command)
 {
-    return recover;
+    return command == recover || command == put_in_place;
 }
 
 } // namespace kindrel::apps

@@ -16,7 +16,7 @@ struct MenderOrder
 {
     MenderCommand command = nullptr;
     core::StartRequest request = {};
-    QString target;  ///< The new church file.
+    QString target;  ///< The new or recovered church file.
     QString damaged; ///< Empty: the church's own file.
     bool json = false;
     bool ask = true;
@@ -33,6 +33,7 @@ struct MenderContext
 
 /// Null for a word that is no command.
 [[nodiscard]] MenderCommand mender_command(const QString& word);
-[[nodiscard]] MenderCommand recover_command();
+/// Whether the command is followed by the name of a church file.
+[[nodiscard]] bool takes_file(MenderCommand command);
 
 } // namespace kindrel::apps

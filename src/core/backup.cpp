@@ -110,7 +110,7 @@ BackupReport back_up(Office& office, const BackupRequest& request, Progress& pro
     office.side.backup = stored_settings(office);
     const QString folder = target_folder(office, request);
     demand_work_space(office);
-    const ProgressRun run(progress, u"Backing up"_s, archive_steps + 1, cancel_question);
+    const ProgressRun run(progress, u"Backing up"_s, archive_steps(*office.session) + 1, cancel_question);
     BackupReport report;
     report.compacted = compacted(office);
     if (!progress.step())
@@ -146,9 +146,9 @@ std::optional<BackupReport> make_backup(Office& office, const BackupRequest& req
 ChurchSummary present_state(const Office& office)
 {
     ChurchSummary church = summary_of(*office.session, {});
-    for (const CountedKind& kind : counted_kinds()) {
+    for (const QString& table : tables_of(*office.session)) {
         try {
-            const auto counted = summary_of(*office.session, {QString::fromUtf16(kind.table)});
+            const auto counted = summary_of(*office.session, {table});
             church.rows.insert(counted.rows);
             if (counted.last_change)
                 church.last_change = counted.last_change;

@@ -4,13 +4,14 @@
 #include "core/backup_files.h"
 #include "core/files.h"
 
+#include <QDateTime>
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
 #include <QStringDecoder>
 
 #include <algorithm>
-#include <array>
+#include <cerrno>
 #include <cstdlib>
 #include <cstring>
 
@@ -71,37 +72,76 @@ FileError writing_failed(const QString& file, zip_error_t* error)
                                                        QString::fromLocal8Bit(zip_error_strerror(error))));
 }
 
-/// The share of the work that zip_close has done, told to the meter.
-struct Writing
+/// A file that goes into an archive. The archive asks for it piece by piece, and frees it.
+class MeteredFile
 {
-    ByteMeter& meter;
-    qint64 bytes;
-    qint64 done = 0;
-    bool running = true;
+public:
+    MeteredFile(const QString& path, ByteMeter& meter) : m_file(path), m_meter(meter) { zip_error_init(&m_error); }
+    MeteredFile(const MeteredFile&) = delete;
+    MeteredFile& operator=(const MeteredFile&) = delete;
+    ~MeteredFile() { zip_error_fini(&m_error); }
 
-    void reached(double share)
+    static zip_int64_t answer(void* file, void* data, zip_uint64_t size, zip_source_cmd_t question)
     {
-        const auto now = std::min(bytes, static_cast<qint64>(share * static_cast<double>(bytes)));
-        if (now <= done)
-            return;
-        running = running && meter.advance(now - done);
-        done = now;
+        if (question == ZIP_SOURCE_FREE) {
+            delete static_cast<MeteredFile*>(file);
+            return 0;
+        }
+        return static_cast<MeteredFile*>(file)->answer(data, size, question);
     }
+
+private:
+    zip_int64_t answer(void* data, zip_uint64_t size, zip_source_cmd_t question)
+    {
+        switch (question) {
+        case ZIP_SOURCE_OPEN:
+            return m_file.open(QIODevice::ReadOnly) ? 0 : fail(ZIP_ER_OPEN);
+        case ZIP_SOURCE_READ:
+            return read(static_cast<char*>(data), static_cast<qint64>(size));
+        case ZIP_SOURCE_CLOSE:
+            m_file.close();
+            return 0;
+        case ZIP_SOURCE_STAT:
+            return describe(static_cast<zip_stat_t*>(data));
+        case ZIP_SOURCE_ERROR:
+            return zip_error_to_data(&m_error, data, size);
+        case ZIP_SOURCE_SUPPORTS:
+            return zip_source_make_command_bitmap(ZIP_SOURCE_OPEN, ZIP_SOURCE_READ, ZIP_SOURCE_CLOSE, ZIP_SOURCE_STAT,
+                                                  ZIP_SOURCE_ERROR, ZIP_SOURCE_FREE, ZIP_SOURCE_SUPPORTS, -1);
+        default:
+            return fail(ZIP_ER_OPNOTSUPP);
+        }
+    }
+    zip_int64_t read(char* piece, qint64 size)
+    {
+        const qint64 got = m_file.read(piece, size);
+        if (got < 0)
+            return fail(ZIP_ER_READ);
+        return m_meter.advance(got) ? got : fail(ZIP_ER_CANCELLED);
+    }
+    zip_int64_t describe(zip_stat_t* stat)
+    {
+        const QFileInfo file(m_file);
+        stat->size = static_cast<zip_uint64_t>(file.size());
+        stat->mtime = file.lastModified().toSecsSinceEpoch();
+        stat->valid |= ZIP_STAT_SIZE | ZIP_STAT_MTIME;
+        return sizeof(*stat);
+    }
+    zip_int64_t fail(int code)
+    {
+        zip_error_set(&m_error, code, errno);
+        return -1;
+    }
+
+    QFile m_file;
+    ByteMeter& m_meter;
+    zip_error_t m_error;
 };
-
-void on_progress(zip_t*, double share, void* writing)
-{
-    static_cast<Writing*>(writing)->reached(share);
-}
-
-int on_cancel(zip_t*, void* writing)
-{
-    return static_cast<Writing*>(writing)->running ? 0 : 1;
-}
 
 } // namespace
 
-ArchiveWriter::ArchiveWriter(const QString& file, const QString& password) : m_file(file), m_password(password.toUtf8())
+ArchiveWriter::ArchiveWriter(const QString& file, const QString& password, ByteMeter& meter)
+    : m_file(file), m_password(password.toUtf8()), m_meter(meter)
 {
     int code = 0;
     m_zip = zip_open(QFile::encodeName(file).constData(), ZIP_CREATE | ZIP_TRUNCATE, &code);
@@ -122,11 +162,11 @@ ArchiveWriter::~ArchiveWriter()
 
 void ArchiveWriter::add_file(const QString& name, const QString& source)
 {
-    zip_source_t* content = zip_source_file(m_zip, QFile::encodeName(source).constData(), 0, -1);
-    const auto place = content ? zip_file_add(m_zip, name.toUtf8().constData(), content, ZIP_FL_ENC_UTF_8) : -1;
-    if (content && place < 0)
-        zip_source_free(content);
-    describe(place, name);
+    auto file = std::make_unique<MeteredFile>(source, m_meter);
+    zip_source_t* content = zip_source_function(m_zip, MeteredFile::answer, file.get());
+    if (content)
+        (void)file.release(); // NOLINT: the archive frees it.
+    add(name, content);
 }
 
 void ArchiveWriter::add_content(const QString& name, const QByteArray& content)
@@ -139,14 +179,14 @@ void ArchiveWriter::add_content(const QString& name, const QByteArray& content)
     zip_source_t* source = zip_source_buffer(m_zip, copy, size, 1);
     if (!source)
         std::free(copy);
-    const auto place = source ? zip_file_add(m_zip, name.toUtf8().constData(), source, ZIP_FL_ENC_UTF_8) : -1;
-    if (source && place < 0)
-        zip_source_free(source);
-    describe(place, name);
+    add(name, source);
 }
 
-void ArchiveWriter::describe(qint64 place, const QString& name)
+void ArchiveWriter::add(const QString& name, zip_source* content)
 {
+    const auto place = content ? zip_file_add(m_zip, name.toUtf8().constData(), content, ZIP_FL_ENC_UTF_8) : -1;
+    if (content && place < 0)
+        zip_source_free(content);
     const auto index = static_cast<zip_uint64_t>(place);
     const bool packed = std::ranges::any_of(
         packed_already, [&](const QString& ending) { return name.endsWith(ending, Qt::CaseInsensitive); });
@@ -159,21 +199,14 @@ void ArchiveWriter::describe(qint64 place, const QString& name)
         throw writing_failed(m_file, zip_get_error(m_zip));
 }
 
-void ArchiveWriter::finish(ByteMeter& meter, qint64 bytes)
+void ArchiveWriter::finish()
 {
-    Writing writing{meter, bytes};
-    const double each_step = 1.0 / ByteMeter::meter_steps / 2;
-    zip_register_progress_callback_with_state(m_zip, each_step, on_progress, nullptr, &writing);
-    zip_register_cancel_callback_with_state(m_zip, on_cancel, nullptr, &writing);
     if (zip_close(m_zip) != 0) {
-        if (!writing.running)
+        if (!m_meter.advance(0))
             throw Cancelled();
         throw writing_failed(m_file, zip_get_error(m_zip));
     }
     m_zip = nullptr;
-    writing.reached(1);
-    if (!writing.running)
-        throw Cancelled();
 }
 
 void ArchiveReader::Discard::operator()(zip* archive) const

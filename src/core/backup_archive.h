@@ -10,6 +10,7 @@
 #include <vector>
 
 struct zip;
+struct zip_source;
 
 namespace kindrel::core {
 
@@ -18,23 +19,24 @@ class ArchiveWriter
 {
 public:
     /// Writes in place of `file`, which must be there already: the archive takes its permissions. Throws FileError.
-    ArchiveWriter(const QString& file, const QString& password);
+    ArchiveWriter(const QString& file, const QString& password, ByteMeter& meter);
     /// Nothing is left but the file as it was.
     ~ArchiveWriter();
     ArchiveWriter(const ArchiveWriter&) = delete;
     ArchiveWriter& operator=(const ArchiveWriter&) = delete;
 
-    /// The source is read by finish().
+    /// The source is read by finish(), and metered.
     void add_file(const QString& name, const QString& source);
     void add_content(const QString& name, const QByteArray& content);
-    /// Writes it all, with `bytes` of the meter for it. Throws FileError, or Cancelled.
-    void finish(ByteMeter& meter, qint64 bytes);
+    /// Writes it all. Throws FileError, or Cancelled.
+    void finish();
 
 private:
-    void describe(qint64 place, const QString& name);
+    void add(const QString& name, zip_source* content);
 
     QString m_file;
     QByteArray m_password;
+    ByteMeter& m_meter;
     zip* m_zip = nullptr;
 };
 

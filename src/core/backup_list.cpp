@@ -35,11 +35,19 @@ QString list_file(const Office& office)
 }
 
 /// What cannot be read is forgotten: the archives themselves are what matters.
+QByteArray readable_list(const Office& office)
+{
+    try {
+        return read_file(list_file(office)).value_or(QByteArray());
+    } catch (const FileError&) {
+        return {};
+    }
+}
+
 std::vector<Remembered> read_list(const Office& office)
 {
     std::vector<Remembered> list;
-    const auto json = read_file(list_file(office)).value_or(QByteArray());
-    for (const auto& value : QJsonDocument::fromJson(json).array()) {
+    for (const auto& value : QJsonDocument::fromJson(readable_list(office)).array()) {
         const QJsonObject object = value.toObject();
         list.push_back({object[u"file"_s].toString(), QDateTime::fromString(object[u"made"_s].toString(), Qt::ISODate),
                         QDateTime::fromString(object[u"written"_s].toString(), Qt::ISODateWithMs),

@@ -10,6 +10,7 @@
 #include <QDir>
 #include <QFile>
 #include <QFileInfo>
+#include <QSet>
 
 #include <algorithm>
 
@@ -19,7 +20,11 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-constexpr qint64 largest_manifest = 512 << 20;
+/// Locks, counters and logs grow and go without a person's doing.
+bool keeps_itself(const QString& table)
+{
+    return table.startsWith("tbl_id_"_L1) || table.contains("lock"_L1) || table.endsWith("_archive"_L1);
+}
 
 BackupError damaged(const QString& what)
 {
@@ -139,6 +144,7 @@ void unpack(const OpenBackup& backup, const QString& folder, Unpack what, ByteMe
     }
     if (!is_as_described(folder + database_entry, backup.manifest.church))
         throw damaged(u"its database is not the one that was saved"_s);
+    meter.step();
 }
 
 BackupContents read_backup(const QString& file, const QString& password)
@@ -170,12 +176,27 @@ BackupContents contents_of(const OpenBackup& backup, const QString& file)
     return contents;
 }
 
-std::vector<KindCount> kinds_of(const ChurchSummary& church)
+std::vector<ComparedKind> compared_kinds(const ChurchSummary& then, const ChurchSummary& now)
 {
-    std::vector<KindCount> counts;
-    for (const CountedKind& kind : counted_kinds())
-        counts.push_back({QString::fromUtf16(kind.words), church.rows.value(QString::fromUtf16(kind.table).toLower())});
-    return counts;
+    std::vector<ComparedKind> kinds;
+    ComparedKind others{u"Other records"_s};
+    QSet<QString> counted;
+    for (const CountedKind& kind : counted_kinds()) {
+        const QString table = QString::fromUtf16(kind.table).toLower();
+        counted.insert(table);
+        kinds.push_back({QString::fromUtf16(kind.words), then.rows.value(table), now.rows.value(table)});
+    }
+    QMap<QString, qint64> every = now.rows;
+    every.insert(then.rows);
+    for (const QString& table : every.keys()) {
+        const qint64 before = then.rows.value(table), present = now.rows.value(table);
+        if (before == present || counted.contains(table) || keeps_itself(table))
+            continue;
+        others.then += before;
+        others.now += present;
+    }
+    kinds.push_back(others);
+    return kinds;
 }
 
 } // namespace kindrel::core

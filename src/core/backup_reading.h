@@ -6,6 +6,9 @@
 
 namespace kindrel::core {
 
+/// The longest description that is read, in bytes. That of a church with 300,000 photographs is as long.
+inline constexpr qint64 largest_manifest = 64 << 20;
+
 /// A backup whose description was read and agrees with the archive's directory. Throws BackupError.
 struct OpenBackup
 {
@@ -17,9 +20,12 @@ struct OpenBackup
 
 enum class Unpack { database, everything };
 
+inline constexpr int database_check_steps = 1;
+
 /// Reads every file of the backup and compares it with its checksum; puts the database, or everything, under `folder`
 /// by the names that they bear in the archive. Then opens the database, checks it and compares its rows. Throws
-/// BackupError, DatabaseError, FileError or Cancelled; what was unpacked counts for nothing then.
+/// BackupError, DatabaseError, FileError or Cancelled; what was unpacked counts for nothing then. Takes, beside those
+/// of the bytes, `database_check_steps` steps.
 void unpack(const OpenBackup& backup, const QString& folder, Unpack what, ByteMeter& meter);
 
 /// What of one folder is in a backup.
@@ -28,13 +34,6 @@ struct PartContents
     QString words;
     int files = 0;
     qint64 bytes = 0;
-};
-
-/// A kind of record and how many there are.
-struct KindCount
-{
-    QString words;
-    qint64 rows = 0;
 };
 
 /// What stands in a backup.
@@ -53,7 +52,14 @@ struct BackupContents
 [[nodiscard]] BackupContents read_backup(const QString& file, const QString& password);
 [[nodiscard]] BackupContents contents_of(const OpenBackup& backup, const QString& file);
 
-/// The counts that a person compares, in a fixed order.
-[[nodiscard]] std::vector<KindCount> kinds_of(const ChurchSummary& church);
+/// Of one kind of record.
+struct ComparedKind
+{
+    QString words;
+    qint64 then = 0, now = 0;
+};
+/// What a person compares a backup and the church by, in a fixed order; at the end the records of all other kinds of
+/// which there are not as many as before. Changes inside records are not to be seen in it.
+[[nodiscard]] std::vector<ComparedKind> compared_kinds(const ChurchSummary& then, const ChurchSummary& now);
 
 } // namespace kindrel::core

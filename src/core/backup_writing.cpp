@@ -1,7 +1,10 @@
 #include "core/backup_writing.h"
 
 #include "core/backup_files.h"
+#include "core/copy_church_tables.h"
 #include "core/files.h"
+#include "core/open_church.h"
+#include "core/schema.h"
 #include "core/sqlite_session.h"
 #include "core/startup.h"
 #include "core/verified_copy.h"
@@ -74,11 +77,30 @@ ManifestEntry hashed(const Source& source, ByteMeter& meter)
     return {source.name, size, hash.result().toHex()};
 }
 
+/// Copies row by row, over a connection that belongs to this run alone: steps are made while it reads one moment.
+void copy_from_server(const Office& office, const QString& copy, Progress& progress)
+{
+    constexpr int works_per_row = 2; // Each is written and compared.
+    const auto server = connect_to_read(office.paths);
+    const auto target = create_sqlite(copy);
+    create_schema(*target);
+    const Transaction reading(*server);
+    Transaction writing(*target);
+    ByteMeter meter(progress, works_per_row * count_rows(*server));
+    copy_tables(*server, *target, [&](int rows) { meter.add(rows); });
+    writing.commit();
+}
+
 /// A sound copy of the database that bears the church's code.
-QString copy_database(Office& office, const QString& church_code, const WorkFolder& work)
+QString copy_database(const Office& office, const QString& church_code, const WorkFolder& work, Progress& progress)
 {
     const QString copy = work.file(u"KR10_records.kdl"_s);
-    verified_copy(*office.session, copy);
+    if (office.session->engine() == EngineKind::postgres) {
+        copy_from_server(office, copy, progress);
+        check_church_file(copy);
+    } else {
+        verified_copy(*office.session, copy);
+    }
     const auto session = open_sqlite(copy);
     if (summary_of(*session, {}).church_code.isEmpty())
         write_setting(*session, u"church_code"_s, church_code);
@@ -148,11 +170,13 @@ Manifest describe(const Office& office, const BackupChoice& choice, const QStrin
 void fill_archive(const QString& path, const ArchiveJob& job, const Manifest& manifest,
                   const std::vector<Source>& sources, ByteMeter& meter)
 {
-    ArchiveWriter writer(path, job.password);
+    ArchiveWriter writer(path, job.password, meter);
     writer.add_content(manifest_entry, manifest.to_json());
     for (const auto& source : sources)
         writer.add_file(source.name, source.path);
-    writer.finish(meter, bytes_in(sources));
+    meter.step();
+    writer.finish();
+    meter.step();
 }
 
 /// The archive as it lies on the disk.
@@ -164,6 +188,7 @@ BackupContents check_archive(const QString& path, const ArchiveJob& job, const M
     const OpenBackup backup(path, job.password);
     if (backup.manifest.entries != manifest.entries)
         throw BackupError(BackupFault::damaged, u"The backup holds something else than was written."_s);
+    meter.step();
     const WorkFolder checked(work.file(u"check"_s));
     unpack(backup, checked.file({}), Unpack::database, meter);
     return contents_of(backup, job.folder + job.name);
@@ -211,13 +236,20 @@ QString changed_kind(const Content& content, ByteMeter& meter)
 
 } // namespace
 
+int archive_steps(const Session& session)
+{
+    constexpr int single = 4; // The database is copied; all files entered, the archive written, and opened again.
+    const int rows_copied = session.engine() == EngineKind::postgres ? ByteMeter::meter_steps : 0;
+    return rows_copied + single + ByteMeter::meter_steps + database_check_steps;
+}
+
 BackupContents write_archive(Office& office, const ArchiveJob& job, Progress& progress)
 {
     const QString church = office.paths.folder(Folder::church);
     demand_work_space(office);
     const WorkFolder work(church + u"backup_work"_s);
     clear_unfinished(office, job.folder);
-    const QString copy = copy_database(office, job.church_code, work);
+    const QString copy = copy_database(office, job.church_code, work, progress);
     if (!progress.step())
         throw Cancelled();
 

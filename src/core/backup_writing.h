@@ -16,7 +16,7 @@ struct ArchiveJob
 };
 
 /// The steps that write_archive() takes of a progress.
-inline constexpr int archive_steps = ByteMeter::meter_steps + 1;
+[[nodiscard]] int archive_steps(const Session& session);
 
 /// Writes the church into an archive that appears under its name only after it was opened again and everything in it
 /// compared. The caller holds the busy marker. Throws DatabaseError, FileError, BackupError or Cancelled and leaves

@@ -163,10 +163,24 @@ std::vector<RecoveredTable> recover_church(const QString& damaged, const QString
         copy_file(damaged + u"-journal"_s, scratch.reading() + u"-journal"_s);
     copy_file(damaged, scratch.reading());
     cut_to_whole_pages(scratch.reading());
-    DamagedFile from(scratch.reading());
+    DamagedFile from(scratch.reading(), DamagedFile::Opening::copy);
     auto tables = recover_tables(from, scratch.writing());
     move_file(scratch.writing(), fresh);
     return tables;
+}
+
+QString code_of_damaged(const QString& damaged)
+{
+    const QString table = u"tbl_startup"_s, field = u"church_code"_s;
+    DamagedFile from(damaged, DamagedFile::Opening::as_it_lies);
+    QString code;
+    if (!from.fields_of(table).contains(field, Qt::CaseInsensitive))
+        return code;
+    (void)from.read(table, {field}, [&](const std::vector<Value>& row) {
+        if (const auto* text = std::get_if<QString>(&row.front()))
+            code = *text;
+    });
+    return code;
 }
 
 } // namespace kindrel::core

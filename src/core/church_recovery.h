@@ -18,4 +18,7 @@ struct RecoveredTable
 /// or FileError when nothing at all can be read, and leaves nothing behind.
 [[nodiscard]] std::vector<RecoveredTable> recover_church(const QString& damaged, const QString& fresh);
 
+/// The code that tells the church of a damaged file apart from every other; empty where it has none or cannot be read.
+[[nodiscard]] QString code_of_damaged(const QString& damaged);
+
 } // namespace kindrel::core

@@ -21,9 +21,11 @@ struct Log
 };
 constexpr std::array logs{Log{u"tbl_security_archive", u"entered"}, Log{u"tbl_wardline_security_archive", u"entered"}};
 
+/// Asked before the marker keeps others out.
 bool enough_space(const Office& office)
 {
-    if (office.workstation.free_bytes(office.paths.folder(Folder::church)) >= free_bytes_needed)
+    if (office.session->engine() != EngineKind::sqlite ||
+        office.workstation.free_bytes(office.paths.folder(Folder::church)) >= free_bytes_needed)
         return true;
     office.dialogue.show(information(
         u"Your hard disk space is getting low. You need to have at least 40 Meg free before the compacting function "
@@ -48,28 +50,37 @@ void prune(Session& session, const Log& log)
                         .arg(log_rows_kept - 1));
 }
 
-} // namespace
-
-bool compact_church(Office& office)
-{
-    const auto busy = Marker::take(office.paths, side_files::busy);
-    return busy && compact_held_church(office);
-}
-
-bool compact_held_church(Office& office)
+void compact(Office& office)
 {
     Session& session = *office.session;
-    if (session.engine() == EngineKind::sqlite) { // A server tidies up by itself.
-        if (!enough_space(office))
-            return false;
+    if (session.engine() == EngineKind::sqlite) // A server tidies up by itself.
         rebuild(session, office.paths);
-    }
     Transaction transaction(session);
     write_setting(session, u"compact_count"_s, 0);
     for (const auto& log : logs)
         prune(session, log);
     transaction.commit();
     office.settings.compact_count = 0;
+}
+
+} // namespace
+
+bool compact_church(Office& office)
+{
+    if (!enough_space(office))
+        return false;
+    const auto busy = Marker::take(office.paths, side_files::busy);
+    if (!busy)
+        return false;
+    compact(office);
+    return true;
+}
+
+bool compact_held_church(Office& office)
+{
+    if (!enough_space(office))
+        return false;
+    compact(office);
     return true;
 }
 

@@ -1,6 +1,7 @@
 #include "core/copy_church.h"
 
 #include "core/backup.h"
+#include "core/backup_manifest.h"
 #include "core/backup_meter.h"
 #include "core/copy_church_tables.h"
 #include "core/entry.h"
@@ -225,9 +226,11 @@ std::optional<CopyReport> copy_church(Office& office, const CopyRequest& request
         const auto marker = Marker::take(office.paths, side_files::busy);
         if (!marker || target_is_busy(office, request.to))
             office.dialogue.show(backup_rules::busy(failed));
-        else if (nobody_inside(office, *office.session))
+        else if (nobody_inside(office, *office.session)) {
+            provide_church_code(*office.session); // By which the copy is known for this church's.
             report = request.to.file.isEmpty() ? copy_to_server(office, request, progress)
                                                : copy_to_new_or_old_file(office, request, progress);
+        }
     });
     return done ? report : std::nullopt;
 }

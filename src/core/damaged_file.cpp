@@ -2,6 +2,8 @@
 
 #include "core/session.h"
 
+#include <QUrl>
+
 #include <sqlite3.h>
 
 #include <algorithm>
@@ -217,10 +219,13 @@ void DamagedFile::Close::operator()(sqlite3* database) const
     sqlite3_close_v2(database);
 }
 
-DamagedFile::DamagedFile(const QString& file)
+DamagedFile::DamagedFile(const QString& file, Opening opening)
 {
+    const bool copy = opening == Opening::copy;
+    const QByteArray name = copy ? file.toUtf8() : QUrl::fromLocalFile(file).toEncoded() + "?immutable=1";
+    const int mode = copy ? SQLITE_OPEN_READWRITE : SQLITE_OPEN_READONLY | SQLITE_OPEN_URI;
     sqlite3* database = nullptr;
-    const int code = sqlite3_open_v2(file.toUtf8().constData(), &database, SQLITE_OPEN_READWRITE, nullptr);
+    const int code = sqlite3_open_v2(name.constData(), &database, mode, nullptr);
     m_database.reset(database);
     if (code != SQLITE_OK)
         throw DatabaseError(u"'%1' cannot be opened."_s.arg(file));

@@ -18,8 +18,13 @@ class DamagedFile
 public:
     using Sink = std::function<void(std::vector<Value>)>;
 
-    /// The file may be changed by opening it: give it a copy. Throws DatabaseError.
-    explicit DamagedFile(const QString& file);
+    enum class Opening {
+        copy, ///< What an interrupted change left in the journal is taken back: the file may be changed by that.
+        as_it_lies
+    };
+
+    /// Throws DatabaseError.
+    DamagedFile(const QString& file, Opening opening);
 
     /// Empty when the file does not tell of the table.
     [[nodiscard]] QStringList fields_of(const QString& table);

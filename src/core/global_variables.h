@@ -43,7 +43,8 @@ public:
 
     [[nodiscard]] bool altered() const;
     /// Writes what was altered and gives it to the office. When any of it is refused or cannot be written, files and
-    /// database are as they were. Throws DatabaseError.
+    /// database are as they were. Throws DatabaseError; where it says that a change may have been stored, the files are
+    /// as they were and the database alone may have it.
     [[nodiscard]] bool save();
     /// The stored order of day and month is not the one in use: it changes when the program is started again.
     [[nodiscard]] bool waits_for_next_start() const;

@@ -5,6 +5,7 @@
 #include "core/locks.h"
 #include "core/marker.h"
 #include "core/mender_checks.h"
+#include "core/mender_obstacle.h"
 #include "core/open_church.h"
 #include "core/restore_swap.h"
 #include "core/side_files.h"
@@ -22,16 +23,6 @@ using namespace Qt::StringLiterals;
 namespace {
 
 namespace checks = mender_checks;
-
-const QString backup_or_recover =
-    u"Set the damaged file aside (kindrel-mender set-aside), start Kindrel, which begins an empty church then, and put "
-    "back a backup with 'Restore Data'. Without a backup, let what can still be read be recovered into a new church "
-    "file (kindrel-mender recover)."_s;
-const QString somebody_inside =
-    u"Somebody may be working in the church:\n%1\nWhen nobody is, unlock the church first."_s;
-const QString locked_by_marker =
-    u"The church is locked by 'lock.dat': another user is either compacting files, backing them up or restoring them. "
-    "When nobody is, unlock the church first."_s;
 
 constexpr std::array own_checks{
     Check{Check::On::rows, checks::examine_engine, checks::mend_engine},
@@ -55,24 +46,21 @@ std::vector<Check> with_own(std::span<const Check> more)
     return all;
 }
 
-Finding closed_database(const QString& why)
+Finding unwritable(const FileError& error)
 {
-    return {u"closed"_s, u"The church's database cannot be opened: %1"_s.arg(why), 1, Cure::recover, backup_or_recover};
+    return {u"unreadable_file"_s, error.text(), 1, Cure::by_hand,
+            u"See that this workstation may read and write the church's folders."_s};
 }
 
 /// A check that fails tells of a damage too.
 Findings examined(MenderPlace& place, const Check& check)
 {
-    if (check.on == Check::On::rows && !place.session)
-        return {};
     try {
         return check.examine(place);
     } catch (const DatabaseError& error) {
-        return {{u"unreadable"_s, u"A part of the database cannot be read: %1"_s.arg(error.text()), 1, Cure::recover,
-                 u"What mending can put right comes first; if this stays, recover the church into a new file."_s}};
+        return {checks::unreadable(error, *place.session)};
     } catch (const FileError& error) {
-        return {{u"unreadable_file"_s, error.text(), 1, Cure::by_hand,
-                 u"See that this workstation may read and write the church's folders."_s}};
+        return {unwritable(error)};
     }
 }
 
@@ -90,21 +78,15 @@ bool has(const Findings& findings, QStringView kind)
     return std::ranges::any_of(findings, [&](const Finding& finding) { return finding.kind == kind; });
 }
 
-QStringList others_inside(MenderPlace& place)
-{
-    QStringList lines;
-    for (const auto& lock : Locks(*place.session, place.workstation, place.clock).all()) {
-        if (!lock.stale)
-            lines += held_line(lock, DayOrder::day_first);
-    }
-    return lines;
-}
-
 /// Why the church must not be mended now; empty when it may.
 QString refusal_for(MenderPlace& place, const Findings& findings)
 {
+    const auto obstacle =
+        std::ranges::find_if(findings, [](const Finding& finding) { return out_of_sight({finding}); });
+    if (obstacle != findings.end())
+        return in_one_line(*obstacle);
     if (!place.session || has(findings, u"damaged"))
-        return u"The database itself is damaged and cannot be mended in its place. "_s + backup_or_recover;
+        return u"The database itself is damaged and cannot be mended in its place. "_s + checks::backup_or_recover();
     if (has(findings, u"version"))
         return u"The database is of another version of the program and is left alone."_s;
     const auto by_hand = [](const Finding& finding) {
@@ -132,28 +114,13 @@ bool nothing_locked(Session& session)
 QString inside(MenderPlace& place)
 {
     try {
-        const auto others = others_inside(place);
-        return others.isEmpty() ? QString() : somebody_inside.arg(others.join(u'\n'));
+        return checks::others_inside(place);
     } catch (const DatabaseError& error) {
         if (nothing_locked(*place.session))
             return {};
         return u"It cannot be told whether somebody is working in the church, since its locks cannot be read: %1\nWhen "
                "nobody is, unlock the church first."_s.arg(error.text());
     }
-}
-
-/// Locks that cannot be read are part of the damage.
-void demand_nobody_known_inside(MenderPlace& place)
-{
-    QStringList others;
-    try {
-        if (place.session)
-            others = others_inside(place);
-    } catch (const DatabaseError&) {
-        return;
-    }
-    if (!others.isEmpty())
-        throw FileError(somebody_inside.arg(others.join(u'\n')));
 }
 
 /// The copy must be sound and hold as many rows as the church. What is about to be mended does not count.
@@ -198,7 +165,7 @@ QString copy_before_mending(MenderPlace& place)
     return file;
 }
 
-void mend_all(MenderPlace& place, std::span<const Check> all)
+void mend_rows(MenderPlace& place, std::span<const Check> all)
 {
     Transaction transaction(*place.session);
     for (const auto& check : all) {
@@ -206,9 +173,21 @@ void mend_all(MenderPlace& place, std::span<const Check> all)
             check.mend(place);
     }
     transaction.commit();
+}
+
+/// The rows are mended by now: what fails here is left, and the rest goes on.
+void mend_files(MenderPlace& place, std::span<const Check> all, Findings& left)
+{
     for (const auto& check : all) {
-        if (check.on == Check::On::files && check.mend)
+        if (check.on == Check::On::rows || !check.mend)
+            continue;
+        try {
             check.mend(place);
+        } catch (const FileError& error) {
+            left.push_back(unwritable(error));
+        } catch (const DatabaseError& error) {
+            left.push_back(checks::unreadable(error, *place.session));
+        }
     }
 }
 
@@ -229,7 +208,7 @@ QString settle_cut_off_restore(MenderPlace& place)
 void mend_alone(MenderPlace& place, std::span<const Check> all, Mending& mending)
 {
     const auto busy = Marker::take(place.paths, side_files::busy);
-    mending.refusal = busy ? inside(place) : locked_by_marker;
+    mending.refusal = busy ? inside(place) : checks::locked_by_marker();
     if (!mending.refusal.isEmpty())
         return;
     make_fit_for_copy(place);
@@ -237,7 +216,8 @@ void mend_alone(MenderPlace& place, std::span<const Check> all, Mending& mending
     if (const auto told = settle_cut_off_restore(place); !told.isEmpty())
         mending.left.push_back({u"leftovers"_s, told, 1, Cure::by_hand,
                                 u"Look at the pictures, pages and letters, or restore a backup once more."_s});
-    mend_all(place, all);
+    mend_rows(place, all);
+    mend_files(place, all, mending.left);
 }
 
 /// Findings that are gone from `now`.
@@ -288,9 +268,11 @@ Findings examine_church(MenderPlace& place, std::span<const Check> more)
 {
     Findings findings;
     if (!place.session)
-        findings.push_back(closed_database(place.why_closed));
-    for (const auto& check : with_own(more))
-        add_new(findings, examined(place, check));
+        findings.push_back(place.closed);
+    for (const auto& check : with_own(more)) {
+        if (check.on == Check::On::files || (place.session && !out_of_sight(findings)))
+            add_new(findings, examined(place, check));
+    }
     return findings;
 }
 
@@ -329,31 +311,6 @@ QStringList unlock_church(MenderPlace& place)
             removed += u"The marker '%1'"_s.arg(QLatin1String(marker->name));
     }
     return removed;
-}
-
-QString set_database_aside(MenderPlace& place)
-{
-    if (place.paths.exists(Folder::church, connection_file.toString()))
-        throw FileError(u"This church lies on a server: there is no file of it that could be set aside."_s);
-    const QString file = place.paths.database();
-    if (!QFileInfo::exists(file))
-        throw FileError(u"There is no church file: start Kindrel and restore a backup."_s);
-    const auto busy = Marker::take(place.paths, side_files::busy);
-    if (!busy)
-        throw FileError(locked_by_marker);
-    const auto found = examine_church(place, {});
-    if (std::ranges::none_of(found, [](const Finding& finding) { return finding.cure == Cure::recover; }))
-        throw FileError(u"The church file is not damaged: start Kindrel to restore a backup."_s);
-    demand_nobody_known_inside(place);
-    place.session.reset();
-    const QString time = place.clock.now().toString(u"yyyy-MM-dd HHmmss");
-    const QString aside = mended_place(place, u"KR10_records set aside %1.kdl"_s.arg(time));
-    const QString journal = u"-journal"_s;
-    if (QFileInfo::exists(file + journal)) // First, since it must never come to stand beside another database.
-        move_privately(file + journal, aside + journal);
-    move_privately(file, aside);
-    place.why_closed = u"'%1' is missing."_s.arg(file);
-    return aside;
 }
 
 QString mended_place(const MenderPlace& place, const QString& name)

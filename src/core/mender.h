@@ -34,8 +34,11 @@ struct MenderPlace
     Workstation& workstation;
     Clock& clock;
     std::unique_ptr<Session> session = {};
-    QString why_closed = {}; ///< The engine's own words.
+    Finding closed = {}; ///< Why there is none.
 };
+
+/// Opens the database of the place, or tells there why it does not open.
+void open_to_mend(MenderPlace& place);
 
 /// One kind of damage. Row checks need a session and are mended inside one transaction, in their order, whether or not
 /// they found anything; file checks are mended after it.
@@ -50,6 +53,8 @@ struct Check
 /// Looks for everything that may be wrong with database and folder and changes nothing. `more` are the checks of other
 /// rooms, which come last.
 [[nodiscard]] Findings examine_church(MenderPlace& place, std::span<const Check> more);
+/// True where the findings tell that the database could not be looked at, so that nothing is known of its state.
+[[nodiscard]] bool out_of_sight(const Findings& findings);
 
 /// What mending came to.
 struct Mending
@@ -61,17 +66,30 @@ struct Mending
 
 /// Takes away every finding that mending cures, after a verified copy was laid into the church's folder `mended`. The
 /// rows are mended in one transaction. Refuses while somebody else may be inside. Throws DatabaseError or FileError:
-/// the rows are then as they were.
+/// the rows are then as they were. What fails after the rows were mended is told among what is left.
 [[nodiscard]] Mending mend_church(MenderPlace& place, std::span<const Check> more);
 
 /// Removes every lock and every marker of the church, whoever left it; what was removed, in words. Throws DatabaseError
 /// or FileError, the latter also while a restore runs.
 QStringList unlock_church(MenderPlace& place);
 
-/// Moves the file of a database that cannot be opened or is damaged into the folder `mended` and tells its place there:
-/// the next start begins an empty church, into which a backup can be restored. Throws FileError when the database is
-/// sound, lies on a server, or somebody is at work on it.
+/// Moves the file of a damaged database into the folder `mended` and tells its place there: the next start begins an
+/// empty church, into which a backup can be restored. Throws FileError when the database is not known to be damaged,
+/// lies on a server, or somebody is at work on it.
 [[nodiscard]] QString set_database_aside(MenderPlace& place);
+
+/// What putting a recovered file in place came to.
+struct Placement
+{
+    QString aside;   ///< Where the damaged file lies now; empty when there was none.
+    Mending mending; ///< Of the church as it is now.
+};
+
+/// Gives a recovered church file the place of the damaged or missing database, then mends the church. The damaged file
+/// is set aside as set_database_aside() does it; the recovered one is moved, or copied from another disk. Killed at any
+/// moment, both are there, and the church has one of them. Throws DatabaseError or FileError when the recovered file is
+/// not sound or not of this church, or where the damaged one may not be set aside; everything is then as it was.
+[[nodiscard]] Placement put_in_place(MenderPlace& place, const QString& recovered, std::span<const Check> more);
 
 /// A place of its own in the church's folder `mended`, which is made, for a file of this name.
 [[nodiscard]] QString mended_place(const MenderPlace& place, const QString& name);

@@ -38,6 +38,11 @@ void mend_side_files(MenderPlace& place);
 [[nodiscard]] QStringList lock_tables();
 /// Makes those again that are missing, without a lock in them.
 void make_lock_tables(MenderPlace& place);
+/// Who is working in the church as its locks tell, in words; empty when nobody is. Throws DatabaseError where they
+/// cannot be read.
+[[nodiscard]] QString others_inside(MenderPlace& place);
+/// Why nothing is done while the busy marker is there.
+[[nodiscard]] QString locked_by_marker();
 /// The table as the church office would call it.
 [[nodiscard]] QString in_words(QStringView table);
 /// The first number of the first row; 0 without rows.

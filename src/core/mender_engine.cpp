@@ -23,7 +23,9 @@ QStringList engine_faults(Session& session)
         auto rows = session.select(u"PRAGMA integrity_check;"_s);
         for (const Row& row : rows)
             faults += row.text(Column{0}).split(u'\n');
-    } catch (const DatabaseError& error) {
+    } catch (const FileDatabaseError& error) {
+        if (error.trouble() != FileTrouble::damage)
+            throw;
         faults += error.text();
     }
     faults.removeIf([](const QString& line) { return line == u"ok" || line.startsWith(u"*** "); });

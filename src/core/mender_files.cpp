@@ -77,6 +77,38 @@ QStringList leftovers(const Paths& paths)
     return found;
 }
 
+/// Works on each, also when it fails with some of them; throws one FileError in the end then.
+template <class Each, class Work>
+void on_each(const Each& all, const Work& work)
+{
+    QStringList failures;
+    for (const auto& one : all) {
+        try {
+            work(one);
+        } catch (const FileError& error) {
+            failures += error.text();
+        }
+    }
+    if (!failures.isEmpty())
+        throw FileError(failures.join(u'\n'));
+}
+
+/// The damaged content is kept first, and not kept again and again where the file cannot be written.
+void renew(MenderPlace& place, const SideFile& file)
+{
+    const QString path = place.paths.file(file.folder, QLatin1String(file.name));
+    const auto content = read_file(path);
+    const QString copy = mended_place(place, QFileInfo(path).fileName());
+    write_file(copy, *content);
+    try {
+        keep_private(copy);
+        write_side_file(place.paths, salvaged(file, *content));
+    } catch (const FileError&) {
+        remove_file(copy);
+        throw;
+    }
+}
+
 } // namespace
 
 Findings examine_markers(MenderPlace& place)
@@ -114,13 +146,13 @@ Findings examine_leftovers(MenderPlace& place)
 
 void mend_leftovers(MenderPlace& place)
 {
-    for (const auto& file : leftovers(place.paths)) {
+    on_each(leftovers(place.paths), [&](const QString& file) {
         const QFileInfo left(file);
         if (left.dir().dirName().compare(u"mended"_s, Qt::CaseInsensitive) == 0)
             remove_file(file); // Of an earlier mending, whose copy is not needed.
         else
             move_privately(file, mended_place(place, left.fileName().replace(u".unfinished"_s, u" unfinished"_s)));
-    }
+    });
 }
 
 Findings examine_side_files(MenderPlace& place)
@@ -140,16 +172,10 @@ Findings examine_side_files(MenderPlace& place)
 
 void mend_side_files(MenderPlace& place)
 {
-    for (const auto* file : settings_files) {
-        if (!damaged(place.paths, *file))
-            continue;
-        const QString path = place.paths.file(file->folder, QLatin1String(file->name));
-        const auto content = read_file(path);
-        const QString copy = mended_place(place, QFileInfo(path).fileName());
-        write_file(copy, *content);
-        keep_private(copy);
-        write_side_file(place.paths, salvaged(*file, *content));
-    }
+    on_each(settings_files, [&](const SideFile* file) {
+        if (damaged(place.paths, *file))
+            renew(place, *file);
+    });
 }
 
 } // namespace kindrel::core::mender_checks

@@ -1,5 +1,6 @@
 #include "core/mender_place.h"
 
+#include "core/mender_obstacle.h"
 #include "core/open_church.h"
 #include "core/side_files.h"
 #include "core/startup_steps.h"
@@ -37,20 +38,6 @@ int only_church(const Paths& local)
     return in_use.empty() ? 1 : in_use.front();
 }
 
-void open(MenderPlace& place)
-{
-    try {
-        if (church_present(place.paths))
-            place.session = connect_church(place.paths);
-        else
-            place.why_closed = u"'%1' is missing."_s.arg(place.paths.database());
-    } catch (const DatabaseError& error) {
-        place.why_closed = error.text();
-    } catch (const FileError& error) {
-        place.why_closed = error.text();
-    }
-}
-
 } // namespace
 
 Paths church_paths(const Paths& local, int church)
@@ -73,6 +60,20 @@ std::vector<int> churches_in_use(const Paths& local)
     return in_use;
 }
 
+void open_to_mend(MenderPlace& place)
+{
+    try {
+        if (church_present(place.paths))
+            place.session = connect_church(place.paths);
+        else
+            place.closed = mender_checks::missing(place.paths);
+    } catch (const DatabaseError& error) {
+        place.closed = mender_checks::closed(error);
+    } catch (const FileError& error) {
+        place.closed = mender_checks::closed(error);
+    }
+}
+
 MenderPlace find_church_to_mend(const StartRequest& request, Workstation& workstation, Clock& clock)
 {
     const Paths local = startup_steps::first_paths(request, workstation);
@@ -84,7 +85,7 @@ MenderPlace find_church_to_mend(const StartRequest& request, Workstation& workst
     const int church = request.church > 0 ? request.church : only_church(local);
     MenderPlace place{
         .paths = church_paths(local, church), .church = church, .workstation = workstation, .clock = clock};
-    open(place);
+    open_to_mend(place);
     return place;
 }
 

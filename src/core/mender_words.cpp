@@ -1,7 +1,5 @@
 #include "core/mender_words.h"
 
-#include "core/mender.h"
-
 namespace kindrel::core::mender_words {
 
 using namespace Qt::StringLiterals;
@@ -25,6 +23,13 @@ QString setting_aside_question(int church)
 {
     return u"Set the damaged church file of church %1 aside, so that the next start begins an empty church? Nobody may "
            "be inside."_s.arg(church);
+}
+
+QString placing_question(int church, const QString& recovered)
+{
+    return u"Put '%1' in the place of the church file of church %2, which is kept in the folder 'mended', and mend the "
+           "church? Nobody may be inside."_s.arg(recovered)
+               .arg(church);
 }
 
 QString running_here()
@@ -67,7 +72,15 @@ QString after_setting_aside()
 
 QString after_recovering()
 {
-    return u"To work with it, set the damaged file aside, give the new one its name, then mend the church."_s;
+    return u"To work with it, put it in the place of the damaged file (kindrel-mender put-in-place)."_s;
+}
+
+QStringList where_put(const Placement& placement, const QString& database)
+{
+    QStringList lines{u"The recovered records stand in '%1' now."_s.arg(database)};
+    if (!placement.aside.isEmpty())
+        lines += where_set_aside(placement.aside);
+    return lines;
 }
 
 } // namespace kindrel::core::mender_words

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "core/church_recovery.h"
+#include "core/mender.h"
 
 /// What the mender says on the terminal and in its window alike.
 namespace kindrel::core::mender_words {
@@ -9,6 +10,7 @@ namespace kindrel::core::mender_words {
 [[nodiscard]] QString unlocking_question(int church);
 [[nodiscard]] QString recovering_question(const QString& damaged, const QString& fresh);
 [[nodiscard]] QString setting_aside_question(int church);
+[[nodiscard]] QString placing_question(int church, const QString& recovered);
 
 /// Why nothing is done while the program runs on the same workstation.
 [[nodiscard]] QString running_here();
@@ -23,5 +25,7 @@ namespace kindrel::core::mender_words {
 [[nodiscard]] QString after_setting_aside();
 /// How to go on with the new church file.
 [[nodiscard]] QString after_recovering();
+/// Where both files lie after the recovered one was put in place.
+[[nodiscard]] QStringList where_put(const Placement& placement, const QString& database);
 
 } // namespace kindrel::core::mender_words

@@ -166,8 +166,7 @@ public:
     {
         Turn turn(*this);
         for (const auto& statement : split_script(script))
-            on_link(Loss::nothing_stored,
-                    [&](PostgresLink& link) { link.exec_as_is(schema_for_postgres(statement)); });
+            on_link(Loss::nothing_stored, [&](PostgresLink& link) { link.exec_as_is(schema_for_postgres(statement)); });
         turn.commit();
     }
 

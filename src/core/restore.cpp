@@ -30,6 +30,7 @@ constexpr qint64 read_at_once = 1 << 20;
 
 const QString failed = u"Restoring files failed because:-"_s;
 const QString cancel_question = u"Do you wish to stop restoring?"_s;
+const QString exchanging = u"The church is replaced, which cannot be stopped any more"_s;
 const QString somebody_inside = u"Unable to restore a backup while somebody is working in this church."_s;
 const QString another_church = u"This backup was made of another church."_s;
 const QString church_unknown =
@@ -46,14 +47,14 @@ const QString newer = u"This backup was made by a newer edition of Kindrel, you 
 const QString older = u"This backup was made by an edition of Kindrel that is too old to be restored."_s;
 
 /// True when nobody holds a lock. Those that a program of this workstation left behind when it failed do not count.
-bool nobody_inside(Office& office)
+/// Tells who is inside. Locks that cannot be read are a damage that the restore would take away.
+bool nobody_known_inside(Office& office)
 {
     std::vector<HeldLock> held;
     try {
         held = Locks(office).all();
-    } catch (const DatabaseError& error) { // A damage that the restore would take away.
-        return office.dialogue.confirm({.text = inside_unknown, .more = error.text(), .icon = Icon::question},
-                                       Answer::no);
+    } catch (const DatabaseError&) {
+        return true;
     }
     std::erase_if(held, &HeldLock::stale);
     if (held.empty())
@@ -65,6 +66,17 @@ bool nobody_inside(Office& office)
         lines += u"And %1 more."_s.arg(held.size() - most_holders_named);
     office.dialogue.show({.text = somebody_inside, .more = lines.join(u'\n')});
     return false;
+}
+
+bool nobody_inside(Office& office)
+{
+    try {
+        (void)Locks(office).all();
+    } catch (const DatabaseError& error) {
+        return office.dialogue.confirm({.text = inside_unknown, .more = error.text(), .icon = Icon::question},
+                                       Answer::no);
+    }
+    return nobody_known_inside(office);
 }
 
 void check_version(int version, std::span<const Upgrade> chain, int to)
@@ -89,12 +101,10 @@ bool of_this_church(const Office& office, const ChurchSummary& present, const Ma
 QString comparison(const ChurchSummary& present, const Manifest& manifest)
 {
     QStringList lines;
-    const auto now = kinds_of(present);
-    const auto then = kinds_of(manifest.church);
-    for (std::size_t kind = 0; kind < now.size(); ++kind) {
-        if (now[kind].rows != 0 || then[kind].rows != 0)
-            lines += u"%1: %2 in the backup, %3 now"_s.arg(now[kind].words, QString::number(then[kind].rows),
-                                                           QString::number(now[kind].rows));
+    for (const ComparedKind& kind : compared_kinds(manifest.church, present)) {
+        if (kind.now != 0 || kind.then != 0)
+            lines += u"%1: %2 in the backup, %3 now"_s.arg(kind.words, QString::number(kind.then),
+                                                           QString::number(kind.now));
     }
     return lines.join(u'\n');
 }
@@ -230,6 +240,15 @@ QString copy_unchecked(const Office& office, const QString& folder)
     return as_folder(target);
 }
 
+/// The list is a convenience: without it the archive is found where it lies.
+void remember(const Office& office, const BackupContents& kept)
+{
+    try {
+        backup_rules::remember(office, kept);
+    } catch (const FileError&) {
+    }
+}
+
 /// Keeps the present state: compared like any backup, or as it is when it is too damaged for that and the person goes
 /// on.
 void keep_present(Office& office, RestoreReport& report, Progress& progress)
@@ -237,28 +256,32 @@ void keep_present(Office& office, RestoreReport& report, Progress& progress)
     const QString folder = backup_rules::safety_folder(office);
     make_private_folder(folder);
     QString why;
+    BackupContents kept;
     try {
-        const auto contents = write_archive(
+        kept = write_archive(
             office,
             {.folder = folder, .name = archive_name(office, folder), .church_code = report.restored.church.church_code},
             progress);
-        backup_rules::remember(office, contents);
-        report.before = contents.file;
-        return;
+        report.before = kept.file;
     } catch (const std::runtime_error& error) { // Of the database, a file or the archive.
         why = QString::fromUtf8(error.what());
+    }
+    if (!report.before.isEmpty()) {
+        remember(office, kept);
+        return;
     }
     if (!office.dialogue.confirm({.text = present_unkept, .more = why}, Answer::no))
         throw Cancelled();
     report.before_unchecked = copy_unchecked(office, folder);
 }
 
+/// What cannot be removed stays.
 void remove_oldest_safety_backups(const Office& office, const QString& just_restored)
 {
     const QString folder = backup_rules::safety_folder(office);
     for (const auto& name : archives_in(folder, office.church).mid(safety_backups_kept)) {
         if (QFileInfo(folder + name) != QFileInfo(just_restored))
-            remove_file(folder + name);
+            QFile::remove(folder + name);
     }
     QStringList copies = QDir(folder).entryList({unchecked + u'*'}, QDir::Dirs, QDir::Name | QDir::Reversed);
     for (const auto& name : copies.mid(safety_backups_kept))
@@ -277,7 +300,10 @@ void exchange(Office& office, RestoreWork& work, const std::vector<Swap>& swaps)
         work.settle(*office.session);
         throw;
     }
-    work.settle(*office.session);
+    try {
+        work.settle(*office.session);
+    } catch (const std::runtime_error&) { // The backup is in place; whoever opens the church next clears up.
+    }
 }
 
 void demand_space_for(const Office& office, const Manifest& manifest)
@@ -287,35 +313,55 @@ void demand_space_for(const Office& office, const Manifest& manifest)
     demand_space(office, office.paths.folder(Folder::church), manifest.bytes() + database.size + 2 * present);
 }
 
+int steps_of_restore(const Session& session)
+{
+    constexpr int single = 2; // The database is prepared, and all is ready for the exchange.
+    return ByteMeter::meter_steps + database_check_steps + single + archive_steps(session);
+}
+
 RestoreReport replace(Office& office, const OpenBackup& backup, const RestoreRequest& request, Progress& progress)
 {
     const Manifest& manifest = backup.manifest;
     demand_space_for(office, manifest);
-    const ProgressRun run(progress, u"Restoring"_s, ByteMeter::meter_steps + archive_steps, cancel_question);
+    const ProgressRun run(progress, u"Restoring"_s, steps_of_restore(*office.session), cancel_question);
     RestoreWork work(office.paths);
     ByteMeter meter(progress, manifest.bytes());
     unpack(backup, work.unpacked(), Unpack::everything, meter);
     prepare_database(office, work);
+    meter.step();
     const auto swaps = swaps_for(office, manifest, work, request.with_shared_files);
 
     RestoreReport report{.restored = contents_of(backup, request.file), .before = {}};
     keep_present(office, report, progress);
+    if (!progress.step(exchanging))
+        throw Cancelled();
     exchange(office, work, swaps);
     remove_oldest_safety_backups(office, request.file);
     return report;
 }
 
+/// Nobody is kept out while the person thinks it over.
+bool agreed(Office& office, const Manifest& manifest)
+{
+    if (!nobody_inside(office))
+        return false;
+    const ChurchSummary present = present_state(office);
+    check_version(manifest.church.schema, upgrades(), schema_version);
+    return of_this_church(office, present, manifest) && wanted(office, present, manifest);
+}
+
 std::optional<RestoreReport> restore(Office& office, const RestoreRequest& request, Progress& progress)
 {
-    settle_interrupted_restore(office.paths, *office.session);
-    if (!nobody_inside(office))
-        return std::nullopt;
     const OpenBackup backup(request.file, request.password);
-    const ChurchSummary present = present_state(office);
-    check_version(backup.manifest.church.schema, upgrades(), schema_version);
-    if (!of_this_church(office, present, backup.manifest) || !wanted(office, present, backup.manifest))
+    if (!agreed(office, backup.manifest))
         return std::nullopt;
-    return replace(office, backup, request, progress);
+    const auto marker = Marker::take(office.paths, side_files::busy);
+    if (!marker) {
+        office.dialogue.show(backup_rules::busy(failed));
+        return std::nullopt;
+    }
+    settle_interrupted_restore(office.paths, *office.session);
+    return nobody_known_inside(office) ? std::optional(replace(office, backup, request, progress)) : std::nullopt;
 }
 
 } // namespace
@@ -326,10 +372,10 @@ std::optional<RestoreReport> restore_backup(Office& office, const RestoreRequest
         return std::nullopt;
     std::optional<RestoreReport> report;
     const bool done = backup_rules::attempt(office, failed, [&] {
-        if (const auto marker = Marker::take(office.paths, side_files::busy))
-            report = restore(office, request, progress);
-        else
+        if (office.paths.exists(Folder::church, QLatin1String(side_files::busy.name)))
             office.dialogue.show(backup_rules::busy(failed));
+        else
+            report = restore(office, request, progress);
     });
     return done ? report : std::nullopt;
 }

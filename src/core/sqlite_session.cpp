@@ -22,6 +22,30 @@ constexpr int application_id = 0x4B444C31;
 constexpr int busy_milliseconds = 15000;
 constexpr qsizetype statements_kept = 256;
 
+FileTrouble trouble_of(const SQLite::Exception& error)
+{
+    switch (error.getErrorCode()) {
+    case SQLITE_CORRUPT:
+    case SQLITE_NOTADB:
+        return FileTrouble::damage;
+    case SQLITE_IOERR:
+        return error.getExtendedErrorCode() == SQLITE_IOERR_READ ||
+                       error.getExtendedErrorCode() == SQLITE_IOERR_SHORT_READ
+                   ? FileTrouble::damage
+                   : FileTrouble::other;
+    case SQLITE_BUSY:
+    case SQLITE_LOCKED:
+    case SQLITE_PROTOCOL:
+        return FileTrouble::in_use;
+    case SQLITE_CANTOPEN:
+    case SQLITE_PERM:
+    case SQLITE_READONLY:
+        return FileTrouble::forbidden;
+    default:
+        return FileTrouble::other;
+    }
+}
+
 /// Runs `work` and turns the engine's exception into the house's.
 template <class Work>
 auto guarded(Work&& work) -> decltype(work())
@@ -29,7 +53,8 @@ auto guarded(Work&& work) -> decltype(work())
     try {
         return work();
     } catch (const SQLite::Exception& error) {
-        throw DatabaseError(QString::fromUtf8(error.what()), error.getErrorCode() == SQLITE_CONSTRAINT);
+        throw FileDatabaseError(QString::fromUtf8(error.what()), trouble_of(error),
+                                error.getErrorCode() == SQLITE_CONSTRAINT);
     }
 }
 
@@ -266,9 +291,9 @@ std::unique_ptr<Session> open_sqlite(const QString& file)
     return guarded([&] {
         auto session = std::make_unique<SqliteSession>(file, SQLite::OPEN_READWRITE);
         if (session->read_only())
-            throw DatabaseError(u"'%1' cannot be written."_s.arg(file));
+            throw FileDatabaseError(u"'%1' cannot be written."_s.arg(file), FileTrouble::forbidden);
         if (session->database().execAndGet("PRAGMA application_id").getInt() != application_id)
-            throw DatabaseError(u"'%1' is not a church database."_s.arg(file));
+            throw FileDatabaseError(u"'%1' is not a church database."_s.arg(file), FileTrouble::damage);
         session->configure();
         return std::unique_ptr<Session>(std::move(session));
     });

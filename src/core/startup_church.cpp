@@ -104,12 +104,16 @@ void compare_editions(Office& office, int recorded)
 
 bool upgrade(Office& office, int from, int to, std::span<const Upgrade> chain)
 {
-    const auto busy = Marker::take(office.paths, side_files::busy);
-    if (!busy) {
+    bool busy = false;
+    const bool done = attempt(office, upgrade_failed, [&] {
+        const auto marker = Marker::take(office.paths, side_files::busy);
+        busy = !marker;
+        if (marker)
+            upgrade_church(*office.session, office.paths, chain, from, to);
+    });
+    if (busy)
         office.dialogue.show(busy_notice());
-        return false;
-    }
-    return attempt(office, upgrade_failed, [&] { upgrade_church(*office.session, office.paths, chain, from, to); });
+    return done && !busy;
 }
 
 bool month_first(const QString& pattern)

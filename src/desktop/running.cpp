@@ -44,7 +44,7 @@ void Running::build()
         new Desk{*m_office, m_surroundings.progress, *m_remembered, *m_windows, m_surroundings.printing, *this});
     m_window = std::make_unique<MainWindow>(*m_desk, all_areas(), m_surroundings.look);
     connect(m_window.get(), &MainWindow::closed, this, [this] {
-        m_windows.reset();
+        m_windows->close_all();
         if (m_surroundings.ended)
             m_surroundings.ended();
     });
@@ -65,8 +65,12 @@ void Running::close()
 void Running::find_family()
 {
     bring_forward(*m_window);
-    if (!m_speed_find)
+    if (!m_speed_find) {
         m_speed_find = new SpeedFindWindow(*m_desk, *m_window);
+        connect(m_speed_find, &SpeedFindWindow::family_wanted, this, [this](const QString& surname) {
+            in_editor([surname](EditorPage& page) { return page.new_family(surname); });
+        });
+    }
     m_speed_find->ask();
 }
 

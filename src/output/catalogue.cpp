@@ -96,7 +96,8 @@ bool run_report(const ReportDefinition& report, const ReportInput& input, core::
     const double text_size = layout.text_size * options.text_percent / 100;
     pages::Flow flow(spool, page_of(report, input), pages::TypeScale::around({.size = text_size}));
     if (layout.decorated)
-        decorate(flow, options.title.isEmpty() ? QString::fromUtf8(layout.title) : options.title, input);
+        decorate(flow, options.title.isEmpty() ? QString::fromUtf8(layout.title) : options.title, input,
+                 {.header = {}, .footer = {}, .layout = QString::fromUtf8(report.leaf)});
     if (!report.write(input, report.layout, progress, flow))
         return false;
     flow.finish();

@@ -1,6 +1,7 @@
 #include "output/decoration.h"
 
 #include "pages/table.h"
+#include "pages/text_layout.h"
 
 #include <QStringList>
 
@@ -17,6 +18,7 @@ constexpr qreal thin_line = 0.75;
 constexpr qreal thick_line = 2;
 constexpr qreal above_filters = 2;
 constexpr qreal below_header = 8;
+constexpr std::size_t filter_lines = 3; ///< At most.
 
 /// A vision statement as the church prints it.
 struct Statement
@@ -36,7 +38,7 @@ struct Header
 
 struct Footer
 {
-    QString title;
+    QString name; ///< Of the layout.
     Statement vision;
     qreal line = 0; ///< Above everything; 0 for none.
 };
@@ -61,7 +63,27 @@ Statement statement(const core::Settings& settings, const QString& text, const p
     return {text, style, alignment_of(settings.vision_alignment)};
 }
 
-Header header_of(const ReportInput& input, const QString& title, const pages::TypeScale& type,
+/// The words of the text that the lines of a page's head hold, with an ellipsis where there are more.
+QString limited(const QString& text, pages::Flow& flow)
+{
+    const auto fits = [&](const QString& words) {
+        const pages::Run run{words, flow.type().small};
+        return pages::lay_out(std::span(&run, 1), {}, flow.setup().body_width(), flow.metrics()).size() <= filter_lines;
+    };
+    if (fits(text))
+        return text;
+    const auto shortened = [&](qsizetype length) {
+        return text.first(std::max(text.lastIndexOf(u' ', length), qsizetype(0))) + u" \u2026"_s;
+    };
+    qsizetype held = 0, too_long = text.size();
+    while (too_long - held > 1) {
+        const auto middle = (held + too_long) / 2;
+        (fits(shortened(middle)) ? held : too_long) = middle;
+    }
+    return shortened(held);
+}
+
+Header header_of(const ReportInput& input, const QString& title, pages::Flow& flow,
                  const std::optional<pages::Picture>& logo)
 {
     const auto& office = input.office;
@@ -76,23 +98,23 @@ Header header_of(const ReportInput& input, const QString& title, const pages::Ty
     if (parts.date)
         header.date = u"Report Date - "_s + core::Date::from(office.clock.today()).shown(office.day_order());
     if (parts.filters && !input.list.criteria.isEmpty())
-        header.filters = u"Filters in Use = "_s + input.list.criteria;
+        header.filters = limited(u"Filters in Use = "_s + input.list.criteria, flow);
     if (settings.Include_vision_reports)
-        header.vision =
-            statement(settings, settings.church_vision.isEmpty() ? settings.vision : settings.church_vision, type.body);
+        header.vision = statement(settings, settings.church_vision.isEmpty() ? settings.vision : settings.church_vision,
+                                  flow.type().body);
     if (settings.vision_line || settings.vision_thick_line)
         header.vision.line = settings.vision_thick_line ? thick_line : thin_line;
     return header;
 }
 
-Footer footer_of(const ReportInput& input, const QString& title, const pages::TypeScale& type)
+Footer footer_of(const ReportInput& input, const QString& name, const pages::TypeScale& type)
 {
     const auto& settings = input.office.settings;
     QStringList lines;
     if (settings.include_vision_footer)
         lines = {settings.footer_vision, settings.footer_vision_line2};
     lines.removeAll(QString());
-    return {title, statement(settings, lines.join(u'\n'), type.small), settings.footer_line ? thin_line : 0};
+    return {name, statement(settings, lines.join(u'\n'), type.small), settings.footer_line ? thin_line : 0};
 }
 
 void write_title(pages::Writer& place, const Header& header)
@@ -156,7 +178,7 @@ void write_footer(pages::Writer& band, const Footer& footer, int number)
     if (footer.line > 0)
         band.rule({.thickness = footer.line, .colour = pages::ink::black, .before = 0, .after = 3});
     write_vision(band, footer.vision);
-    band.spread(footer.title, {}, u"Page: %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
+    band.spread(footer.name, {}, u"Page: %1 of "_s.arg(number) + pages::page_total_mark, band.type().small);
 }
 
 } // namespace
@@ -164,12 +186,13 @@ void write_footer(pages::Writer& band, const Footer& footer, int number)
 void decorate(pages::Flow& flow, const QString& title, const ReportInput& input, const OwnBands& own)
 {
     flow.set_header(
-        [header = header_of(input, title, flow.type(), own.logo), own = own.header](pages::Writer& band, int number) {
+        [header = header_of(input, title, flow, own.logo), own = own.header](pages::Writer& band, int number) {
             write_header(band, header);
             if (own)
                 own(band, number);
         });
-    flow.set_footer([footer = footer_of(input, title, flow.type()), own = own.footer](pages::Writer& band, int number) {
+    const auto footer = footer_of(input, own.layout.isEmpty() ? title : own.layout, flow.type());
+    flow.set_footer([footer, own = own.footer](pages::Writer& band, int number) {
         if (own)
             own(band, number);
         write_footer(band, footer, number);

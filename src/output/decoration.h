@@ -13,6 +13,7 @@ struct OwnBands
 {
     pages::BandWriter header, footer;
     std::optional<pages::Picture> logo = {}; ///< The office's, read already.
+    QString layout = {};                     ///< Its name, which the footer tells; empty for the title.
 };
 
 /// Gives every page of the flow its header and footer, as the church or the run has set them up: title, church and

@@ -74,6 +74,25 @@ const AddressFields& fields_of(people::SuburbType type)
     return type == people::SuburbType::postal ? postal : residential;
 }
 
+const people::Suburb* suburb_of(const people::DisclosedFamily& family, people::SuburbType type)
+{
+    return type == people::SuburbType::postal ? family.postal() : family.residential();
+}
+
+QStringList lines_of(const people::DisclosedFamily& family, people::SuburbType type, const QString& suburb)
+{
+    const auto& address = family.address();
+    const auto& fields = fields_of(type);
+    QStringList lines{address.*fields.street, address.*fields.street2, suburb, address.*fields.country};
+    lines.removeAll(QString());
+    return lines;
+}
+
+QStringList envelope_lines(const people::DisclosedFamily& family, people::SuburbType type)
+{
+    return has_address(family, type) ? lines_of(family, type, mailing_suburb_line(family, type)) : QStringList();
+}
+
 } // namespace
 
 QString joined(QStringView separator, std::initializer_list<QString> parts)
@@ -103,31 +122,39 @@ QString addressee_of(const ListedFamily& listed)
     return joined(u" ", {names_of(listed.family, addressed, u" & "), listed.family.family().surname});
 }
 
-QString suburb_line(const people::DisclosedFamily& family, people::SuburbType type)
+bool has_address(const people::DisclosedFamily& family, people::SuburbType type)
 {
     const auto& address = family.address();
     const auto& fields = fields_of(type);
-    const auto* suburb = type == people::SuburbType::postal ? family.postal() : family.residential();
-    if (suburb)
-        return joined(u" ", {suburb->suburb, address.*fields.state, suburb->shown_postcode()});
-    const auto street_known = !(address.*fields.street).isEmpty() || !(address.*fields.street2).isEmpty();
-    return joined(u" ", {street_known ? u"Unknown Suburb"_s : QString(), address.*fields.state});
+    return suburb_of(family, type) || !(address.*fields.street).isEmpty() || !(address.*fields.street2).isEmpty();
+}
+
+QString residential_suburb_line(const people::DisclosedFamily& family)
+{
+    const auto& address = family.address();
+    if (family.residential() || address.res_hidden)
+        return mailing_suburb_line(family, people::SuburbType::residential);
+    return joined(u" ", {u"Unknown Suburb"_s, address.res_state});
+}
+
+QString mailing_suburb_line(const people::DisclosedFamily& family, people::SuburbType type)
+{
+    const auto& state = family.address().*fields_of(type).state;
+    const auto* suburb = suburb_of(family, type);
+    return suburb ? joined(u" ", {suburb->suburb, state, suburb->shown_postcode()}) : state;
 }
 
 QStringList address_lines(const people::DisclosedFamily& family, people::SuburbType type)
 {
-    const auto& address = family.address();
-    const auto& fields = fields_of(type);
-    QStringList lines{address.*fields.street, address.*fields.street2, suburb_line(family, type),
-                      address.*fields.country};
-    lines.removeAll(QString());
-    return lines;
+    if (type == people::SuburbType::residential)
+        return lines_of(family, type, residential_suburb_line(family));
+    return envelope_lines(family, type);
 }
 
 QStringList mailing_lines(const people::DisclosedFamily& family)
 {
-    const auto lines = address_lines(family, people::SuburbType::postal);
-    return lines.isEmpty() ? address_lines(family, people::SuburbType::residential) : lines;
+    const bool by_post = has_address(family, people::SuburbType::postal);
+    return envelope_lines(family, by_post ? people::SuburbType::postal : people::SuburbType::residential);
 }
 
 QString shown(const people::DisclosedFamily& family, const std::optional<core::Date>& date)

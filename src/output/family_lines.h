@@ -17,13 +17,18 @@ namespace kindrel::output {
 /// "Ann & Ben Naismith" of the adults; of a family without adults on the list its children.
 [[nodiscard]] QString addressee_of(const ListedFamily& listed);
 
-/// Streets, the suburb with state and postcode, country. A street whose suburb is not known says so; an address that is
-/// hidden or not there has no lines.
+/// Whether post could go there: a street or a suburb stands in it. A state or a country alone is no address.
+[[nodiscard]] bool has_address(const people::DisclosedFamily& family, people::SuburbType type);
+/// Streets, the suburb with state and postcode, country. Where a family lives always has a suburb, be it an unknown
+/// one, unless it is hidden; a postal address that is hidden or not there has no lines.
 [[nodiscard]] QStringList address_lines(const people::DisclosedFamily& family, people::SuburbType type);
-/// The address that post goes to: the postal one, or the residential one when there is no other.
+/// The address that post goes to: the postal one, or the residential one when there is no other; without unknown
+/// suburbs.
 [[nodiscard]] QStringList mailing_lines(const people::DisclosedFamily& family);
-/// Suburb, state and postcode on one line.
-[[nodiscard]] QString suburb_line(const people::DisclosedFamily& family, people::SuburbType type);
+/// Suburb, state and postcode of where the family lives on one line; says when the suburb is not known.
+[[nodiscard]] QString residential_suburb_line(const people::DisclosedFamily& family);
+/// The same of either address as it stands on an envelope.
+[[nodiscard]] QString mailing_suburb_line(const people::DisclosedFamily& family, people::SuburbType type);
 
 /// "12/05/1960", "12/05/XXXX" for an unknown year, empty without a date.
 [[nodiscard]] QString shown(const people::DisclosedFamily& family, const std::optional<core::Date>& date);

@@ -43,12 +43,17 @@ struct ListedMember
     const people::Person& person;
 
     [[nodiscard]] QString name() const { return family.name(person); }
-    [[nodiscard]] const QString& surname() const { return family.family().surname; }
+    /// Their own where it differs from the family's and is not hidden.
+    [[nodiscard]] const QString& surname() const
+    {
+        return person.other_surname.isEmpty() ? family.family().surname : person.other_surname;
+    }
     /// "Naismith, Ann".
     [[nodiscard]] QString listed_name() const;
 };
 
-/// Reads the working list's people in its order, one by one, whatever their families.
+/// Reads the working list's people in its order, one by one, whatever their families; their details always, which hold
+/// the names that they are listed under.
 [[nodiscard]] bool for_each_person(const ReportInput& input, core::Progress& progress,
                                    const std::function<void(const ListedMember&)>& write, people::Extent extent);
 

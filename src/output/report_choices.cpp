@@ -3,6 +3,7 @@
 #include "core/files.h"
 #include "output/custom/custom_reports.h"
 #include "output/custom/custom_run.h"
+#include "output/labels/labels.h"
 #include "output/letters/letter_run.h"
 
 #include <QFileInfo>
@@ -38,7 +39,8 @@ void add_catalogue(std::vector<ReportChoice>& choices)
                            [&report](const core::Office& office) {
                                return office.may(report.area) && (!report.also || office.may(*report.also)) &&
                                       (!report.printable || report.printable(office));
-                           }});
+                           },
+                           label_drawing(report)});
 }
 
 /// The report's layout when it can be run; says nothing.

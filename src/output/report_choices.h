@@ -13,15 +13,17 @@ namespace kindrel::output {
 /// the folders of custom and plug-in layouts and letters. Leaves of one family follow each other.
 struct ReportChoice
 {
+    using Write = std::function<bool(const ReportInput&, core::Progress&, pages::PageSpool&)>;
+
     QString key; ///< The same as long as its file keeps its name.
     QString family, leaf, description;
     /// As run_report().
-    std::function<bool(const ReportInput&, core::Progress&, pages::PageSpool&)> run;
+    Write run;
     /// Whether nothing stands in the way of a run: it would say nothing.
     std::function<bool(const core::Office&)> ready;
     /// The pages alone, without the locks and the boxes of a run: false where something stands in its way. Empty where
     /// a run that is ready has neither.
-    std::function<bool(const ReportInput&, core::Progress&, pages::PageSpool&)> draw = {};
+    Write draw = {};
     QString printed = {}; ///< Said when it has been printed; empty: nothing of its own.
 };
 
@@ -32,7 +34,7 @@ inline constexpr std::array own_families{"Custom Reports", "Custom Letters"};
 [[nodiscard]] std::vector<ReportChoice> report_choices(const core::Office& office);
 
 /// Writes the first page of the report over the beginning of the list, for a picture of its layout. Nullopt when there
-/// is nothing to show. Throws core::DatabaseError and core::FileError.
+/// is nothing to show; it never says anything. Throws core::DatabaseError and core::FileError.
 [[nodiscard]] std::optional<pages::Page> first_page(const ReportChoice& report, const ReportInput& input);
 
 } // namespace kindrel::output

@@ -19,6 +19,7 @@ constexpr qreal label_share = 0.3; ///< Of the width, for the labels of a side.
 constexpr qreal least_radius = 8;
 constexpr qreal leader = 9; ///< From the rim to where a label's line turns level.
 constexpr qreal beside_leader = 4;
+constexpr qreal label_slack = 0.5; ///< What name and figure may be wider together than one by one.
 constexpr qreal line_spacing = 1.25;
 constexpr int points_in_round = 180;
 constexpr QRgb leader_ink = 0xff8a8f94;
@@ -120,8 +121,8 @@ Outline sector(const Round& round, double from, double to)
 
 struct Label
 {
-    QString text;
-    double middle = 0; ///< Of the slice, as a part of the turn.
+    QString name, figure; ///< One behind the other; where there is no room for both the name is shortened.
+    double middle = 0;    ///< Of the slice, as a part of the turn.
     qreal y = 0;
 };
 
@@ -152,14 +153,16 @@ void draw_label(ChartCanvas& canvas, const Label& label, const Round& round, con
     canvas.line(turn, start, 0.5, leader_ink);
     const auto middle = canvas.metrics().ascent(canvas.label_style()) * 0.36;
     const auto text_at = start + QPointF(right ? 2 : -2, middle);
-    canvas.text(label.text, canvas.label_style(), text_at, right ? Align::left : Align::right,
-                right ? room.right() - text_at.x() : text_at.x() - room.left());
+    const auto wide = right ? room.right() - text_at.x() : text_at.x() - room.left();
+    const auto name = canvas.metrics().elided(label.name, canvas.label_style(),
+                                              wide - canvas.label_width(label.figure) - label_slack);
+    canvas.text(name + label.figure, canvas.label_style(), text_at, right ? Align::left : Align::right, wide);
 }
 
-QString label_of(const ChartData& data, const Slice& slice, double total)
+/// As it stands behind the slice's name.
+QString figure_of(const ChartData& data, const Slice& slice, double total)
 {
-    return u"%1: %2 (%3%)"_s.arg(slice.name, shown_value(data, slice.value),
-                                 QString::number(slice.value / total * 100, 'f', 1));
+    return u": %1 (%2%)"_s.arg(shown_value(data, slice.value), QString::number(slice.value / total * 100, 'f', 1));
 }
 
 /// The last slice lies beside the first and must not look like it.
@@ -180,7 +183,8 @@ void draw_slices(ChartCanvas& canvas, const ChartData& data, const Slices& slice
         const auto to = i + 1 == slices.shown.size() ? 1.0 : from + slice.value / total;
         canvas.face(sector(round, from, to), slice_look(i, slices.shown.size()));
         const auto middle = slices.shown.size() == 1 ? 0.25 : (from + to) / 2;
-        (middle < 0.5 ? right : left).push_back({label_of(data, slice, total), middle, round.rim(middle, leader).y()});
+        (middle < 0.5 ? right : left)
+            .push_back({slice.name, figure_of(data, slice, total), middle, round.rim(middle, leader).y()});
         from = to;
     }
     for (auto* labels : {&left, &right}) {

@@ -10,6 +10,10 @@ namespace {
 constexpr qreal band_distance = 8; ///< Between header or footer and the columns.
 constexpr qreal tolerance = 0.01;
 
+// Of the page's height between its margins.
+constexpr qreal most_of_header = 0.5;
+constexpr qreal least_of_columns = 0.125;
+
 /// Of the blocks without the spaces at their end, which may run off the column.
 qreal height_needed(std::span<const Block> group)
 {
@@ -19,6 +23,16 @@ qreal height_needed(std::span<const Block> group)
     for (const auto& block : group)
         height += block.height;
     return height;
+}
+
+/// A header that is too high loses its end, and a footer its beginning, so that something of the report always stands
+/// between them.
+void cut_to_room(Blocks& head, Blocks& foot, qreal room)
+{
+    while (height_of(head) > room * most_of_header)
+        head.pop_back();
+    while (!foot.empty() && height_of(head) + height_of(foot) + 2 * band_distance > room * (1 - least_of_columns))
+        foot.erase(foot.begin());
 }
 
 } // namespace
@@ -217,14 +231,16 @@ void Composer::begin_page()
         return;
     ++m_number;
     m_page = Page{.number = m_number, .size = m_setup.size()};
-    const auto head = band(m_header), foot = band(m_footer);
-    m_top = m_setup.margins.top() + (head.empty() ? 0 : height_of(head) + band_distance);
-    const auto foot_top = m_page->size.height() - m_setup.margins.bottom() - height_of(foot);
+    const auto& margins = m_setup.margins;
+    auto head = band(m_header), foot = band(m_footer);
+    cut_to_room(head, foot, m_page->size.height() - margins.top() - margins.bottom());
+    m_top = margins.top() + (head.empty() ? 0 : height_of(head) + band_distance);
+    const auto foot_top = m_page->size.height() - margins.bottom() - height_of(foot);
     m_bottom = foot_top - (foot.empty() ? 0 : band_distance);
     m_y = m_top;
     m_column = 0;
     m_column_empty = true;
-    draw_band(head, m_setup.margins.top());
+    draw_band(head, margins.top());
     draw_band(foot, foot_top);
 }
 

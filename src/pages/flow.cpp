@@ -11,7 +11,8 @@ namespace {
 
 constexpr qreal band_padding = 4;
 
-/// The bare capital letter a key begins with, "#" for anything but a letter.
+} // namespace
+
 QString filing_letter(const QString& key)
 {
     for (const QChar c : key.trimmed().normalized(QString::NormalizationForm_KD)) {
@@ -20,8 +21,6 @@ QString filing_letter(const QString& key)
     }
     return u"#"_s;
 }
-
-} // namespace
 
 Flow::Flow(PageSpool& spool, const PageSetup& setup, const TypeScale& type)
     : Writer(std::make_shared<TextMetrics>(), type, setup.column_width()),

@@ -14,6 +14,9 @@ class Composer;
 /// Writes what stands at the head or foot of page `number`. The number of pages is page_total_mark.
 using BandWriter = std::function<void(Writer& band, int number)>;
 
+/// The bare capital letter under which a key is filed; "#" for what does not begin with a letter.
+[[nodiscard]] QString filing_letter(const QString& key);
+
 /// What a report writes into: content runs down the columns and on to the next page, and each finished page goes to
 /// the spool at once. Set header and footer before the first content; set anew, they hold from the next page on.
 class Flow final : public Writer
@@ -26,8 +29,7 @@ public:
     void set_footer(BandWriter write);
     [[nodiscard]] const PageSetup& setup() const;
 
-    /// A band with the letter under which `key` is filed, when it differs from the last one's. Case and accents do not
-    /// count; what does not begin with a letter is filed under "#".
+    /// A band with the letter under which `key` is filed, when it differs from the last one's.
     void separator(const QString& key);
     void next_column();
     void next_page();

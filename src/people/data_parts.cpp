@@ -40,6 +40,12 @@ constexpr DataPart suburb(const char* name, const char* only, const char* hidden
 
 constexpr std::array parts{
     detail("Title", "Title", "d.[Title_hidden]"),
+    DataPart{.name = "Birth Date",
+             .owner = DataOwner::person,
+             .table = details,
+             .columns = {{{"birthdate", DataForm::date}}},
+             .hidden = "d.[birthdate_hidden]",
+             .right = Area::birth_dates},
     DataPart{.name = "Preferred Given Name",
              .owner = DataOwner::person,
              .table = "tbl_people",
@@ -47,12 +53,6 @@ constexpr std::array parts{
              .hidden = "p.[Preferred_Name_hidden]"},
     detail("Middle Name", "middle_name", "d.[middle_hidden]"),
     detail("Other Surname", "other_surname", "d.[surname_hidden]"),
-    DataPart{.name = "Birth Date",
-             .owner = DataOwner::person,
-             .table = details,
-             .columns = {{{"birthdate", DataForm::date}}},
-             .hidden = "d.[birthdate_hidden]",
-             .right = Area::birth_dates},
     DataPart{.name = "School Year",
              .owner = DataOwner::person,
              .table = details,
@@ -164,8 +164,8 @@ constexpr std::array parts{
              .table = "tbl_surname",
              .columns = {{{"booked_out_person"}, {"booked_out_date", DataForm::date}}},
              .only = "v.[booked_out]<>0"},
-    files("Family Portraits", DataOwner::family, DataFiles::portraits),
     files("Family Notes", DataOwner::family, DataFiles::notebook, Area::family_file_notebook),
+    files("Family Portraits", DataOwner::family, DataFiles::portraits),
 };
 
 } // namespace

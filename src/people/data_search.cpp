@@ -20,7 +20,22 @@ namespace {
 using core::Column;
 
 /// What stands before a part's own columns.
-enum Fixed { key_of_family, key_of_person, surname, condition, given, preferred, preferred_hidden, hidden, first_own };
+enum Fixed {
+    key_of_family,
+    key_of_person,
+    surname,
+    condition,
+    given,
+    preferred,
+    preferred_hidden,
+    deceased,
+    archived,
+    privacy,
+    prospect,
+    contact,
+    hidden,
+    first_own
+};
 
 QString latin(const char* text)
 {
@@ -86,6 +101,11 @@ QString statement_of(const DataPart& part, const QString& table)
                             u"p.[Name]"_s,
                             u"p.[preferred_name]"_s,
                             u"p.[Preferred_Name_hidden]"_s,
+                            u"p.[Decease]"_s,
+                            u"p.[archive]"_s,
+                            u"p.[Privacy]"_s,
+                            u"p.[Prospect]"_s,
+                            u"p.[contact]"_s,
                             part.hidden ? latin(part.hidden) : u"0"_s};
     const QString within = part.order ? u",v.[%1]"_s.arg(latin(part.order)) : QString();
     return u"SELECT %1 FROM [%2] v %3%4 ORDER BY %5%6;"_s.arg(
@@ -111,14 +131,34 @@ QString shown(const core::Row& row, const DataColumn& column, int place, core::D
     return {};
 }
 
-QString value_of(const core::Row& row, const DataPart& part, core::DayOrder order)
+/// The same as it orders: dates from the year on, numbers from the least.
+QString ordering(const core::Row& row, const DataColumn& column, int place, core::DayOrder order)
 {
-    QStringList texts;
-    for (int place = first_own; const DataColumn& column : part.columns)
-        if (column.name)
-            texts += shown(row, column, place++, order);
+    constexpr int least = -1000;
+    if (column.form == DataForm::date)
+        return row.text(Column{place});
+    if (column.form == DataForm::number)
+        return u"%1"_s.arg(row.integer(Column{place}) - least, 10, 10, QChar(u'0'));
+    return shown(row, column, place, order);
+}
+
+struct Value
+{
+    QString shown, order;
+};
+
+Value value_of(const core::Row& row, const DataPart& part, core::DayOrder order)
+{
+    QStringList texts, keys;
+    for (int place = first_own; const DataColumn& column : part.columns) {
+        if (!column.name)
+            continue;
+        texts += shown(row, column, place, order);
+        keys += ordering(row, column, place, order);
+        ++place;
+    }
     texts.removeAll(QString());
-    return texts.join(QString::fromUtf8(part.joint));
+    return {texts.join(QString::fromUtf8(part.joint)), keys.join(u' ')};
 }
 
 DataEntry entry_of(const core::Row& row, bool use_preferred_names)
@@ -127,15 +167,25 @@ DataEntry entry_of(const core::Row& row, bool use_preferred_names)
     person.Name = row.text(Column{given});
     person.preferred_name = row.text(Column{preferred});
     person.Preferred_Name_hidden = row.flag(Column{preferred_hidden});
+    person.Decease = row.flag(Column{deceased});
+    person.archive = row.flag(Column{archived});
+    person.Privacy = row.flag(Column{privacy});
+    person.Prospect = row.flag(Column{prospect});
+    person.contact = row.flag(Column{contact});
     return {.member = {row.integer(Column{key_of_person}), row.integer(Column{key_of_family})},
             .surname = row.text(Column{surname}),
-            .name = display_name(person, use_preferred_names),
+            .name = display_name(person, use_preferred_names) + markers(person, Markers::full),
+            .deceased = person.Decease,
+            .archived = person.archive,
+            .privacy = person.Privacy,
+            .prospect = person.Prospect,
+            .contact = person.contact,
             .Condition = FileStatus(row.integer(Column{condition})),
             .hidden = row.flag(Column{hidden})};
 }
 
 /// The days on which the files of a folder were last changed, by the keys in their names.
-using FileDays = QHash<int, QString>;
+using FileDays = QHash<int, core::Date>;
 
 FileDays file_days(const core::Office& office, const DataPart& part)
 {
@@ -149,8 +199,7 @@ FileDays file_days(const core::Office& office, const DataPart& part)
     for (QDirIterator file(folder, QDir::Files); file.hasNext();) {
         file.next();
         if (const auto match = name.match(file.fileName()); match.hasMatch())
-            days.insert(match.captured(1).toInt(),
-                        core::Date::from(file.fileInfo().lastModified().date()).shown(office.day_order()));
+            days.insert(match.captured(1).toInt(), core::Date::from(file.fileInfo().lastModified().date()));
     }
     return days;
 }
@@ -179,17 +228,21 @@ bool is_same(const Member& one, const Member& other)
 }
 
 std::vector<DataEntry> read_entries(core::Office& office, const QString& statement,
-                                    const std::function<QString(const core::Row&)>& value)
+                                    const std::function<Value(const core::Row&)>& value)
 {
     std::vector<DataEntry> entries;
     auto rows = office.session->select(statement);
     for (const core::Row& row : rows) {
         DataEntry entry = entry_of(row, office.settings.use_preferred_names);
-        entry.value = value(row);
-        if (!entries.empty() && is_same(entries.back().member, entry.member))
-            entries.back().value += u"; "_s + entry.value;
-        else
+        const Value read = value(row);
+        if (entries.empty() || !is_same(entries.back().member, entry.member)) {
+            entry.value = read.shown;
+            entry.order = read.order;
             entries.push_back(std::move(entry));
+        } else {
+            entries.back().value += u"; "_s + read.shown;
+            entries.back().order += u' ' + read.order;
+        }
     }
     return entries;
 }
@@ -206,23 +259,16 @@ std::optional<std::vector<DataEntry>> people_with(core::Office& office, const Da
     const FileDays days = file_days(office, part);
     lend_keys(*office.session, days, part);
     const Column key{part.owner == DataOwner::person ? key_of_person : key_of_family};
-    return read_entries(office, statement_of(part, latin(source_of(part).files_table)),
-                        [&](const core::Row& row) { return days.value(row.integer(key)); });
+    return read_entries(office, statement_of(part, latin(source_of(part).files_table)), [&](const core::Row& row) {
+        const core::Date day = days.value(row.integer(key));
+        return Value{day.shown(office.day_order()), day.stored()};
+    });
 }
 
 QString heading_of(const DataPart& part)
 {
     return (part.owner == DataOwner::person ? u"People with an entry in %1"_s : u"Families with an entry in %1"_s)
         .arg(latin(part.name));
-}
-
-WorkingList working_list(const DataPart& part, const std::vector<DataEntry>& entries)
-{
-    WorkingList list{{}, heading_of(part)};
-    for (const DataEntry& entry : entries)
-        if (entry.member.person_id != 0)
-            list.members.push_back(entry.member);
-    return list;
 }
 
 } // namespace kindrel::people

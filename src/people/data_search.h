@@ -12,9 +12,11 @@ struct DataEntry
 {
     Member member;
     QString surname = {};
-    QString name = {};                         ///< As listed; empty for a family without people.
+    QString name = {}; ///< As listed, with the markers; empty for a family without people.
+    bool deceased = false, archived = false, privacy = false, prospect = false, contact = false;
     FileStatus Condition = FileStatus::active; ///< Of the family's file.
     QString value = {};                        ///< Several are parted by "; ".
+    QString order = {};                        ///< The value with its dates and numbers as they order.
     bool hidden = false;                       ///< The value is unlisted: nothing for paper or files.
 };
 
@@ -23,7 +25,5 @@ struct DataEntry
 [[nodiscard]] std::optional<std::vector<DataEntry>> people_with(core::Office& office, const DataPart& part);
 /// What the list of a part is called: "People with an entry in Birth Date".
 [[nodiscard]] QString heading_of(const DataPart& part);
-/// The people found, each once.
-[[nodiscard]] WorkingList working_list(const DataPart& part, const std::vector<DataEntry>& entries);
 
 } // namespace kindrel::people

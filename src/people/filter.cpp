@@ -53,6 +53,11 @@ constexpr std::array types{
     FamilyTypeRow{FamilyType::deceased_child, u"Adults with Deceased Child", bereft_of_a_child},
 };
 
+bool asks_for(const Filter& filter, DateSource source)
+{
+    return std::ranges::find(filter.dates, source, &DateCriterion::source) != filter.dates.end();
+}
+
 } // namespace
 
 std::span<const FilterKindRow> filter_kinds()
@@ -82,9 +87,12 @@ const FamilyTypeRow& family_type(FamilyType type)
 
 bool asks_for_birth_dates(const Filter& filter)
 {
-    return filter.ages || std::ranges::any_of(filter.dates, [](const DateCriterion& criterion) {
-               return criterion.source == DateSource::birth_date;
-           });
+    return filter.ages || asks_for(filter, DateSource::birth_date);
+}
+
+bool asks_for_visits(const Filter& filter)
+{
+    return asks_for(filter, DateSource::visits);
 }
 
 } // namespace kindrel::people

@@ -159,6 +159,8 @@ struct Filter
 
 /// Whether it could tell a birth date to somebody who may not see one: by age or by the date itself.
 [[nodiscard]] bool asks_for_birth_dates(const Filter& filter);
+/// Whether it could tell a visit to somebody who may not see one.
+[[nodiscard]] bool asks_for_visits(const Filter& filter);
 
 /// What is said of a filter without a family list.
 inline constexpr QStringView no_families_chosen =

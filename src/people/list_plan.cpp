@@ -82,11 +82,12 @@ QString range_words(const ListRange& range)
     return parts.join(u", "_s);
 }
 
-std::vector<ListedPerson> within(const ListRange& range, std::vector<ListedPerson> people)
+std::vector<ListedPerson> within(const ListRange& range, SortBy by, std::vector<ListedPerson> people)
 {
+    const auto key = by == SortBy::individual ? &ListedPerson::own_sort_key : &ListedPerson::sort_key;
     const QString first = sort_key(range.first_letter), last = sort_key(range.last_letter);
     std::erase_if(people, [&](const ListedPerson& person) {
-        return person.sort_key < first || (!last.isEmpty() && person.sort_key.left(last.size()) > last);
+        return person.*key < first || (!last.isEmpty() && (person.*key).left(last.size()) > last);
     });
     const auto size = static_cast<int>(people.size());
     const int begin = std::clamp(range.first.value_or(1) - 1, 0, size);
@@ -105,7 +106,7 @@ MadeList make_list(core::Office& office, const ListPlan& plan)
     MadeList made;
     made.people = listed_people(session, found, preferred);
     std::erase_if(made.people, [&](const ListedPerson& person) { return struck.contains(person.member.person_id); });
-    made.people = within(plan.range, std::move(made.people));
+    made.people = within(plan.range, plan.sort.by, std::move(made.people));
     const auto left_out = lacking(members_of(made.people), plan.added);
     if (!left_out.members.empty())
         std::ranges::move(listed_people(session, left_out, preferred), std::back_inserter(made.people));

@@ -19,7 +19,8 @@ struct ListRange
 
 /// "surnames from A to M, people 1 to 100"; empty for a whole list.
 [[nodiscard]] QString range_words(const ListRange& range);
-[[nodiscard]] std::vector<ListedPerson> within(const ListRange& range, std::vector<ListedPerson> people);
+/// Letters are those of the surname by which the order goes: a person's own in the order of individuals.
+[[nodiscard]] std::vector<ListedPerson> within(const ListRange& range, SortBy by, std::vector<ListedPerson> people);
 
 /// What a working list is made from, step by step.
 struct ListPlan

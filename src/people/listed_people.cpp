@@ -13,8 +13,10 @@ namespace {
 
 constexpr auto columns =
     u"p.[person_id],p.[Surname_ID],p.[Name],p.[preferred_name],p.[Preferred_Name_hidden],p.[Decease],p.[archive],"
-    "p.[Privacy],p.[Prospect],p.[contact],f.[surname],f.[sort_key],f.[booked_out]";
-constexpr auto family_of_person = u" JOIN [tbl_surname] f ON f.[Surname_ID]=p.[Surname_ID] ";
+    "p.[Privacy],p.[Prospect],p.[contact],f.[surname],f.[sort_key],f.[booked_out],p.[sort_key],d.[other_surname],"
+    "d.[surname_hidden]";
+constexpr auto around_person = u" JOIN [tbl_surname] f ON f.[Surname_ID]=p.[Surname_ID] "
+                               "LEFT JOIN [tbl_personal_details] d ON d.[person_id]=p.[person_id] ";
 
 Person person_of(const core::Row& row)
 {
@@ -27,6 +29,8 @@ Person person_of(const core::Row& row)
     person.Privacy = row.flag(Column{7});
     person.Prospect = row.flag(Column{8});
     person.contact = row.flag(Column{9});
+    person.other_surname = row.text(Column{14});
+    person.surname_hidden = row.flag(Column{15});
     return person;
 }
 
@@ -36,9 +40,10 @@ std::vector<ListedPerson> read(core::Rows rows, bool use_preferred_names)
     for (const core::Row& row : rows) {
         const Person person = person_of(row);
         found.push_back({.member = {row.integer(Column{0}), row.integer(Column{1})},
-                         .name = display_name(person, use_preferred_names) + markers(person, Markers::full),
+                         .name = listed_name(person, row.text(Column{10}), use_preferred_names),
                          .surname = row.text(Column{10}),
                          .sort_key = row.text(Column{11}),
+                         .own_sort_key = row.text(Column{13}),
                          .deceased = person.Decease,
                          .archived = person.archive,
                          .privacy = person.Privacy,
@@ -94,20 +99,27 @@ QString condition(bool Needs::*need)
 
 } // namespace
 
+QString listed_name(const Person& person, const QString& surname, bool use_preferred_names)
+{
+    QString name = display_name(person, use_preferred_names);
+    if (!person.surname_hidden && !person.other_surname.isEmpty() && person.other_surname != surname)
+        name += u' ' + person.other_surname;
+    return name + markers(person, Markers::full);
+}
+
 std::vector<ListedPerson> listed_people(core::Session& session, const WorkingList& list, bool use_preferred_names)
 {
     lend(session, list);
     return read(session.select(u"SELECT %1 FROM [work_people] w JOIN [tbl_people] p ON p.[person_id]=w.[person_id]%2"
-                               "ORDER BY w.[place];"_s.arg(QStringView(columns), QStringView(family_of_person))),
+                               "ORDER BY w.[place];"_s.arg(QStringView(columns), QStringView(around_person))),
                 use_preferred_names);
 }
 
 std::vector<ListedPerson> everybody(core::Session& session, bool use_preferred_names)
 {
-    return read(
-        session.select(u"SELECT %1 FROM [tbl_people] p%2ORDER BY f.[sort_key],f.[Primary_name],f.[Surname_ID],"
-                       "p.[position],p.[person_id];"_s.arg(QStringView(columns), QStringView(family_of_person))),
-        use_preferred_names);
+    return read(session.select(u"SELECT %1 FROM [tbl_people] p%2ORDER BY f.[sort_key],f.[Primary_name],f.[Surname_ID],"
+                               "p.[position],p.[person_id];"_s.arg(QStringView(columns), QStringView(around_person))),
+                use_preferred_names);
 }
 
 WorkingList having(core::Session& session, const WorkingList& list, const Needs& needs)

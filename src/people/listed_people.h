@@ -1,5 +1,6 @@
 #pragma once
 
+#include "people/records.h"
 #include "people/working_list.h"
 
 namespace kindrel::people {
@@ -8,12 +9,17 @@ namespace kindrel::people {
 struct ListedPerson
 {
     Member member;
-    QString name; ///< As the church lists people, with the markers.
-    QString surname;
-    QString sort_key; ///< Of the family.
+    QString name;         ///< As of listed_name().
+    QString surname;      ///< Of the family.
+    QString sort_key;     ///< Of that surname.
+    QString own_sort_key; ///< Of the surname under which the person sorts: the own one unless it is hidden.
     bool deceased = false, archived = false, privacy = false, prospect = false, contact = false;
     bool booked_out = false; ///< The family is away.
 };
+
+/// The listed name as lists of people show it: with the own surname where it is another than the family's and not
+/// hidden, and with the markers.
+[[nodiscard]] QString listed_name(const Person& person, const QString& surname, bool use_preferred_names);
 
 /// The people of the list in its order; who is no longer in the register is passed over. One statement. Throws
 /// core::DatabaseError, as all here do.

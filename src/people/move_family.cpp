@@ -3,6 +3,7 @@
 #include "core/entry.h"
 #include "core/files.h"
 #include "core/open_church.h"
+#include "core/progress_run.h"
 #include "core/removal.h"
 #include "core/schema.h"
 #include "people/family_store.h"
@@ -138,13 +139,7 @@ bool Move::run()
     if (!is_in_the_office(parcel->file.family) || !guards_agree(parcel->file) || !not_underway_elsewhere() ||
         !free_there() || !confirmed(*parcel))
         return false;
-    struct Report
-    {
-        core::Progress& progress;
-        ~Report() { progress.end(); }
-    };
-    m_progress.begin(u"Moving the %1 family to '%2'"_s.arg(m_surname, m_name), move_steps, {});
-    const Report report{m_progress};
+    const core::ProgressRun run(m_progress, u"Moving the %1 family to '%2'"_s.arg(m_surname, m_name), move_steps, {});
     return carry();
 }
 

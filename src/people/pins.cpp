@@ -106,8 +106,6 @@ qint64 take_number(Session& session, const FamilyFile& file, const Person& askin
 {
     const auto counter = u"pin_auto_number_start"_s;
     core::Transaction transaction(session);
-    // Holds the counter's row: on a server another workstation could else read the same number before it is moved.
-    session.execute(u"UPDATE [tbl_startup] SET [%1]=[%1];"_s.arg(counter));
     const qint64 start = core::read_settings(session).pin_auto_number_start;
     const qint64 number = free_number(session, file, asking, std::max<qint64>(1, start));
     core::write_setting(session, counter, number + 1);

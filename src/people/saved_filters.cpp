@@ -15,9 +15,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-/// How often a key is drawn anew that another workstation took at the same moment.
-constexpr int most_draws = 20;
-
 bool refuse(const core::Office& office, const QString& words)
 {
     office.dialogue.show({words});
@@ -47,31 +44,21 @@ bool may_replace(const core::Office& office, const SavedFilter& saved)
     return office.dialogue.confirm(question, core::Answer::no);
 }
 
+/// The list has no counter of keys. Free for as long as the transaction that asks.
+int next_key(core::Session& session)
+{
+    auto rows = session.select(u"SELECT MAX([filter_id]) FROM [tbl_filter_memory];"_s);
+    return rows.first()->integer(core::Column{0}) + 1;
+}
+
 int insert_new(core::Session& session, const QString& name, const QString& content)
 {
     core::Transaction transaction(session);
-    const auto next = [&] {
-        auto rows = session.select(u"SELECT MAX([filter_id]) FROM [tbl_filter_memory];"_s);
-        return rows.first()->integer(core::Column{0}) + 1;
-    };
-    const int key = next();
+    const int key = next_key(session);
     session.execute(u"INSERT INTO [tbl_filter_memory] ([filter_id],[filter_name],[content]) VALUES (?,?,?);"_s, key,
                     name, content);
     transaction.commit();
     return key;
-}
-
-/// The list has no counter of keys: on a server two workstations may draw the same one.
-int insert_with_free_key(core::Session& session, const QString& name, const QString& content)
-{
-    for (int draw = 1;; ++draw) {
-        try {
-            return insert_new(session, name, content);
-        } catch (const core::DatabaseError& error) {
-            if (!error.constraint_broken() || draw == most_draws)
-                throw;
-        }
-    }
 }
 
 std::optional<QString> content_of(core::Session& session, int filter_id)
@@ -79,6 +66,12 @@ std::optional<QString> content_of(core::Session& session, int filter_id)
     auto rows = session.select(u"SELECT [content] FROM [tbl_filter_memory] WHERE [filter_id]=?;"_s, filter_id);
     const auto* row = rows.first();
     return row ? std::optional(row->text(core::Column{0})) : std::nullopt;
+}
+
+bool may_ask(const core::Office& office, const Filter& filter)
+{
+    return (!asks_for_birth_dates(filter) || core::permitted(office, core::Area::birth_dates)) &&
+           (!asks_for_visits(filter) || core::permitted(office, core::Area::visitation_tab));
 }
 
 QString words_of(FilterFault fault)
@@ -109,13 +102,13 @@ std::optional<int> save_filter(core::Office& office, const QString& name, const 
     const auto content = QString::fromUtf8(to_json(filter));
     const auto existing = named(session, tidied);
     if (!existing)
-        return insert_with_free_key(session, tidied, content);
+        return insert_new(session, tidied, content);
     if (!may_replace(office, *existing))
         return std::nullopt;
     const int touched =
         session.execute(u"UPDATE [tbl_filter_memory] SET [filter_name]=?,[content]=? WHERE [filter_id]=?;"_s, tidied,
                         content, existing->filter_id);
-    return touched > 0 ? existing->filter_id : insert_with_free_key(session, tidied, content);
+    return touched > 0 ? existing->filter_id : insert_new(session, tidied, content);
 }
 
 std::optional<Filter> load_filter(core::Office& office, int filter_id)
@@ -130,10 +123,19 @@ std::optional<Filter> load_filter(core::Office& office, int filter_id)
         office.dialogue.show({words_of(*read.fault)});
         return std::nullopt;
     }
-    if (asks_for_birth_dates(read.filter) && !core::permitted(office, core::Area::birth_dates))
+    if (!may_ask(office, read.filter))
         return std::nullopt;
     refresh_texts(*office.session, read.filter);
     return std::move(read.filter);
+}
+
+bool replace_filter(core::Office& office, int filter_id, const Filter& filter)
+{
+    if (!core::network_guard(office))
+        return false;
+    const int touched = office.session->execute(u"UPDATE [tbl_filter_memory] SET [content]=? WHERE [filter_id]=?;"_s,
+                                                QString::fromUtf8(to_json(filter)), filter_id);
+    return touched > 0 || refuse(office, u"Unable to save this filter as another user has removed it"_s);
 }
 
 bool rename_filter(core::Office& office, int filter_id, const QString& name)

@@ -20,8 +20,10 @@ struct SavedFilter
 /// saying why nothing was saved.
 [[nodiscard]] std::optional<int> save_filter(core::Office& office, const QString& name, const Filter& filter);
 /// With the texts that its items have now. Nullopt, after saying why, when it is gone, cannot be understood, or
-/// asks for birth dates that the person may not see.
+/// asks for birth dates or visits that the person may not see.
 [[nodiscard]] std::optional<Filter> load_filter(core::Office& office, int filter_id);
+/// Puts the filter in the place of the saved one, which keeps its name. False after saying why not.
+[[nodiscard]] bool replace_filter(core::Office& office, int filter_id, const Filter& filter);
 [[nodiscard]] bool rename_filter(core::Office& office, int filter_id, const QString& name);
 /// Asks first.
 [[nodiscard]] bool remove_filter(core::Office& office, const SavedFilter& filter);

@@ -249,6 +249,12 @@ bool SetupEditor::altered() const
     return std::ranges::any_of(m_lists, &List::altered);
 }
 
+void SetupEditor::drop()
+{
+    for (auto& items : m_lists)
+        items = List(items.stored());
+}
+
 bool SetupEditor::may_save() const
 {
     return core::permitted(m_office, core::Area::family_file_setup) && core::network_guard(m_office);

@@ -54,6 +54,8 @@ public:
     [[nodiscard]] std::optional<int> group_for_details(int group_index);
 
     [[nodiscard]] bool altered() const;
+    /// Back to what was read or saved last; nothing is read anew.
+    void drop();
     /// Each altered list in a transaction of its own; items that other workstations have added meanwhile are kept at
     /// the end. False, after saying why, without the right or the connection. Throws core::DatabaseError: the lists
     /// before the failing one are stored, and save() may be tried again.

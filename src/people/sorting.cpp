@@ -32,6 +32,7 @@ struct Rule
     const char16_t* label;
     const char16_t* order; ///< In front of the order of families.
     std::optional<DateSource> source = {};
+    std::optional<core::Area> right = {};
 };
 
 constexpr std::array rules{
@@ -39,8 +40,10 @@ constexpr std::array rules{
     Rule{SortBy::individual, u"Individual", u"b.[sort_key],b.[Name],"},
     Rule{SortBy::suburb, u"Suburb", u"CASE WHEN b.[suburb] IS NULL THEN 1 ELSE 0 END,b.[suburb],"},
     Rule{SortBy::postcode, u"Postcode", u"CASE WHEN b.[postcode] IS NULL THEN 1 ELSE 0 END,b.[postcode],"},
-    Rule{SortBy::birth_date, u"Birth Date", u"", DateSource{u"tbl_personal_details", u"person_id", u"birthdate"}},
-    Rule{SortBy::visitation, u"Visitation", u"", DateSource{u"tbl_visitation", u"surname_id", u"date", nullptr, true}},
+    Rule{SortBy::birth_date, u"Birth Date", u"", DateSource{u"tbl_personal_details", u"person_id", u"birthdate"},
+         core::Area::birth_dates},
+    Rule{SortBy::visitation, u"Visitation", u"", DateSource{u"tbl_visitation", u"surname_id", u"date", nullptr, true},
+         core::Area::visitation_tab},
     Rule{SortBy::family_events, u"Family Events", u"", DateSource{u"tbl_events", u"surname_id", u"event_date"}},
     Rule{SortBy::personal_date, u"Personal Date", u"",
          DateSource{u"tbl_individual_date", u"person_id", u"in_date", u"in_date_id"}},
@@ -155,6 +158,11 @@ QString search_in_words(const SortOrder& order, core::DayOrder day_order)
 QString sort_label(SortBy by)
 {
     return QString::fromUtf16(rule_of(by).label);
+}
+
+std::optional<core::Area> right_for(SortBy by)
+{
+    return rule_of(by).right;
 }
 
 bool is_by_date(SortBy by)

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "core/dialogue.h"
+#include "core/rights.h"
 #include "people/filter.h"
 #include "people/working_list.h"
 
@@ -41,6 +42,8 @@ struct SortOrder
 
 [[nodiscard]] QString sort_label(SortBy by);
 [[nodiscard]] bool is_by_date(SortBy by);
+/// What the order shows, in itself and in who answers to a search, may ask for a right; nullopt where it does not.
+[[nodiscard]] std::optional<core::Area> right_for(SortBy by);
 
 /// What is missing for the search that was chosen; nullopt when the order can be carried out.
 [[nodiscard]] std::optional<core::Message> sort_refusal(const SortOrder& order);

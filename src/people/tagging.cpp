@@ -154,6 +154,12 @@ Findings find(core::Office& office, const WorkingList& list, const TagItem& item
     return {skipped_people(office, item.kind), carriers(*office.session, item)};
 }
 
+/// Whether something is lost when the row gets other content.
+bool says_something(const LinkRow& row)
+{
+    return row.date || !row.field.isEmpty() || row.tagged;
+}
+
 /// Who gets a row, whose row gets other content, whose goes.
 BulkChange plan(core::Office& office, const WorkingList& list, const TagItem& item, TagAct act)
 {
@@ -173,6 +179,7 @@ BulkChange plan(core::Office& office, const WorkingList& list, const TagItem& it
             continue;
         }
         ++change.count.changed;
+        change.count.replaced += act == TagAct::give && carries && says_something(carried->row);
         if (carries)
             change.before.push_back(*carried);
         else
@@ -314,12 +321,20 @@ bool refuse(const core::Office& office, const QString& text)
     return false;
 }
 
-bool may_tag(core::Office& office, const std::optional<WorkingList>& list, const TagItem& item, TagAct act)
+/// Whether the people's rows may be written at all.
+bool may_write(core::Office& office)
 {
     if (!core::permitted(office, core::Area::tagging) || !core::network_guard(office))
         return false;
     if (office.may(core::Area::read_only_family_data))
         return refuse(office, u"Unable to tag people as you only have read only access within family files"_s);
+    return true;
+}
+
+bool may_tag(core::Office& office, const std::optional<WorkingList>& list, const TagItem& item, TagAct act)
+{
+    if (!may_write(office))
+        return false;
     if (!list)
         return refuse(office, u"Unable to process the tagging function until you first select people to tag"_s);
     if (item.item == 0) {
@@ -331,6 +346,8 @@ bool may_tag(core::Office& office, const std::optional<WorkingList>& list, const
     if (list->members.empty())
         return refuse(office,
                       act == TagAct::give ? u"No people exist for tagging"_s : u"No people exist for un-tagging"_s);
+    if (act == TagAct::give && item.lacks_date())
+        return refuse(office, u"Please enter the date that the people are given"_s);
     return true;
 }
 
@@ -374,7 +391,16 @@ std::vector<int> among(const std::vector<int>& people, const std::vector<int>& s
 
 QString TagCount::words() const
 {
-    QStringList parts{counted(changed, u"1 person changes"_s, u"%1 people change"_s)};
+    QStringList parts;
+    if (replaced == 0)
+        parts += counted(changed, u"1 person changes"_s, u"%1 people change"_s);
+    else if (changed > replaced)
+        parts += counted(changed - replaced, u"1 person gets it"_s, u"%1 people get it"_s);
+    if (replaced > 0) {
+        const QString who = parts.isEmpty() ? counted(replaced, u"1 person gets"_s, u"%1 people get"_s)
+                                            : counted(replaced, u"1 gets"_s, u"%1 get"_s);
+        parts += who + u" it in place of another value or mark"_s;
+    }
     if (as_it_was > 0)
         parts += counted(as_it_was, u"1 stays as it is"_s, u"%1 stay as they are"_s);
     if (booked_out > 0)
@@ -407,8 +433,10 @@ std::optional<BulkChange> tag(core::Office& office, const std::optional<WorkingL
     return change;
 }
 
-int undo_tagging(core::Office& office, const BulkChange& change)
+std::optional<int> undo_tagging(core::Office& office, const BulkChange& change)
 {
+    if (!may_write(office))
+        return std::nullopt;
     core::Session& session = *office.session;
     const LinkTable& table = table_of(change.item.kind);
     const LinkRow row = row_of(change.item);

@@ -1,7 +1,6 @@
 #include "people/text_search.h"
 
 #include "core/entry.h"
-#include "people/field_labels.h"
 
 #include <QSet>
 
@@ -15,18 +14,53 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+enum class Owner { person, family };
+
+struct Field
+{
+    const char* column;
+    QStringView words;
+    Owner owner;
+};
+
+constexpr Field given{"Name", u"given name", Owner::person};
+constexpr Field surname{"surname", u"surname", Owner::family};
+constexpr Field other_surname{"other_surname", u"other surname", Owner::person};
+constexpr Field middle{"middle_name", u"middle name", Owner::person};
+
 /// In the order in which they are looked at.
-constexpr std::array name_fields{"Name", "surname", "other_surname", "middle_name", "preferred_name"};
-constexpr std::array all_fields{
-    "Name",         "surname",        "other_surname",  "middle_name",  "phone",          "family_fax", "family_email",
-    "mobile_phone", "Personal_email", "business_phone", "business_fax", "business_email", "res_street", "res_street2",
-    "res_state",    "res_country",    "res_map",        "post_street",  "post_street2",   "post_state", "post_country"};
+constexpr std::array name_fields{given, surname, other_surname, middle,
+                                 Field{"preferred_name", u"preferred name", Owner::person}};
+constexpr std::array all_fields{given,
+                                surname,
+                                other_surname,
+                                middle,
+                                Field{"phone", u"phone", Owner::family},
+                                Field{"family_fax", u"fax", Owner::family},
+                                Field{"family_email", u"e-mail", Owner::family},
+                                Field{"mobile_phone", u"mobile phone", Owner::person},
+                                Field{"Personal_email", u"e-mail", Owner::person},
+                                Field{"business_phone", u"business phone", Owner::person},
+                                Field{"business_fax", u"business fax", Owner::person},
+                                Field{"business_email", u"business e-mail", Owner::person},
+                                Field{"res_street", u"street", Owner::family},
+                                Field{"res_street2", u"second line of the street", Owner::family},
+                                Field{"res_state", u"state", Owner::family},
+                                Field{"res_country", u"country", Owner::family},
+                                Field{"res_map", u"map", Owner::family},
+                                Field{"post_street", u"postal street", Owner::family},
+                                Field{"post_street2", u"second line of the postal street", Owner::family},
+                                Field{"post_state", u"postal state", Owner::family},
+                                Field{"post_country", u"postal country", Owner::family}};
 
 struct Walk
 {
     QStringView query;
-    std::span<const char* const> fields;
+    std::span<const Field> fields;
 };
+
+/// What stands before a walk's own fields, of which the given name is the first.
+enum Fixed { key_of_family, key_of_person, first_field };
 
 Walk walk_of(SearchFields fields)
 {
@@ -38,20 +72,20 @@ Walk walk_of(SearchFields fields)
 QString statement_of(const Walk& walk)
 {
     QStringList columns{u"[Surname_ID]"_s, u"[person_id]"_s};
-    for (const char* field : walk.fields)
-        columns += u"[%1]"_s.arg(QLatin1StringView(field));
+    for (const auto& field : walk.fields)
+        columns += u"[%1]"_s.arg(QLatin1StringView(field.column));
     return u"SELECT %1 FROM [%2] ORDER BY [sort_key],[Primary_name],[Surname_ID],[position];"_s.arg(columns.join(u','),
                                                                                                     walk.query);
 }
 
 /// The first field of the row that holds the text; null when none does. Blanks around a value make no difference, for
 /// the text neither begins nor ends with one.
-const char* field_with(const QString& upper_text, const core::Row& row, std::span<const char* const> fields)
+const Field* field_with(const QString& upper_text, const core::Row& row, std::span<const Field> fields)
 {
-    int column = 2;
+    int column = first_field;
     const auto found = std::ranges::find_if(
-        fields, [&](const char*) { return row.text(core::Column{column++}).toUpper().contains(upper_text); });
-    return found == fields.end() ? nullptr : *found;
+        fields, [&](const Field&) { return row.text(core::Column{column++}).toUpper().contains(upper_text); });
+    return found == fields.end() ? nullptr : &*found;
 }
 
 std::vector<TextMatch> matches_of(core::Session& session, const QString& upper_text, const Walk& walk,
@@ -61,11 +95,12 @@ std::vector<TextMatch> matches_of(core::Session& session, const QString& upper_t
     std::vector<TextMatch> matches;
     auto rows = session.select(statement_of(walk));
     for (const core::Row& row : rows) {
-        const int surname_id = row.integer(core::Column{0});
+        const int surname_id = row.integer(core::Column{key_of_family});
         if (!still_wanted.contains(surname_id))
             continue;
-        if (const char* field = field_with(upper_text, row, walk.fields)) {
-            matches.push_back({surname_id, row.integer(core::Column{1}), label_of(field)});
+        if (const Field* field = field_with(upper_text, row, walk.fields)) {
+            matches.push_back({surname_id, row.integer(core::Column{key_of_person}), field->words,
+                               field->owner == Owner::person ? row.text(core::Column{first_field}) : QString()});
             still_wanted.remove(surname_id);
         }
     }
@@ -88,6 +123,7 @@ bool may_search(const core::Office& office, const QString& trimmed, const std::v
 std::optional<TextMatch> TextSearch::next(const QString& text, SearchFields fields, const std::vector<int>& listed)
 {
     Question question{text.trimmed().toUpper(), fields, listed};
+    std::ranges::sort(question.listed);
     if (!may_search(m_office, question.text, listed)) {
         start_anew();
         return std::nullopt;
@@ -108,6 +144,12 @@ void TextSearch::start_anew()
 {
     m_matches.clear();
     m_next = 0;
+}
+
+QString found_words(const TextMatch& match)
+{
+    const QString whose = match.person.isEmpty() ? u"the family"_s : match.person;
+    return u"Found in the %1 of %2"_s.arg(match.field, whose);
 }
 
 QString search_caption(bool under_way)

@@ -15,7 +15,8 @@ struct TextMatch
 {
     int surname_id = 0;
     int person_id = 0;
-    QString field; ///< Its caption.
+    QStringView field;   ///< In a sentence: "given name".
+    QString person = {}; ///< The given name; empty where the field is the family's.
 
     friend bool operator==(const TextMatch&, const TextMatch&) = default;
 };
@@ -26,7 +27,8 @@ class TextSearch
 public:
     explicit TextSearch(core::Office& office) : m_office(office) {}
 
-    /// The next family among `listed`; each is found once. Starts anew when anything asked for differs from before.
+    /// The next family among `listed`, whose order makes no difference; each is found once. Starts anew when anything
+    /// asked for differs from before.
     /// Nullopt after saying why there is none; what follows the last match is the first again. One statement for all
     /// matches of a text.
     [[nodiscard]] std::optional<TextMatch> next(const QString& text, SearchFields fields,
@@ -52,6 +54,8 @@ private:
     std::size_t m_next = 0;
 };
 
+/// "Found in the given name of Jasmine".
+[[nodiscard]] QString found_words(const TextMatch& match);
 /// The caption of the button that calls TextSearch::next().
 [[nodiscard]] QString search_caption(bool under_way);
 /// Whether a list has a family to be opened; otherwise says so.

@@ -271,6 +271,8 @@ bool DatedRegister::usable(const core::Date& date) const
 {
     if (date.qdate().isValid())
         return true;
+    if (date.valid() && !date.year_known())
+        return refuse(year_missing);
     m_office.dialogue.show(core::bad_date_message(m_office.day_order()));
     return false;
 }
@@ -352,9 +354,11 @@ bool DatedRegister::refuse_standing(Standing standing)
                 QString::fromUtf16(m_kind.words)),
             kept + u'\n' + holders(m_kind.held_at_entry));
     case Standing::changed:
-        return refuse(u"The lock on this %1 was taken away while the date was open here, and another user has changed "
-                      "the date meanwhile."_s.arg(QString::fromUtf16(m_kind.words)),
-                      kept);
+        return refuse(
+            u"What is stored of this date has changed since it was opened here."_s,
+            u"Another user may have changed it after the lock on this %1 was taken away, or the connection was "
+            "lost while it was being stored. "_s.arg(QString::fromUtf16(m_kind.words)) +
+                kept);
     }
     return false;
 }

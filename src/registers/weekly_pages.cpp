@@ -2,9 +2,15 @@
 
 #include "core/progress_run.h"
 #include "pages/table.h"
+#include "pages/text_metrics.h"
 #include "registers/weekly_charts.h"
+#include "registers/weekly_tables.h"
+
+#include <QRegularExpression>
 
 #include <algorithm>
+#include <cmath>
+#include <functional>
 
 namespace kindrel::registers {
 
@@ -12,31 +18,20 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+using RowKind = WeeklyTable::RowKind;
+
 // Points.
 constexpr qreal date_in_ems = 9; ///< Width of the dates, in text sizes.
 constexpr qreal name_width = 118;
-constexpr qreal chart_height = 250;
-constexpr qreal small_chart_height = 172;
+constexpr qreal usual_chart = 250;
+constexpr qreal least_chart = 190;
+constexpr qreal least_small_chart = 150;
+constexpr qreal highest_of_width = 0.7; ///< A chart that is higher than that looks lost in its width.
 constexpr qreal between_charts = 14;
 constexpr qreal cell_padding = 2;
+constexpr qreal least_text = 5; ///< Holds the largest figures that years of Sundays can add up to.
 constexpr QRgb stripe = 0xfff7f7f7;
 constexpr QRgb summary_shade = pages::ink::shade;
-
-pages::TableStyle table_style(const pages::Flow& flow)
-{
-    pages::TableStyle style;
-    style.heading_shade = pages::ink::shade;
-    style.heading_style = flow.type().body.bolder();
-    style.stripe = stripe;
-    style.padding = cell_padding;
-    style.vertical_padding = 2.5;
-    return style;
-}
-
-pages::TableColumn figure_column(const QString& heading)
-{
-    return {.heading = heading, .align = pages::Align::right};
-}
 
 core::ProgressRun begin(core::Progress& progress, std::size_t steps)
 {
@@ -45,11 +40,44 @@ core::ProgressRun begin(core::Progress& progress, std::size_t steps)
 
 // Charts
 
-bool write_charts(const WeeklyContent& content, std::span<const pages::ChartData> charts, pages::Flow& flow,
-                  core::Progress& progress)
+/// Shares the room out among charts beneath each other: as many on a page as it holds at their least height, which then
+/// fill it.
+class ChartHeights
+{
+public:
+    ChartHeights(const ChartRoom& room, qreal beneath, std::size_t charts, qreal least, qreal most)
+        : m_page(room.page), m_left(beneath), m_charts(int(charts)), m_least(least + between_charts), m_most(most)
+    {
+    }
+
+    [[nodiscard]] qreal next()
+    {
+        if (m_left < m_least)
+            m_left = m_page;
+        const int here = std::clamp(int(m_left / m_least), 1, std::max(m_charts--, 1));
+        const auto height = std::min(m_left / here - between_charts, m_most);
+        m_left -= height + between_charts;
+        return height;
+    }
+
+private:
+    qreal m_page, m_left;
+    int m_charts;
+    qreal m_least, m_most;
+};
+
+/// Charts above a table that fills the rest of the page; one that runs on beyond it leaves them their usual height.
+qreal height_above_table(const ChartRoom& room, std::size_t charts, qreal most)
+{
+    const auto height = (room.page - room.table) / qreal(charts) - between_charts;
+    return height < least_chart ? usual_chart : std::min(height, most);
+}
+
+bool write_charts(const WeeklyPlan& plan, std::span<const pages::ChartData> charts,
+                  const std::function<qreal()>& next_height, pages::Flow& flow, core::Progress& progress)
 {
     for (const auto& data : charts) {
-        flow.drawing(pages::chart(data, *content.chart, {flow.width(), chart_height}, flow.type(), flow.metrics()));
+        flow.drawing(pages::chart(data, *plan.chart, {flow.width(), next_height()}, flow.type(), flow.metrics()));
         flow.space(between_charts);
         if (!progress.step())
             return false;
@@ -62,178 +90,50 @@ std::size_t pairs(std::size_t charts)
     return (charts + 1) / 2;
 }
 
-/// Two beside each other.
-bool write_small_charts(const WeeklyContent& content, std::span<const pages::ChartData> charts, pages::Flow& flow,
-                        core::Progress& progress)
+/// Whether charts stand two beside each other.
+bool of_small_charts(const WeeklyPlan& plan)
+{
+    return plan.report->charts == ReportCharts::by_category && plan.categories.size() > 1;
+}
+
+bool write_small_charts(const WeeklyPlan& plan, std::span<const pages::ChartData> charts,
+                        const std::function<qreal()>& next_height, pages::Flow& flow, core::Progress& progress)
 {
     pages::TableStyle style;
     style.lines = pages::TableLines::none;
     style.padding = style.vertical_padding = between_charts / 2;
     pages::Table table(flow, {{.share = 1}, {.share = 1}}, style);
-    const auto cell_of = [&](std::size_t place) {
-        return pages::Cell::of([&, place](pages::Writer& cell) {
+    const auto cell_of = [&](std::size_t place, qreal height) {
+        return pages::Cell::of([&, place, height](pages::Writer& cell) {
             if (place < charts.size())
-                cell.drawing(pages::chart(charts[place], *content.chart, {cell.width(), small_chart_height},
-                                          cell.type(), cell.metrics()));
+                cell.drawing(
+                    pages::chart(charts[place], *plan.chart, {cell.width(), height}, cell.type(), cell.metrics()));
         });
     };
     for (std::size_t i = 0; i < charts.size(); i += 2) {
-        table.row({cell_of(i), cell_of(i + 1)});
+        const auto height = next_height();
+        table.row({cell_of(i, height), cell_of(i + 1, height)});
         if (!progress.step())
             return false;
     }
     return true;
 }
 
-// A row for each date
-
-struct Summary
+ChartFigures date_figures(const WeeklyPlan& plan)
 {
-    const char* caption;
-    std::optional<core::Amount> (*of)(const FigureRow&, FigureKind);
-};
-
-Tally tally_of(const FigureRow& column)
-{
-    Tally tally;
-    for (const auto& figure : column) {
-        if (figure)
-            tally.add(*figure);
-    }
-    return tally;
-}
-
-std::optional<core::Amount> highest(const FigureRow& column, FigureKind)
-{
-    return *std::ranges::max_element(column);
-}
-
-/// Dates without a figure do not count.
-std::optional<core::Amount> lowest(const FigureRow& column, FigureKind)
-{
-    std::optional<core::Amount> least;
-    for (const auto& figure : column) {
-        if (figure && (!least || *figure < *least))
-            least = figure;
-    }
-    return least;
-}
-
-constexpr std::array summaries{
-    Summary{"Total Amount",
-            [](const FigureRow& column, FigureKind) {
-                return tally_of(column).total();
-            }},
-    Summary{"Average Amount",
-            [](const FigureRow& column, FigureKind kind) {
-                return tally_of(column).average(kind);
-            }},
-    Summary{"Highest Amount", highest},
-    Summary{"Lowest Amount", lowest},
-};
-
-QString shown(const std::optional<core::Amount>& figure, FigureKind kind)
-{
-    return figure ? shown_figure(*figure, kind) : QString();
-}
-
-std::vector<pages::TableColumn> date_columns(std::span<const Category> categories, qreal date_width)
-{
-    std::vector<pages::TableColumn> columns{{.width = date_width, .heading = u"Date"_s}};
-    for (const auto& category : categories)
-        columns.push_back(figure_column(captioned(category)));
-    return columns;
-}
-
-void write_summaries(const WeeklyContent& content, const DateTable& dates, pages::Table& table,
-                     const pages::TextStyle& style)
-{
-    for (const auto& summary : summaries) {
-        pages::Cell caption(QString::fromUtf8(summary.caption), style);
-        caption.shade = summary_shade;
-        std::vector<pages::Cell> cells{caption};
-        for (std::size_t i = 0; i < content.categories.size(); ++i) {
-            const auto kind = content.categories[i].kind;
-            cells.emplace_back(shown(summary.of(dates.column(i), kind), kind), style);
-            cells.back().shade = summary_shade;
-        }
-        table.row(cells);
-    }
-}
-
-bool write_date_rows(const WeeklyContent& content, const DateTable& dates, pages::Flow& flow, core::Progress& progress)
-{
-    const auto date_width = flow.type().body.size * date_in_ems;
-    pages::Table table(flow, date_columns(content.categories, date_width), table_style(flow));
-    for (std::size_t row = 0; row < dates.rows.size(); ++row) {
-        QStringList texts{dates.dates[row].shown(content.day_order)};
-        for (std::size_t i = 0; i < content.categories.size(); ++i)
-            texts += shown(dates.rows[row][i], content.categories[i].kind);
-        table.row(texts);
-        if (!progress.step())
-            return false;
-    }
-    const pages::Keep together(flow);
-    write_summaries(content, dates, table, flow.type().body.bolder());
-    return true;
-}
-
-ChartFigures chart_figures(const DateTable& dates, std::size_t categories, core::DayOrder order)
-{
+    const auto dates = date_table(plan.figures, plan.categories);
     ChartFigures figures;
     for (const auto& date : dates.dates)
-        figures.labels += date.shown(order);
-    for (std::size_t i = 0; i < categories; ++i)
+        figures.labels += date.shown(plan.day_order);
+    for (std::size_t i = 0; i < plan.categories.size(); ++i)
         figures.rows.push_back(dates.column(i));
     return figures;
 }
 
-// A row for each category
-
-QString shown_slot(const std::optional<core::Amount>& figure, FigureKind kind, TableShape shape)
-{
-    if (!figure)
-        return {};
-    if (shape != TableShape::month_changes && shape != TableShape::year_changes)
-        return shown_figure(*figure, kind);
-    const auto text = shown_change(*figure, kind);
-    return text.isEmpty() ? u"0"_s : text;
-}
-
-void write_section(pages::Table& table, FigureKind kind, int columns, const pages::TextStyle& style)
-{
-    pages::Cell cell(kind_name(kind), style);
-    cell.columns = columns;
-    table.row({cell});
-}
-
-bool write_slot_rows(const WeeklyContent& content, const SlotTable& slots, pages::Flow& flow, core::Progress& progress)
-{
-    std::vector<pages::TableColumn> columns{{.width = name_width, .heading = u"Category"_s}};
-    for (const auto& name : slots.columns)
-        columns.push_back(figure_column(name));
-    pages::Table table(flow, columns, table_style(flow));
-    const bool sections = content.categories.front().kind != content.categories.back().kind;
-    for (std::size_t i = 0; i < content.categories.size(); ++i) {
-        const auto& category = content.categories[i];
-        if (sections && (i == 0 || content.categories[i - 1].kind != category.kind))
-            write_section(table, category.kind, int(columns.size()), flow.type().body.bolder());
-        std::vector<pages::Cell> cells{captioned(category)};
-        for (std::size_t slot = 0; slot < slots.rows[i].size(); ++slot) {
-            const bool all = slot >= std::size_t(slots.slots);
-            cells.emplace_back(shown_slot(slots.rows[i][slot], category.kind, *content.report.shape),
-                               flow.type().body.bolder(all));
-        }
-        table.row(cells);
-        if (!progress.step())
-            return false;
-    }
-    return true;
-}
-
 /// The months or years, and apart from them what stands for all of them.
-ChartFigures chart_figures(const SlotTable& slots)
+ChartFigures slot_figures(const WeeklyPlan& plan)
 {
+    const auto slots = slot_table(*plan.report->shape, plan.period, plan.figures, plan.categories);
     ChartFigures figures{slots.columns.first(slots.slots), slots.rows};
     for (auto& row : figures.rows) {
         if (row.size() > std::size_t(slots.slots))
@@ -243,36 +143,145 @@ ChartFigures chart_figures(const SlotTable& slots)
     return figures;
 }
 
-} // namespace
-
-bool write_date_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress)
+std::vector<pages::ChartData> charts_of(const WeeklyPlan& plan)
 {
-    const auto dates = date_table(content.figures, content.categories);
-    std::vector<pages::ChartData> charts;
-    if (content.chart)
-        charts = charts_by_kind(content.categories, chart_figures(dates, content.categories.size(), content.day_order),
-                                content.chart->shape);
-    const auto run = begin(progress, dates.dates.size() + charts.size());
-    return write_charts(content, charts, flow, progress) && write_date_rows(content, dates, flow, progress);
+    if (!plan.chart)
+        return {};
+    const auto figures = plan.report->shape ? slot_figures(plan) : date_figures(plan);
+    if (plan.report->charts == ReportCharts::by_category)
+        return charts_by_category(plan.categories, figures);
+    return charts_by_kind(plan.categories, figures, plan.chart->shape);
 }
 
-bool write_slot_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress)
+// The table
+
+/// The widest of a column's figures and of the words that head it, which stand in bold.
+qreal widest(const WeeklyTable& table, qsizetype column, const pages::TextStyle& style, pages::TextMetrics& metrics)
 {
-    const auto slots = slot_table(*content.report.shape, content.period, content.figures, content.categories);
-    const bool small = content.report.charts == ReportCharts::by_category;
-    std::vector<pages::ChartData> charts;
-    if (content.chart) {
-        const auto figures = chart_figures(slots);
-        charts = small ? charts_by_category(content.categories, figures)
-                       : charts_by_kind(content.categories, figures, content.chart->shape);
+    static const QRegularExpression blanks(u"\\s+"_s);
+    qreal wide = 0;
+    for (const auto& word : table.columns[column].split(blanks))
+        wide = std::max(wide, metrics.width(word, style.bolder()));
+    for (const auto& row : table.rows) {
+        const bool bold = row.kind == RowKind::summary || column >= table.plain;
+        wide = std::max(wide, metrics.width(row.texts.value(column), style.bolder(bold)));
     }
-    const auto run = begin(progress, content.categories.size() + (small ? pairs(charts.size()) : charts.size()));
-    if (!write_slot_rows(content, slots, flow, progress))
-        return false;
+    return wide;
+}
+
+/// The body text, or a smaller one in which no figure and no word of a heading is divided.
+pages::TextStyle fitting_text(const WeeklyTable& table, qreal first_width, pages::Flow& flow)
+{
+    const auto& body = flow.type().body;
+    const auto figures = table.columns.size() - 1;
+    const auto room = (flow.width() - first_width) / qreal(figures) - 2 * cell_padding;
+    qreal wide = room;
+    for (qsizetype column = 1; column <= figures; ++column)
+        wide = std::max(wide, widest(table, column, body, flow.metrics()));
+    // Sizes go by sixteenths.
+    const auto size = std::floor(body.size * room / wide * pages::units_per_point) / pages::units_per_point;
+    return body.sized(std::max(std::min(size, body.size), least_text));
+}
+
+std::vector<pages::TableColumn> columns_of(const WeeklyTable& table, qreal first_width)
+{
+    std::vector<pages::TableColumn> columns{{.width = first_width, .heading = table.columns.front()}};
+    for (const auto& name : table.columns.sliced(1))
+        columns.push_back({.heading = name, .align = pages::Align::right});
+    return columns;
+}
+
+std::vector<pages::Cell> cells_of(const WeeklyTable& table, const WeeklyTable::Row& row, const pages::TextStyle& text)
+{
+    std::vector<pages::Cell> cells;
+    for (qsizetype column = 0; column < row.texts.size(); ++column) {
+        const bool all = row.kind != RowKind::figures || column >= table.plain;
+        auto& cell = cells.emplace_back(row.texts[column], text.bolder(all));
+        if (row.kind == RowKind::summary)
+            cell.shade = summary_shade;
+        if (row.kind == RowKind::section)
+            cell.columns = int(table.columns.size());
+    }
+    return cells;
+}
+
+bool write_table(const WeeklyTable& table, qreal first_width, pages::Flow& flow, core::Progress& progress)
+{
+    const auto text = fitting_text(table, first_width, flow);
+    pages::TableStyle style{.padding = cell_padding, .vertical_padding = 2.5};
+    style.heading_shade = pages::ink::shade;
+    style.heading_style = text.bolder();
+    style.stripe = stripe;
+    pages::Table written(flow, columns_of(table, first_width), style);
+    std::optional<pages::Keep> together; ///< The summaries.
+    for (const auto& row : table.rows) {
+        if (row.kind == RowKind::summary && !together)
+            together.emplace(flow);
+        written.row(cells_of(table, row, text));
+        if (!progress.step())
+            return false;
+    }
+    return true;
+}
+
+qreal first_width(const WeeklyPlan& plan, const pages::Flow& flow)
+{
+    return plan.report->shape ? name_width : flow.type().body.size * date_in_ems;
+}
+
+/// Fills the page with blocks of a point until the next one begins, and returns how many it took.
+int fill_page(pages::Flow& trial, const pages::PageSpool& written)
+{
+    int blocks = 0;
+    for (const int before = written.page_count(); written.page_count() == before; ++blocks)
+        trial.write({.height = 1});
+    return blocks;
+}
+
+bool write_charts_beneath(const WeeklyPlan& plan, std::span<const pages::ChartData> charts, const ChartRoom& room,
+                          pages::Flow& flow, core::Progress& progress)
+{
     if (charts.empty())
         return true;
+    const bool small = of_small_charts(plan);
+    const auto width = small ? flow.width() / 2 : flow.width();
+    ChartHeights heights(room, room.beneath_table - between_charts, small ? pairs(charts.size()) : charts.size(),
+                         small ? least_small_chart : least_chart, width * highest_of_width);
     flow.space(between_charts);
-    return small ? write_small_charts(content, charts, flow, progress) : write_charts(content, charts, flow, progress);
+    return (small ? write_small_charts : write_charts)(
+        plan, charts, [&] { return heights.next(); }, flow, progress);
+}
+
+} // namespace
+
+ChartRoom measure_room(const WeeklyPlan& plan, pages::Flow& trial, const pages::PageSpool& written)
+{
+    core::SilentProgress nobody;
+    (void)write_table(weekly_table(plan), first_width(plan, trial), trial, nobody);
+    // A block is placed once the next one comes: two without height bring the table's end to its place.
+    for (int i = 0; i < 2; ++i)
+        trial.write({});
+    const int full_pages = written.page_count();
+    const auto beneath = fill_page(trial, written) - 2;
+    const auto page = fill_page(trial, written);
+    return {qreal(page), qreal((full_pages + 1) * page - beneath), qreal(beneath)};
+}
+
+bool write_weekly_pages(const WeeklyPlan& plan, const ChartRoom& room, pages::Flow& flow, core::Progress& progress)
+{
+    const auto table = weekly_table(plan);
+    const auto charts = charts_of(plan);
+    const bool small = of_small_charts(plan);
+    const auto run = begin(progress, table.rows.size() + (small ? pairs(charts.size()) : charts.size()));
+    const auto write_rows = [&] {
+        return write_table(table, first_width(plan, flow), flow, progress);
+    };
+    if (plan.report->shape)
+        return write_rows() && write_charts_beneath(plan, charts, room, flow, progress);
+    const auto height = [&] {
+        return height_above_table(room, charts.size(), flow.width() * highest_of_width);
+    };
+    return write_charts(plan, charts, height, flow, progress) && write_rows();
 }
 
 } // namespace kindrel::registers

@@ -6,20 +6,20 @@
 
 namespace kindrel::registers {
 
-/// All that a report is written from.
-struct WeeklyContent
+/// What the charts of a report have to fill, in points.
+struct ChartRoom
 {
-    const WeeklyReport& report;
-    const Period& period;
-    std::span<const Category> categories;
-    std::span<const WeeklyFigure> figures; ///< Of the period, for month_changes of the month before it too.
-    const pages::ChartStyle* chart;        ///< Null: no charts.
-    core::DayOrder day_order;
+    qreal page = 0;          ///< Of an empty page.
+    qreal table = 0;         ///< Taken by the table.
+    qreal beneath_table = 0; ///< On the page on which the table ends.
 };
 
-/// Each date's figure with a column for each category, then total, average, highest and lowest. False when cancelled.
-[[nodiscard]] bool write_date_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress);
-/// Months or years with a row for each category.
-[[nodiscard]] bool write_slot_pages(const WeeklyContent& content, pages::Flow& flow, core::Progress& progress);
+/// Found by writing the table into a document that nobody sees, `trial`, whose pages go to `written`.
+[[nodiscard]] ChartRoom measure_room(const WeeklyPlan& plan, pages::Flow& trial, const pages::PageSpool& written);
+
+/// The report's table with its charts: those of dates above it, those of months and years beneath. False when
+/// cancelled.
+[[nodiscard]] bool write_weekly_pages(const WeeklyPlan& plan, const ChartRoom& room, pages::Flow& flow,
+                                      core::Progress& progress);
 
 } // namespace kindrel::registers

@@ -1,5 +1,7 @@
 #include "registers/weekly_periods.h"
 
+#include "registers/dated_register.h"
+
 #include <algorithm>
 
 namespace kindrel::registers {
@@ -14,71 +16,71 @@ constexpr int year_digits = 4;
 constexpr int first_year = 1000;
 constexpr int last_year = 9998; ///< The financial year after it still has four digits.
 
-std::nullopt_t refuse(core::Dialogue& dialogue, const QString& why)
-{
-    dialogue.show({why});
-    return std::nullopt;
-}
-
-std::optional<int> read_year(const QString& typed, const QString& missing, core::Dialogue& dialogue)
+std::optional<int> read_year(const QString& typed, ReportField field, const QString& missing, ReportCheck& check)
 {
     const auto text = typed.trimmed();
     if (text.isEmpty())
-        return refuse(dialogue, missing);
+        return check.refuse(field, missing);
     const bool digits = std::ranges::all_of(text, [](QChar c) { return c >= u'0' && c <= u'9'; });
     const int year = digits && text.size() == year_digits ? text.toInt() : 0;
     if (year < first_year || year > last_year)
-        return refuse(dialogue, u"Incorrect format for the analysis year, eg. '2007'"_s);
+        return check.refuse(field, u"Incorrect format for the analysis year, eg. '2007'"_s);
     return year;
 }
 
-std::optional<int> read_first_year(const PeriodChoice& choice, core::Dialogue& dialogue)
+std::optional<int> read_first_year(const PeriodChoice& choice, ReportCheck& check)
 {
-    return read_year(choice.year, u"Please enter an analysis year"_s, dialogue);
+    return read_year(choice.year, ReportField::from, u"Please enter an analysis year"_s, check);
 }
 
-std::optional<Period> date_range(const PeriodChoice& choice, core::DayOrder order, core::Dialogue& dialogue)
+std::optional<Period> date_range(const PeriodChoice& choice, core::DayOrder order, ReportCheck& check)
 {
     if (!choice.from)
-        return refuse(dialogue, u"Please select a date to begin the search from"_s);
+        return check.refuse(ReportField::from, u"Please select a date to begin the search from"_s);
+    if (!choice.from->year_known())
+        return check.refuse(ReportField::from, year_missing);
     if (!choice.to)
-        return refuse(dialogue, u"Please select a date to end the search from"_s);
+        return check.refuse(ReportField::to, u"Please select a date to end the search from"_s);
+    if (!choice.to->year_known())
+        return check.refuse(ReportField::to, year_missing);
     if (*choice.to < *choice.from)
-        return refuse(dialogue, u"The date to end the search from is before the date to begin the search from"_s);
+        return check.refuse(ReportField::to,
+                            u"The date to end the search from is before the date to begin the search from"_s);
     return Period{choice.kind, *choice.from, *choice.to,
                   u" (%1 - %2)"_s.arg(choice.from->shown(order), choice.to->shown(order))};
 }
 
-std::optional<Period> calendar_year(const PeriodChoice& choice, core::Dialogue& dialogue)
+std::optional<Period> calendar_year(const PeriodChoice& choice, ReportCheck& check)
 {
-    const auto year = read_first_year(choice, dialogue);
+    const auto year = read_first_year(choice, check);
     if (!year)
         return {};
     return Period{choice.kind, {*year, 1, 1}, {*year, 12, 31}, u" Calender Year (%1)"_s.arg(*year)};
 }
 
-std::optional<Period> financial_year(const PeriodChoice& choice, core::Dialogue& dialogue)
+std::optional<Period> financial_year(const PeriodChoice& choice, ReportCheck& check)
 {
-    const auto year = read_first_year(choice, dialogue);
+    const auto year = read_first_year(choice, check);
     if (!year)
         return {};
     return Period{
         choice.kind, {*year, 7, 1}, {*year + 1, 6, 30}, u" Financial Year (%1 - %2)"_s.arg(*year).arg(*year + 1)};
 }
 
-std::optional<Period> year_span(const PeriodChoice& choice, core::Dialogue& dialogue)
+std::optional<Period> year_span(const PeriodChoice& choice, ReportCheck& check)
 {
-    const auto from = read_first_year(choice, dialogue);
+    const auto from = read_first_year(choice, check);
     if (!from)
         return {};
-    const auto to = read_year(choice.to_year, u"Please enter a `To' year for analysis"_s, dialogue);
+    const auto to = read_year(choice.to_year, ReportField::to, u"Please enter a `To' year for analysis"_s, check);
     if (!to)
         return {};
     if (*to < *from)
-        return refuse(dialogue, u"The `To' year for analysis is before the year to begin from"_s);
+        return check.refuse(ReportField::to, u"The `To' year for analysis is before the year to begin from"_s);
     if (*to - *from + 1 > most_span_years)
-        return refuse(dialogue, u"You can only do an analysis up to a maximum of 12 years, please decrease the gap in "
-                                "the years selected for analysis"_s);
+        return check.refuse(ReportField::to,
+                            u"You can only do an analysis up to a maximum of 12 years, please decrease the gap in "
+                            "the years selected for analysis"_s);
     return Period{choice.kind, {*from, 1, 1}, {*to, 12, 31}, u" (%1 - %2)"_s.arg(*from).arg(*to)};
 }
 
@@ -88,6 +90,13 @@ int month_number(const core::Date& date)
 }
 
 } // namespace
+
+std::nullopt_t ReportCheck::refuse(ReportField field, const QString& why)
+{
+    guilty = field;
+    dialogue.show({why});
+    return std::nullopt;
+}
 
 int Period::month_slot(const core::Date& date) const
 {
@@ -118,17 +127,17 @@ QStringList offered_years()
     return years;
 }
 
-std::optional<Period> read_period(const PeriodChoice& choice, core::DayOrder order, core::Dialogue& dialogue)
+std::optional<Period> read_period(const PeriodChoice& choice, core::DayOrder order, ReportCheck& check)
 {
     switch (choice.kind) {
     case PeriodKind::date_range:
-        return date_range(choice, order, dialogue);
+        return date_range(choice, order, check);
     case PeriodKind::calendar_year:
-        return calendar_year(choice, dialogue);
+        return calendar_year(choice, check);
     case PeriodKind::financial_year:
-        return financial_year(choice, dialogue);
+        return financial_year(choice, check);
     case PeriodKind::year_span:
-        return year_span(choice, dialogue);
+        return year_span(choice, check);
     }
     return {};
 }

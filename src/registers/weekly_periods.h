@@ -11,9 +11,9 @@ enum class PeriodKind { date_range, calendar_year, financial_year, year_span };
 struct PeriodChoice
 {
     PeriodKind kind = PeriodKind::date_range;
-    std::optional<core::Date> from, to; ///< Of a date range.
-    QString year;                       ///< "YYYY"; the first year of a financial year and of a span.
-    QString to_year;                    ///< The last year of a span.
+    std::optional<core::Date> from = {}, to = {}; ///< Of a date range.
+    QString year = {};                            ///< "YYYY"; the first year of a financial year and of a span.
+    QString to_year = {};                         ///< The last year of a span.
 };
 
 /// The days of a report, the first and the last among them.
@@ -34,12 +34,23 @@ struct Period
     [[nodiscard]] Period only_year(int year) const;
 };
 
+/// A choice that a report is made of. A period has one that it begins with and, where it ends elsewhere, one more.
+enum class ReportField { project, report, categories, chart, from, to };
+
+/// Says why a report cannot be made, and remembers the choice that is in the way.
+struct ReportCheck
+{
+    core::Dialogue& dialogue;
+    std::optional<ReportField> guilty = {}; ///< Unset when nothing was refused, or no other choice would help.
+
+    std::nullopt_t refuse(ReportField field, const QString& why);
+};
+
 /// The years that choosers list; any other can be typed.
 [[nodiscard]] QStringList offered_years();
 inline constexpr int most_span_years = 12;
 
 /// Nullopt, after saying why, when no period can be made of the choice.
-[[nodiscard]] std::optional<Period> read_period(const PeriodChoice& choice, core::DayOrder order,
-                                                core::Dialogue& dialogue);
+[[nodiscard]] std::optional<Period> read_period(const PeriodChoice& choice, core::DayOrder order, ReportCheck& check);
 
 } // namespace kindrel::registers

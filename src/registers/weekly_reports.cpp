@@ -68,7 +68,7 @@ constexpr std::array reports{
     WeeklyReport{"Yearly_variance_report", "Yearly Comparison",
                  "Compares the monthly averages of one year with the monthly averages of another year and reports the "
                  "differences",
-                 ReportData::analysis, row_each, years, by_kind, landscape, year_changes},
+                 ReportData::analysis, row_each, two_years, by_kind, landscape, year_changes},
 };
 
 constexpr qreal text_size = 9;
@@ -78,27 +78,21 @@ constexpr std::size_t many_columns = 6;
 constexpr QMarginsF landscape_margins{28, 30, 28, 30};
 constexpr qreal below_period = 6;
 
-bool refuse(core::Office& office, const QString& why)
-{
-    office.dialogue.show({why});
-    return false;
-}
-
 /// The project's name; nullopt, after saying why, when none is chosen.
-std::optional<QString> chosen_project(core::Office& office, int key)
+std::optional<QString> chosen_project(core::Session& session, int key, ReportCheck& check)
 {
-    const auto projects = read_projects(*office.session, register_kind(Kind::weekly));
+    const auto projects = read_projects(session, register_kind(Kind::weekly));
     const auto found = std::ranges::find(projects, key, &Project::key);
     if (found != projects.end())
         return found->name;
-    office.dialogue.show({projects.empty() ? u"Unable to proceed as no Weekly projects have been setup"_s
-                                           : u"Please choose a weekly project"_s});
-    return {};
+    return check.refuse(ReportField::project, projects.empty()
+                                                  ? u"Unable to proceed as no Weekly projects have been setup"_s
+                                                  : u"Please choose a weekly project"_s);
 }
 
-std::vector<Category> chosen_categories(core::Office& office, const WeeklyReportRequest& request)
+std::vector<Category> chosen_categories(core::Session& session, const WeeklyReportRequest& request)
 {
-    auto categories = read_categories(*office.session, request.project);
+    auto categories = read_categories(session, request.project);
     std::erase_if(categories, [&](const Category& category) {
         return std::ranges::find(request.categories, category.key) == request.categories.end();
     });
@@ -112,20 +106,20 @@ QString limit_words(const WeeklyReport& report)
         report.most_categories);
 }
 
-/// Whether the report can be of so many categories, with the charts that are asked for.
-bool can_hold(core::Office& office, const WeeklyReportRequest& request, std::size_t categories)
+/// What keeps the report from being of so many categories, with the charts that are asked for.
+std::optional<std::pair<ReportField, QString>> too_much(const WeeklyReportRequest& request, std::size_t categories)
 {
     const auto& report = *request.report;
     if (categories == 0)
-        return refuse(office, u"Please select either a financial or attendance item"_s);
+        return {{ReportField::categories, u"Please select either a financial or attendance item"_s}};
     if (categories > std::size_t(report.most_categories))
-        return refuse(office, limit_words(report));
+        return {{ReportField::categories, limit_words(report)}};
     if (request.chart && report.charts == by_category && categories > most_graphs)
-        return refuse(office,
-                      u"A maximum of six graphs can only be displayed at once for the monthly analysis Report"_s);
+        return {{ReportField::chart,
+                 u"A maximum of six graphs can only be displayed at once for the monthly analysis Report"_s}};
     if (!request.chart && report.charts == required)
-        return refuse(office, u"Please choose a chart style"_s);
-    return true;
+        return {{ReportField::chart, u"Please choose a chart style"_s}};
+    return {};
 }
 
 /// What the report needs when the choice is of another kind: the first thing that is then missing is asked for.
@@ -133,7 +127,7 @@ PeriodChoice fitting(PeriodChoice choice, ReportPeriod wanted)
 {
     const bool span = choice.kind == PeriodKind::year_span;
     const bool year = choice.kind == PeriodKind::calendar_year || choice.kind == PeriodKind::financial_year;
-    if (wanted == years)
+    if (wanted == years || wanted == two_years)
         choice.kind = PeriodKind::year_span;
     else if (wanted == one_year && !year)
         choice.kind = PeriodKind::calendar_year;
@@ -142,34 +136,49 @@ PeriodChoice fitting(PeriodChoice choice, ReportPeriod wanted)
     return choice;
 }
 
-/// What a run that may begin has found.
-struct Plan
-{
-    QString project;
-    std::vector<Category> categories;
-    Period period;
-};
-
 /// Everything that can be refused before a figure is read.
-std::optional<Plan> plan_of(core::Office& office, const WeeklyReportRequest& request)
+std::optional<WeeklyPlan> without_figures(core::Office& office, const WeeklyReportRequest& request, ReportCheck& check)
 {
     if (!core::permitted(office, core::Area::weekly_statistics))
         return {};
-    const auto project = chosen_project(office, request.project);
+    auto& session = *office.session;
+    const auto project = chosen_project(session, request.project, check);
     if (!project)
         return {};
-    if (!request.report) {
-        office.dialogue.show({u"Please choose a report"_s});
-        return {};
-    }
-    auto categories = chosen_categories(office, request);
-    if (!can_hold(office, request, categories.size()))
-        return {};
-    const auto period =
-        read_period(fitting(request.period, request.report->period), office.day_order(), office.dialogue);
+    if (!request.report)
+        return check.refuse(ReportField::report, u"Please choose a report"_s);
+    auto categories = chosen_categories(session, request);
+    if (const auto fault = too_much(request, categories.size()))
+        return check.refuse(fault->first, fault->second);
+    const auto period = read_period(fitting(request.period, request.report->period), office.day_order(), check);
     if (!period)
         return {};
-    return Plan{*project, std::move(categories), *period};
+    return WeeklyPlan{.report = request.report,
+                      .project = *project,
+                      .categories = std::move(categories),
+                      .period = *period,
+                      .chart = request.report->charts == ReportCharts::none ? nullptr : request.chart,
+                      .day_order = office.day_order()};
+}
+
+/// Why a report of changes would stand empty; empty when it has one to show.
+QString no_change(const WeeklyPlan& plan)
+{
+    const auto table = slot_table(*plan.report->shape, plan.period, plan.figures, plan.categories);
+    const auto shows = [](const FigureRow& row) {
+        return std::ranges::any_of(row, [](const auto& figure) { return figure.has_value(); });
+    };
+    if (std::ranges::any_of(table.rows, shows))
+        return {};
+    if (plan.report->shape == month_changes)
+        return u"No month of the period and the month before it both have figures of the chosen categories."_s;
+    const int first = plan.period.first.year, last = plan.period.last.year;
+    for (const int year : {first, last}) {
+        if (std::ranges::none_of(plan.figures, [&](const auto& figure) { return figure.date.year == year; }))
+            return u"There are no figures of %1 to compare with those of %2."_s.arg(year).arg(year == first ? last
+                                                                                                            : first);
+    }
+    return u"None of the chosen categories has figures of both %1 and %2."_s.arg(first).arg(last);
 }
 
 pages::PageSetup page_of(const WeeklyReport& report, pages::Paper paper)
@@ -190,50 +199,43 @@ QString what_is_compared(const WeeklyReport& report, const Period& period)
     return {};
 }
 
-qreal text_size_of(const WeeklyReport& report, std::size_t categories)
+pages::TypeScale type_of(const WeeklyPlan& plan)
 {
-    if (report.shape)
-        return slot_text_size;
-    return report.orientation == portrait && categories > many_columns ? dense_text_size : text_size;
-}
-
-/// Of the days that the report looks at.
-std::vector<WeeklyFigure> read_figures(core::Session& session, const WeeklyReportRequest& request, const Plan& plan)
-{
-    const auto& period = plan.period;
-    const auto read = [&](const Period& days) {
-        return read_weekly_figures(session, request.project, days, plan.categories);
-    };
-    if (request.report->shape == month_changes)
-        return read(period.from_month_before());
-    if (request.report->shape != year_changes || period.years() == 1)
-        return read(period);
-    auto figures = read(period.only_year(period.first.year));
-    std::ranges::copy(read(period.only_year(period.last.year)), std::back_inserter(figures));
-    return figures;
-}
-
-bool write_report(core::Office& office, const WeeklyContent& content, const QString& project, pages::Paper paper,
-                  core::Progress& progress, pages::PageSpool& spool)
-{
-    const auto& report = content.report;
+    const bool dense = plan.report->orientation == portrait && plan.categories.size() > many_columns;
     pages::TextStyle body;
-    body.size = text_size_of(report, content.categories.size());
-    pages::Flow flow(spool, page_of(report, paper), pages::TypeScale::around(body));
+    body.size = plan.report->shape ? slot_text_size : dense ? dense_text_size : text_size;
+    return pages::TypeScale::around(body);
+}
+
+/// Header and footer.
+void decorate(core::Office& office, const WeeklyPlan& plan, pages::Flow& flow)
+{
     const people::WorkingList no_people;
     output::OwnBands own;
-    own.header = [words = project + content.period.title,
-                  how = what_is_compared(report, content.period)](pages::Writer& band, int) {
+    own.header = [words = plan.project + plan.period.title,
+                  how = what_is_compared(*plan.report, plan.period)](pages::Writer& band, int) {
         band.line(words, band.type().headings[1]);
         if (!how.isEmpty())
             band.line(how, band.type().small);
         band.space(below_period);
     };
-    output::decorate(flow, QString::fromUtf8(report.title), {office, no_people}, own);
-    if (!(report.shape ? write_slot_pages(content, flow, progress) : write_date_pages(content, flow, progress)))
-        return false;
-    flow.finish();
-    return true;
+    output::decorate(flow, QString::fromUtf8(plan.report->title), {office, no_people}, own);
+}
+
+/// Of the days that the report looks at.
+std::vector<WeeklyFigure> read_figures(core::Session& session, int project, const WeeklyPlan& plan)
+{
+    const auto& period = plan.period;
+    const auto read = [&](const Period& days) {
+        return read_weekly_figures(session, project, days, plan.categories);
+    };
+    if (plan.report->shape == month_changes)
+        return read(period.from_month_before());
+    if (plan.report->shape != year_changes || period.years() == 1)
+        return read(period);
+    auto figures = read(period.only_year(period.first.year));
+    std::ranges::copy(read(period.only_year(period.last.year)), std::back_inserter(figures));
+    return figures;
 }
 
 } // namespace
@@ -251,19 +253,41 @@ const WeeklyReport* find_weekly_report(QStringView name)
     return found == reports.end() ? nullptr : &*found;
 }
 
-bool run_weekly_report(core::Office& office, const WeeklyReportRequest& request, pages::Paper paper,
-                       core::Progress& progress, pages::PageSpool& spool)
+std::optional<WeeklyPlan> plan_weekly_report(core::Office& office, const WeeklyReportRequest& request,
+                                             ReportCheck& check)
 {
-    const auto plan = plan_of(office, request);
+    auto plan = without_figures(office, request, check);
     if (!plan)
+        return {};
+    plan->figures = read_figures(*office.session, request.project, *plan);
+    if (plan->figures.empty())
+        return check.refuse(ReportField::from, u"No figures found for creating a report"_s);
+    if (plan->report->shape == month_changes || plan->report->shape == year_changes) {
+        const auto why = no_change(*plan);
+        if (!why.isEmpty())
+            return check.refuse(ReportField::from, why);
+    }
+    return plan;
+}
+
+bool write_weekly_report(core::Office& office, const WeeklyPlan& plan, pages::Paper paper, core::Progress& progress,
+                         pages::PageSpool& spool)
+{
+    const auto setup = page_of(*plan.report, paper);
+    const auto type = type_of(plan);
+    ChartRoom room;
+    if (plan.chart) {
+        pages::PageSpool unseen;
+        pages::Flow trial(unseen, setup, type);
+        decorate(office, plan, trial);
+        room = measure_room(plan, trial, unseen);
+    }
+    pages::Flow flow(spool, setup, type);
+    decorate(office, plan, flow);
+    if (!write_weekly_pages(plan, room, flow, progress))
         return false;
-    const auto& report = *request.report;
-    const auto figures = read_figures(*office.session, request, *plan);
-    if (figures.empty())
-        return refuse(office, u"No figures found for creating a report"_s);
-    const auto* chart = report.charts == ReportCharts::none ? nullptr : request.chart;
-    return write_report(office, {report, plan->period, plan->categories, figures, chart, office.day_order()},
-                        plan->project, paper, progress, spool);
+    flow.finish();
+    return true;
 }
 
 } // namespace kindrel::registers

@@ -12,7 +12,7 @@ namespace kindrel::registers {
 /// What limits the number of categories speaks of.
 enum class ReportData { records, analysis };
 /// The kinds of period that a report can be of.
-enum class ReportPeriod { any_days, one_year, years };
+enum class ReportPeriod { any_days, one_year, years, two_years };
 /// Whether charts belong to a report, or may be added, one for each category or several categories together.
 enum class ReportCharts { none, by_category, by_kind, required };
 
@@ -47,9 +47,24 @@ struct WeeklyReportRequest
     const pages::ChartStyle* chart = nullptr; ///< Null: without charts.
 };
 
-/// Writes the report into the spool and closes it. False when it was refused, which the person has been told, or
-/// cancelled; the spool then stays open. Throws core::DatabaseError and core::FileError.
-[[nodiscard]] bool run_weekly_report(core::Office& office, const WeeklyReportRequest& request, pages::Paper paper,
-                                     core::Progress& progress, pages::PageSpool& spool);
+/// All that a report is written from.
+struct WeeklyPlan
+{
+    const WeeklyReport* report = nullptr;
+    QString project;
+    std::vector<Category> categories = {};
+    Period period = {};
+    std::vector<WeeklyFigure> figures = {};   ///< Of the period, for month_changes of the month before it too.
+    const pages::ChartStyle* chart = nullptr; ///< Null: no charts.
+    core::DayOrder day_order = {};
+};
+
+/// Reads the report's figures. Nullopt when it was refused, which the person has been told. Throws core::DatabaseError.
+[[nodiscard]] std::optional<WeeklyPlan> plan_weekly_report(core::Office& office, const WeeklyReportRequest& request,
+                                                           ReportCheck& check);
+/// Writes the report into the spool and closes it. False when it was cancelled; the spool then stays open. Throws
+/// core::FileError.
+[[nodiscard]] bool write_weekly_report(core::Office& office, const WeeklyPlan& plan, pages::Paper paper,
+                                       core::Progress& progress, pages::PageSpool& spool);
 
 } // namespace kindrel::registers

@@ -99,6 +99,27 @@ TEST_F(KindrelctlTest, TheReportOfTheActiveFamiliesIsWrittenAsAPdf)
     }
 }
 
+TEST_F(KindrelctlTest, EachReportOfWeeklyStatisticsIsWrittenOverThePeriodThatItTakes)
+{
+    make_church(3);
+    const auto year = QDate::currentDate().year();
+    const auto last = QString::number(year - 1), now = QString::number(year);
+    const std::vector<QStringList> cases{
+        {u"Weekly Totals"_s, u"--year"_s, last, u"--category"_s, u"Offering envelopes"_s},
+        {u"weekly_total_report_landscape"_s, u"--financial-year"_s, last, u"--category"_s, u"OFFERING ENVELOPES"_s},
+        {u"weekly_analysis_report"_s, u"--from"_s, u"01/01/"_s + last, u"--to"_s, u"31/12/"_s + now, u"--category"_s,
+         u"Offering envelopes"_s},
+        {u"Monthly Totals"_s, u"--project"_s, u"Sunday Figures"_s, u"--year"_s, last, u"--paper"_s, u"letter"_s},
+        {u"Yearly Comparison"_s, u"--from"_s, last, u"--to"_s, now, u"--chart"_s, u"2D Line"_s},
+    };
+    for (const auto& words : cases) {
+        const auto written = run(QStringList{u"weekly-report"_s, u"--pdf"_s, pdf()} + words);
+        EXPECT_EQ(written.status, 0) << words.join(u' ').toStdString() << "\n" << written;
+        EXPECT_TRUE(content(pdf()).startsWith("%PDF-"));
+        QFile::remove(pdf());
+    }
+}
+
 TEST_F(KindrelctlTest, AReportThatCannotBeWrittenLeavesTheOldFile)
 {
     make_church(3);
@@ -131,6 +152,14 @@ TEST_F(KindrelctlTest, WhatCannotBeFoundIsRefusedWithAMessageOnStandardError)
     const std::vector<std::pair<QStringList, QByteArray>> cases{
         {{u"family"_s, u"4711"_s}, "There is no family with the key 4711."},
         {{u"report"_s, u"k9999"_s, u"--pdf"_s, pdf()}, "There is no report \"k9999\""},
+        {{u"weekly-report"_s, u"Hourly Totals"_s, u"--pdf"_s, pdf()}, "weekly_table_report (Monthly Totals)"},
+        {{u"weekly-report"_s, u"Monthly Totals"_s, u"--pdf"_s, pdf()}, "Please enter an analysis year"},
+        {{u"weekly-report"_s, u"Weekly Totals"_s, u"--pdf"_s, pdf(), u"--project"_s, u"Fliers"_s},
+         "Please choose a weekly project"},
+        {{u"weekly-report"_s, u"Weekly Totals"_s, u"--pdf"_s, pdf(), u"--category"_s, u"Fliers"_s},
+         "The project has no category \"Fliers\"."},
+        {{u"weekly-report"_s, u"Monthly Totals"_s, u"--pdf"_s, pdf(), u"--chart"_s, u"4D Bar"_s},
+         "There is no chart style \"4D Bar\"."},
         {{u"people"_s, u"--group"_s, u"Fliers"_s}, "There is no group \"Fliers\"."},
         {{u"people"_s, u"--sort"_s, u"height"_s}, "There is no order and no date \"height\"."},
     };
@@ -183,6 +212,7 @@ TEST_F(KindrelctlTest, EveryCommandOnAChurchAsksForItsRight)
         {{u"people"_s}, "\"Export\""},
         {{u"reports"_s}, "\"Report Outputs\""},
         {{u"report"_s, u"k10"_s, u"--pdf"_s, pdf()}, "\"Report Outputs\""},
+        {{u"weekly-report"_s, u"Monthly Totals"_s, u"--pdf"_s, pdf()}, "\"Weekly Statistics\""},
         {{u"backup"_s, u"--to"_s, drive.path()}, "\"Backup Data\""},
         {{u"backups"_s}, "\"Backup Data\""},
         {{u"show-backup"_s, u"backup.zip"_s}, "\"Restore Data\""},
@@ -229,6 +259,7 @@ TEST_F(KindrelctlTest, WrongUsageIsToldApartFromRefusal)
         {u"make-church"_s, u"--families"_s, u"0"_s},
         {u"report"_s, u"k10"_s},
         {u"report"_s, u"k10"_s, u"--pdf"_s, pdf(), u"--paper"_s, u"a5"_s},
+        {u"weekly-report"_s, u"Monthly Totals"_s},
         {u"people"_s, u"--list"_s, u"Sleeping Families"_s},
         {u"people"_s, u"--people"_s, u"active,asleep"_s},
         {u"people"_s, u"--age"_s, u"old"_s},
@@ -258,6 +289,18 @@ TEST_F(KindrelctlTest, TheHelpNamesEveryCommandAndEachExplainsItself)
         const auto own = run({word, u"--help"_s});
         EXPECT_EQ(own.status, 0) << own;
         EXPECT_TRUE(own.out.startsWith("Usage: kindrelctl [OPTIONS] " + word.toUtf8())) << own;
+    }
+}
+
+TEST_F(KindrelctlTest, TheMakerOfDataTellsItsUsageAndMakesNothing)
+{
+    for (const auto& [words, status] : {std::pair{QStringList{u"--help"_s}, 0}, {{}, 2}, {{u"--fly"_s}, 1}}) {
+        QProcess program;
+        program.setWorkingDirectory(drive.path());
+        program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrel-make-data"_s, words);
+        ASSERT_TRUE(program.waitForFinished());
+        EXPECT_EQ(program.exitCode(), status) << program.readAllStandardError().toStdString();
+        EXPECT_TRUE(QDir(drive.path()).isEmpty());
     }
 }
 

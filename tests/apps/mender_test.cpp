@@ -154,6 +154,31 @@ TEST_F(MenderProgramTest, AChurchThatDoesNotOpenIsSetAsideAndComesBackFromItsBac
     EXPECT_EQ(families(), 30);
 }
 
+TEST_F(MenderProgramTest, ARecoveredFileIsPutInPlaceOnceNobodyWritesInTheDamagedOne)
+{
+    in_church(u"CREATE TABLE [unused] ([a]);"_s);
+    const int page = count(u"SELECT [rootpage] FROM sqlite_master WHERE [name]='unused';"_s);
+    QByteArray content = DataFolder::read(database());
+    content.replace(qsizetype(page - 1) * 4096, 8, QByteArray(8, 'x'));
+    DataFolder::write(database(), content);
+    const QString fresh = drive.filePath(u"fresh.kdl"_s);
+    ASSERT_EQ(mender({u"recover"_s, fresh, u"--yes"_s}).status, 0);
+    auto writer = open_sqlite(database());
+    writer->execute(u"BEGIN IMMEDIATE;"_s);
+    for (const auto& act : {QStringList{u"set-aside"_s}, {u"put-in-place"_s, fresh}}) {
+        const auto refused = mender(act + QStringList{u"--yes"_s});
+        EXPECT_EQ(refused.status, 1) << refused;
+        EXPECT_TRUE(refused.err.contains("Somebody is writing in the church just now.")) << refused;
+        EXPECT_TRUE(QFile::exists(database()) && QFile::exists(fresh));
+    }
+    writer.reset();
+    const auto put = mender({u"put-in-place"_s, fresh, u"--yes"_s});
+    EXPECT_EQ(put.status, 0) << put;
+    EXPECT_TRUE(put.out.contains("KR10_records set aside")) << put;
+    EXPECT_EQ(families(), 30);
+    EXPECT_FALSE(QFile::exists(fresh));
+}
+
 TEST_F(MenderProgramTest, WrongUsageIsToldAndNothingIsDone)
 {
     for (const QStringList& words : {QStringList{},

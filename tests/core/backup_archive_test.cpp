@@ -1,12 +1,14 @@
 #include "core/backup_archive.h"
 
 #include "backup_place.h"
+#include "core/backup_files.h"
 #include "core/backup_reading.h"
 #include "core/sqlite_session.h"
 
 #include <QCryptographicHash>
 #include <QFileInfo>
 #include <QRandomGenerator>
+#include <QtEndian>
 
 #include <zip.h>
 
@@ -81,11 +83,12 @@ protected:
     {
         const QTemporaryDir scratch;
         SilentProgress progress;
-        ByteMeter meter(progress, 1);
+        ByteMeter meter(progress, manifest.bytes());
         try {
             const OpenBackup backup(archive, {});
             unpack(backup, scratch.path() + u'/', Unpack::everything, meter);
-            EXPECT_EQ(DataFolder::read(scratch.path() + u"/church/Portrait/1.jpg"_s), "a picture");
+            for (const Entry& entry : entries)
+                EXPECT_EQ(DataFolder::read(scratch.path() + u'/' + QString::fromUtf8(entry.name)), entry.content);
             return std::nullopt;
         } catch (const BackupError& error) {
             return error.fault();
@@ -225,9 +228,8 @@ TEST_F(BackupArchiveTest, WhatIsNoArchiveOrOnlyHalfOfOneIsRefused)
     EXPECT_NE(fault_of_bytes({}), std::nullopt);
     EXPECT_EQ(fault_of_bytes("hello"), BackupFault::foreign);
     EXPECT_NE(fault_of_bytes(QByteArray(100'000, 'P')), std::nullopt);
-    for (int part = 1; part < 20; ++part)
-        EXPECT_NE(fault_of_bytes(whole.left(whole.size() * part / 20)), std::nullopt) << part;
-    EXPECT_NE(fault_of_bytes(whole.left(whole.size() - 1)), std::nullopt);
+    for (qsizetype size = whole.size() - 1; size > 0; size -= size > whole.size() - 1500 ? 1 : whole.size() / 50)
+        EXPECT_NE(fault_of_bytes(whole.left(size)), std::nullopt) << size;
     EXPECT_NE(fault_of_bytes(whole.mid(100)), std::nullopt);
     QFile::remove(archive);
     EXPECT_EQ(fault_of_file(), BackupFault::missing);
@@ -250,19 +252,193 @@ TEST_F(BackupArchiveTest, AByteThatFlippedNeverPassesForWhatWasSaved)
 {
     make_zip(archive, with_manifest());
     const QByteArray whole = DataFolder::read(archive);
+    const auto database = whole.indexOf("database/KR10_records.kdl");
+    const auto described = whole.indexOf("manifest.json");
     QRandomGenerator random(20240515);
+    int flips = 0;
     int refused = 0;
-    for (int round = 0; round < 300; ++round) {
+    // All that the archive says of its files, and the description; of the database some.
+    for (qsizetype at = 0; at<whole.size(); at += at> database + 100 && at < described - 100 ? 397 : 1) {
         QByteArray bytes = whole;
-        // Half of the flips go to the directory and the small files at the end.
-        const auto span = round % 2 == 0 ? bytes.size() : std::min<qsizetype>(bytes.size(), 4000);
-        for (int flips = 0; flips <= round % 3; ++flips) {
-            const auto at = bytes.size() - 1 - random.bounded(static_cast<quint32>(span));
-            bytes[at] = static_cast<char>(bytes[at] ^ (1 << random.bounded(8)));
-        }
+        bytes[at] = static_cast<char>(bytes[at] ^ (1 << random.bounded(8)));
+        ++flips;
         refused += fault_of_bytes(bytes).has_value() ? 1 : 0;
     }
-    EXPECT_GT(refused, 200);
+    EXPECT_GT(refused, flips / 2);
+}
+
+TEST_F(BackupArchiveTest, ADescriptionIsReadUpToItsLargestLength)
+{
+    auto all = with_manifest();
+    all.back().content = all.back().content.leftJustified(largest_manifest, ' ');
+    EXPECT_EQ(fault_of(all), std::nullopt);
+    all.back().content += ' ';
+    EXPECT_EQ(fault_of(all), BackupFault::foreign);
+
+    const ManifestEntry photograph{u"church/Portrait/a name of fifty letters, as a camera gives it.jpg"_s, 4'000'000,
+                                   QByteArray(64, 'f')};
+    manifest.entries.assign(100'000, photograph);
+    EXPECT_LT(manifest.to_json().size(), largest_manifest);
+}
+
+namespace {
+
+/// What somebody does to a backup, to its files before they are packed and then to the bytes of the archive, and what
+/// the person is told.
+struct Attack
+{
+    const char* what;
+    const char* told;
+    std::function<void(std::vector<Entry>&)> pack;
+    std::function<QByteArray(const QByteArray&)> spoil;
+};
+
+Attack named(const char* what, const char* told, const QByteArray& name, quint32 mode = 0100644)
+{
+    const QByteArray stand_in(name.size(), '#');
+    return {what, told,
+            [=](auto& entries) {
+                entries.push_back({stand_in, "/etc", mode});
+            },
+            [=](const QByteArray& bytes) {
+                return QByteArray(bytes).replace(stand_in, name);
+            }};
+}
+
+std::vector<Attack> attacks_by_names()
+{
+    const char* out = "leads out of the church's folders";
+    return {
+        named("a name that leads up", out, "church/Portrait/../../../escaped"),
+        named("a name from the root", out, "/escaped"),
+        named("a name with backslashes", out, "church\\Portrait\\..\\..\\escaped"),
+        named("a name on a drive", out, "C:/escaped"),
+        named("a name that ends early", "not those that it lists", QByteArray("church/Portrait/escaped\0.jpg", 28)),
+        named("a link", "a link or a device", "church/Portrait/escaped", 0120777),
+        named("a file twice", "is damaged", "church/Portrait/1.jpg"),
+    };
+}
+
+const QByteArray first_file = "church/NBook/F1.fll";
+
+/// Lets the files whose names begin so claim that they are so many bytes long.
+Attack claiming(const char* what, const char* told, const std::function<void(std::vector<Entry>&)>& pack,
+                const QByteArray& names, quint32 size)
+{
+    return {what, told, pack, [=](QByteArray bytes) {
+                const auto claim = [&](const QByteArray& mark, qsizetype size_at, qsizetype name_at) {
+                    for (auto at = bytes.indexOf(mark); at >= 0; at = bytes.indexOf(mark, at + 4)) {
+                        if (bytes.mid(at + name_at, names.size()) == names)
+                            qToLittleEndian(size, bytes.data() + at + size_at);
+                    }
+                };
+                claim("PK\3\4", 22, 30);
+                claim("PK\1\2", 24, 46);
+                return bytes;
+            }};
+}
+
+std::vector<Attack> attacks_by_content(const Entry& first)
+{
+    constexpr quint32 most = 0xFFFFFFFE;
+    const auto size = static_cast<quint32>(first.content.size());
+    const auto nothing = [](auto&) {
+    };
+    const auto zeros = [](auto& entries) {
+        entries.front().content = QByteArray(40'000'000, '\0');
+    };
+    const auto many = [](auto& entries) {
+        for (int file = 0; file < 300; ++file)
+            entries.push_back({"church/NBook/" + QByteArray::number(file), "x"});
+    };
+    const auto as_packed = [](const QByteArray& bytes) {
+        return bytes;
+    };
+    return {
+        claiming("a small file that unpacks to a large one", "is damaged", zeros, first_file, size),
+        claiming("a file that is shorter than it says", "not those that it lists", nothing, first_file, most),
+        claiming("files that would fill any disk", "would fill any disk", many, "church/NBook/", most),
+        {"another content", "differs from what was saved",
+         [](auto& entries) { entries.front().content.replace("first", "First"); }, as_packed},
+        {"a file fewer", "not those that it lists", [](auto& entries) { entries.erase(entries.begin()); }, as_packed},
+        {"half of it", "is not a Kindrel backup", nothing,
+         [](auto& bytes) {
+             return bytes.left(bytes.size() / 2);
+         }},
+        {"a byte less", "is not a Kindrel backup", nothing,
+         [](auto& bytes) {
+             return bytes.chopped(1);
+         }},
+        {"nothing", "is not a Kindrel backup", nothing,
+         [](auto&) {
+             return QByteArray();
+         }},
+    };
+}
+
+} // namespace
+
+class AttackedBackupTest : public testing::Test
+{
+protected:
+    void SetUp() override
+    {
+        const ArchiveReader reader(place.back_up(), {});
+        for (const ArchiveEntry& entry : reader.entries()) {
+            QByteArray content;
+            reader.read(entry, [&](QByteArrayView piece) { content += piece; });
+            entries.push_back({entry.name.toUtf8(), content});
+        }
+        place.write_church(u"second"_s);
+        before = place.state();
+    }
+    void expect_refusal(const std::string& what, const char* words, const RestoreRequest& request)
+    {
+        place.dialogue().told.clear();
+        EXPECT_FALSE(restore_backup(place.office(), request, place.started->silent)) << what;
+
+        const QString told = place.dialogue().told.join(u'|');
+        EXPECT_TRUE(told.startsWith(u"Restoring files failed because:-\n"_s)) << what << ": " << told.toStdString();
+        EXPECT_TRUE(told.contains(QString::fromUtf8(words))) << what << ": " << told.toStdString();
+        EXPECT_EQ(place.state(), before) << what;
+        EXPECT_TRUE(place.leftovers().isEmpty()) << what << place.leftovers().join(u' ').toStdString();
+        EXPECT_EQ(files_within(place.data.drive()).filter(u"escaped"_s), QStringList()) << what;
+    }
+    void expect_refusals(const std::vector<Attack>& attacks)
+    {
+        for (const Attack& attack : attacks) {
+            auto changed = entries;
+            attack.pack(changed);
+            make_zip(archive, changed);
+            DataFolder::write(archive, attack.spoil(DataFolder::read(archive)));
+            expect_refusal(attack.what, attack.told, {.file = archive});
+        }
+    }
+
+    BackupPlace place{EngineKind::sqlite};
+    QString archive = place.data.drive() + u"backup.zip"_s;
+    std::vector<Entry> entries;
+    QMap<QString, QByteArray> before;
+};
+
+TEST_F(AttackedBackupTest, WhateverIsWrongIsToldAndTheChurchStaysAsItIs)
+{
+    ASSERT_EQ(entries.front().name, first_file);
+    expect_refusals(attacks_by_names());
+    expect_refusals(attacks_by_content(entries.front()));
+
+    make_zip(archive, entries);
+    EXPECT_TRUE(restore_backup(place.office(), {.file = archive}, place.started->silent)) << "As it was, it is sound.";
+}
+
+TEST_F(AttackedBackupTest, WithoutThePasswordOrWithAnotherNothingIsRestored)
+{
+    const QTemporaryDir disk;
+    const QString locked = place.back_up({.folder = disk.path(), .password = u"für uns"_s});
+    expect_refusal("no password", "only be read with its password", {.file = locked});
+    for (const auto& password : {u"fur uns"_s, u"für uns "_s, u"FÜR UNS"_s})
+        expect_refusal(password.toStdString(), "The password of the backup is wrong",
+                       {.file = locked, .password = password});
 }
 
 } // namespace kindrel::test

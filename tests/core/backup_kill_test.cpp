@@ -57,8 +57,9 @@ TEST_P(BackupKillTest, AKillDuringABackupLeavesTheChurchAndSoundBackupsOnly)
         EXPECT_FALSE(place->archives().isEmpty());
         for (const auto& archive : place->archives()) {
             const QTemporaryDir scratch;
-            ByteMeter meter(place->started->silent, 1);
-            EXPECT_NO_THROW(unpack(OpenBackup(archive, {}), scratch.path() + u'/', Unpack::everything, meter));
+            const OpenBackup backup(archive, {});
+            ByteMeter meter(place->started->silent, backup.manifest.bytes());
+            EXPECT_NO_THROW(unpack(backup, scratch.path() + u'/', Unpack::everything, meter));
         }
     }
     for (int folder = 1; folder <= 5; ++folder)

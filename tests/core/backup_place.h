@@ -24,6 +24,8 @@ public:
     bool confirm(const core::Message& message, core::Answer) override
     {
         asked += message.text;
+        if (on_confirm)
+            on_confirm();
         return true;
     }
     std::optional<bool> confirm_or_cancel(const core::Message&) override { return true; }
@@ -33,6 +35,7 @@ public:
     void play(const QString&) override {}
 
     QStringList told, asked;
+    std::function<void()> on_confirm;
 };
 
 /// Gives up at a certain step; 0: at none.

@@ -4,6 +4,8 @@
 
 #include <QElapsedTimer>
 
+#include <unistd.h>
+
 namespace kindrel::test {
 
 using namespace Qt::StringLiterals;
@@ -54,7 +56,7 @@ TEST_P(CopyKillTest, AKillLeavesTheChurchWholeAndTheCopyWholeOrNotThere)
     ASSERT_EQ(place->target_sums(), source);
     make_older();
     const auto older = place->target_sums();
-    std::array<int, 2> finished{};
+    int finished = 0;
     for (int kill = 0; kill < kills; ++kill) {
         const bool replace = kill % 2 == 1;
         if (replace && !place->target_present()) {
@@ -73,17 +75,39 @@ TEST_P(CopyKillTest, AKillLeavesTheChurchWholeAndTheCopyWholeOrNotThere)
         }
         const auto found = place->target_sums();
         EXPECT_TRUE(found == source || (replace && found == older)) << "kill " << kill;
-        finished[replace ? 1 : 0] += found == source ? 1 : 0;
+        finished += !replace && found == source ? 1 : 0;
         if (!place->target().file.isEmpty())
             check_church_file(place->target().file);
     }
-    EXPECT_LT(finished[0], kills / 2) << "No kill came in the middle.";
+    EXPECT_LT(finished, kills / 2) << "No kill came in the middle.";
     place->leave();
     place->remove_target();
     place->leave();
     (void)duration_of_copy();
     EXPECT_EQ(place->target_sums(), source) << "The next copy must not stumble over what is left.";
     EXPECT_TRUE(place->tidy());
+}
+
+TEST_P(CopyKillTest, AKillRightAfterTheEndLeavesTheNewCopy)
+{
+    const auto source = place->source_sums();
+    for (const bool replace : {false, true}) {
+        if (replace)
+            make_older();
+        place->leave();
+        const auto copy_once = [&](const Ready& ready) {
+            StartedOffice started(place->paths());
+            if (!copy_church(started.office, {.to = place->target(), .replace = replace}, started.silent))
+                throw std::runtime_error(started.dialogue.told.join(u'\n').toStdString());
+            ready();
+            pause();
+        };
+        run_and_kill(copy_once, microseconds(0));
+        place->leave();
+
+        EXPECT_EQ(place->target_sums(), source) << (replace ? "over an older copy" : "where nothing was");
+        EXPECT_TRUE(place->tidy());
+    }
 }
 
 } // namespace kindrel::test

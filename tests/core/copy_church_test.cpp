@@ -1,4 +1,5 @@
 #include "copy_place.h"
+#include "core/backup_meter.h"
 #include "core/locks.h"
 #include "core/schema.h"
 
@@ -115,9 +116,47 @@ TEST_P(CopyChurchTest, NothingIsCopiedWhileSomebodyIsInside)
     EXPECT_TRUE(copy());
 }
 
+TEST_P(CopyChurchTest, NothingIsCopiedIntoTheFolderOfAChurchThatIsBusy)
+{
+    const QTemporaryDir neighbour;
+    const QString file = neighbour.filePath(u"KR10_records.kdl"_s);
+    DataFolder::write(neighbour.filePath(u"LOCK.DAT"_s), "1234567890");
+    auto& started = place->started();
+
+    EXPECT_FALSE(copy_church(started.office, {.to = {.file = file}}, started.silent));
+
+    EXPECT_TRUE(told().contains(u"Another user is either compacting files"_s)) << told().toStdString();
+    EXPECT_EQ(QDir(neighbour.path()).entryList(QDir::Files), QStringList(u"LOCK.DAT"_s));
+    EXPECT_TRUE(place->tidy());
+    QFile::remove(neighbour.filePath(u"LOCK.DAT"_s));
+    EXPECT_TRUE(copy_church(started.office, {.to = {.file = file}}, started.silent)) << told().toStdString();
+}
+
+TEST_P(CopyChurchTest, AnOlderCopyThatSomebodyWorksInIsNotReplaced)
+{
+    ASSERT_TRUE(copy());
+    place->open_target()->execute(u"DELETE FROM [tbl_surname];"_s);
+    place->leave();
+    auto& started = place->started();
+    FakeWorkstation another;
+    another.machine = u"office-2"_s;
+    const auto theirs = place->open_target();
+    ASSERT_TRUE(Locks(*theirs, another, started.clock).take(LockKind::family, 3));
+    const auto older = sums_in(*theirs);
+
+    EXPECT_FALSE(copy_church(started.office, {.to = place->target(), .replace = true}, started.silent));
+
+    EXPECT_TRUE(told().contains(u"Unable to copy the church while somebody is working in it."_s));
+    EXPECT_TRUE(told().contains(u"office-2"_s)) << told().toStdString();
+    EXPECT_EQ(told().contains(u"Connected to the database on the server: 1."_s), place->target().file.isEmpty());
+    EXPECT_TRUE(started.dialogue.asked.isEmpty());
+    EXPECT_EQ(sums_in(*theirs), older);
+    EXPECT_TRUE(place->tidy());
+}
+
 TEST_P(CopyChurchTest, GivenUpAtAnyStepThereIsNoCopy)
 {
-    for (const int last : {1, 20, 50}) {
+    for (const int last : {1, 200, ByteMeter::meter_steps}) {
         place->leave();
         auto& started = place->started();
         StoppingProgress progress(last);

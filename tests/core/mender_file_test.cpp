@@ -1,7 +1,6 @@
 #include "mender_place.h"
 
 #include "core/church_recovery.h"
-#include "core/locks.h"
 #include "core/sqlite_session.h"
 #include "core/verified_copy.h"
 
@@ -241,55 +240,6 @@ TEST_P(MenderFileTest, OfATruncatedFileComesBackWhatIsLeft)
         expect_true_families(fresh(), told);
         EXPECT_EQ(DataFolder::read(church->file()), content);
     }
-}
-
-TEST_P(MenderFileTest, ADamagedChurchFileIsSetAsideAndASoundOneIsNot)
-{
-    place->session.reset();
-    church->close();
-    const QString file = in_church(u"KR10_records.kdl"_s);
-    ASSERT_TRUE(QFile::rename(church->file(), file));
-    place->session = open_sqlite(file);
-    EXPECT_THROW((void)set_database_aside(*place), FileError);
-    place->session.reset();
-
-    DataFolder::write(file, "no database");
-    DataFolder::write(file + u"-journal"_s, "its journal");
-    DataFolder::write(in_church(u"lock.dat"_s), "1234567890");
-    EXPECT_THROW((void)set_database_aside(*place), FileError);
-    EXPECT_TRUE(QFile::exists(file));
-
-    QFile::remove(in_church(u"lock.dat"_s));
-    const QString aside = set_database_aside(*place);
-    EXPECT_FALSE(QFile::exists(file));
-    EXPECT_FALSE(QFile::exists(file + u"-journal"_s));
-    EXPECT_EQ(DataFolder::read(aside), "no database");
-    EXPECT_EQ(DataFolder::read(aside + u"-journal"_s), "its journal");
-    EXPECT_TRUE(aside.startsWith(in_church(u"mended/"_s))) << aside.toStdString();
-}
-
-TEST_P(MenderFileTest, AFileIsNotSetAsideUnderSomebodyWhoIsInside)
-{
-    FakeWorkstation other;
-    other.machine = u"office-2"_s;
-    ASSERT_TRUE(Locks(session(), other, clock).take(LockKind::family, 1));
-    session().execute(u"CREATE TABLE [unused] ([a]);"_s);
-    const auto page =
-        static_cast<quint32>(number_of(session(), u"SELECT [rootpage] FROM sqlite_master WHERE [name]='unused';"_s));
-    place->session.reset();
-    QByteArray content = closed_content();
-    content.replace(static_cast<qsizetype>(page - 1) * page_size, 8, QByteArray(8, 'x'));
-    const QString file = in_church(u"KR10_records.kdl"_s);
-    DataFolder::write(file, content);
-    place->session = open_sqlite(file);
-
-    EXPECT_THROW((void)set_database_aside(*place), FileError);
-    EXPECT_EQ(DataFolder::read(file), content);
-    EXPECT_FALSE(QFile::exists(in_church(u"lock.dat"_s)));
-
-    place->session->execute(u"DELETE FROM [tbl_locked_family_files];"_s);
-    (void)set_database_aside(*place);
-    EXPECT_FALSE(QFile::exists(file));
 }
 
 TEST_P(MenderFileTest, RecoveringNeverWritesOverAFileAndLeavesNothingOfAFailure)

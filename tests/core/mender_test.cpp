@@ -303,6 +303,37 @@ TEST_P(MenderTest, SideFilesKeepWhatCanBeReadOfThem)
     EXPECT_EQ(DataFolder::read(in_church(u"mended/Church_S.Dat"_s)), "Saint Anne's         Chapel");
 }
 
+TEST_P(MenderTest, AFileThatCannotBeMendedIsLeftAndWhatWasMendedIsToldWithTheCopy)
+{
+    static const QString unable = u"The disk is full."_s;
+    const Check failing{Check::On::files, [](MenderPlace&) { return Findings{}; },
+                        [](MenderPlace&) {
+                            throw FileError(unable);
+                        }};
+    run({u"DELETE FROM [tbl_address];"_s});
+    const auto mending = mend_church(*place, {&failing, 1});
+    EXPECT_TRUE(QFile::exists(mending.copy));
+    ASSERT_EQ(mending.mended.size(), 1U) << told(mending.mended);
+    EXPECT_EQ(mending.mended.front().words, u"2 families without an address record."_s);
+    ASSERT_EQ(mending.left.size(), 1U) << told(mending.left);
+    EXPECT_EQ(mending.left.front().words, unable);
+    EXPECT_EQ(mending.left.front().cure, Cure::by_hand);
+}
+
+TEST_P(MenderTest, TryingAgainToMendAFileThatMayNotBeWrittenLeavesNoHeapOfCopies)
+{
+    const QString names = paths->folder(Folder::global) + u"Church_S.Dat"_s;
+    ASSERT_TRUE(QFile::link(u"/proc/version"_s, names)); // Which nobody may write.
+    DataFolder::write(in_church(u"loaded.dat"_s), {});
+    for (int attempt = 1; attempt <= 2; ++attempt) {
+        const auto left = mend_church(*place, {}).left;
+        EXPECT_EQ(std::ranges::count(left, u"side_files"_s, &Finding::kind), 1) << told(left);
+        EXPECT_EQ(std::ranges::count(left, Cure::by_hand, &Finding::cure), 1) << told(left);
+        EXPECT_EQ(mended_files().filter(u"Church_S"_s), QStringList());
+    }
+    EXPECT_EQ(mended_files().filter(u"loaded"_s), QStringList{u"loaded.dat"_s}) << "The others are mended.";
+}
+
 TEST_P(MenderTest, WhatTheSchemaLacksIsMadeAgain)
 {
     struct Damage

@@ -15,6 +15,8 @@ namespace {
 
 /// What a test does when something is flushed to the disk.
 std::function<void()> on_flush; // NOLINT: set and unset by one test.
+/// A part of the names of files that cannot be removed.
+QByteArray kept_name; // NOLINT: the same.
 
 } // namespace
 
@@ -25,6 +27,17 @@ extern "C" int syncfs(int opened) noexcept
         on_flush();
     static const auto own = reinterpret_cast<int (*)(int)>(dlsym(RTLD_NEXT, "syncfs"));
     return own(opened);
+}
+
+/// The same.
+extern "C" int unlink(const char* name) noexcept
+{
+    if (!kept_name.isEmpty() && QByteArrayView(name).contains(kept_name)) {
+        errno = EACCES;
+        return -1;
+    }
+    static const auto own = reinterpret_cast<int (*)(const char*)>(dlsym(RTLD_NEXT, "unlink"));
+    return own(name);
 }
 
 namespace kindrel::test {
@@ -51,7 +64,11 @@ protected:
     {
         return restore_backup(place->office(), request, place->started->silent);
     }
-    void TearDown() override { on_flush = nullptr; }
+    void TearDown() override
+    {
+        on_flush = nullptr;
+        kept_name.clear();
+    }
     void expect_refusal(const QString& words)
     {
         EXPECT_FALSE(restore({.file = backup}));
@@ -250,6 +267,38 @@ TEST_P(RestoreTest, AFileThatCannotBeBackedUpDoesNotKeepTheBackupOut)
     EXPECT_EQ(place->state(), old_state);
 }
 
+TEST_P(RestoreTest, WhatCannotBeClearedUpOrListedDoesNotMakeARestoreFail)
+{
+    for (int before = 0; before < 3; ++before) {
+        place->started->clock.set(QDate(2024, 6, 2 + before));
+        ASSERT_TRUE(restore({.file = backup}));
+    }
+    place->write_church(u"second"_s);
+    ASSERT_TRUE(QFile::remove(place->church() + u"backups.json"_s) &&
+                QDir().mkdir(place->church() + u"backups.json"_s));
+    place->started->clock.set(QDate(2024, 6, 9));
+    kept_name = "Before_restore";
+    place->dialogue().told.clear();
+
+    const auto report = restore({.file = backup});
+    ASSERT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
+    EXPECT_TRUE(place->dialogue().told.isEmpty());
+    EXPECT_EQ(place->state(), old_state);
+
+    ASSERT_TRUE(restore({.file = report->before}));
+    EXPECT_EQ(place->state()[u"families"_s], new_state[u"families"_s]);
+}
+
+TEST_P(RestoreTest, NobodyIsKeptOutWhileThePersonThinksItOver)
+{
+    QStringList seen;
+    place->dialogue().on_confirm = [&] {
+        seen += QFile::exists(place->church() + u"lock.dat"_s) ? u"locked"_s : u"open"_s;
+    };
+    ASSERT_TRUE(restore({.file = backup}));
+    EXPECT_EQ(seen, QStringList{u"open"_s});
+}
+
 TEST_P(RestoreTest, TablesThatAreMissingComeBack)
 {
     if (GetParam() != EngineKind::sqlite)
@@ -341,7 +390,7 @@ TEST_P(RestoreTest, WithoutTheRightOrOnBookedOutDataNothingIsRestored)
 
 TEST_P(RestoreTest, GivenUpAtAnyStepNothingChanges)
 {
-    for (int last = 1;; last += 3) {
+    for (int last = 1;; last += 41) {
         StoppingProgress progress(last);
         const bool restored = restore_backup(place->office(), {.file = backup}, progress).has_value();
         EXPECT_TRUE(progress.ended);

@@ -47,12 +47,6 @@ protected:
         settle();
     }
     [[nodiscard]] desktop::Page& page() { return *window().page(); }
-    void tab_to(const QString& name)
-    {
-        for (int step = 0; step < 40 && window().focusWidget()->objectName() != name; ++step)
-            press(window(), Qt::Key_Tab);
-        ASSERT_EQ(window().focusWidget()->objectName(), name);
-    }
     void push(const QString& name)
     {
         tab_to(name);

@@ -7,6 +7,7 @@
 #include "support/families.h"
 
 #include <QComboBox>
+#include <QPushButton>
 
 namespace kindrel::test {
 
@@ -85,6 +86,16 @@ TEST_F(CataloguePageTest, AnOwnLayoutIsFoundOnEnteringAndOpensInAPreviewOnTheCho
     const auto page = previews.front()->document().page(1);
     EXPECT_TRUE(pages::texts_of(page, 1).contains(u"Naismith"_s));
     EXPECT_EQ(page.size.toSize(), QSize(612, 792));
+}
+
+TEST_F(CataloguePageTest, WhoWantsOtherPeopleOnTheReportGoesOnToTagging)
+{
+    open();
+
+    child<QPushButton>(window(), u"open_tagging"_s).click();
+    settle();
+
+    EXPECT_EQ(window().page()->objectName(), u"Tagging"_s);
 }
 
 TEST_F(CataloguePageTest, TheFirstReportIsChosenAndAnotherChoiceStaysOnEnteringAgain)

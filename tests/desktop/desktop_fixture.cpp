@@ -10,6 +10,13 @@
 
 namespace kindrel::test {
 
+namespace {
+
+/// More than any page has widgets to step through.
+constexpr int most_steps = 80;
+
+} // namespace
+
 DesktopTest::DesktopTest() : look(*qobject_cast<QApplication*>(QCoreApplication::instance()))
 {
     qobject_cast<desktop::Application*>(QCoreApplication::instance())->set_dialogue(place.dialogue);
@@ -42,6 +49,13 @@ void DesktopTest::begin_again()
     if (!running->start(1))
         throw std::runtime_error("The program does not start");
     settle();
+}
+
+void DesktopTest::tab_to(const QString& name)
+{
+    for (int step = 0; step < most_steps && window().focusWidget()->objectName() != name; ++step)
+        press(window(), Qt::Key_Tab);
+    ASSERT_EQ(window().focusWidget()->objectName(), name);
 }
 
 QStringList visible_texts(const QWidget& window)

@@ -40,6 +40,8 @@ protected:
 
     [[nodiscard]] desktop::Desk& desk() { return *running->desk(); }
     [[nodiscard]] desktop::MainWindow& window() { return *running->window(); }
+    /// Goes on with Tab until the widget of this name has the cursor.
+    void tab_to(const QString& name);
 
     TestStart place;
     FakePrinting printing;

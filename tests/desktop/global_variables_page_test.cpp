@@ -26,12 +26,6 @@ protected:
         running->open_area(u"global_data"_s);
         settle();
     }
-    void tab_to(const QString& name)
-    {
-        for (int step = 0; step < 30 && window().focusWidget()->objectName() != name; ++step)
-            press(window(), Qt::Key_Tab);
-        ASSERT_EQ(window().focusWidget()->objectName(), name);
-    }
     void push(const QString& name)
     {
         tab_to(name);

@@ -35,12 +35,6 @@ protected:
         running->open_area(u"labels"_s);
         settle();
     }
-    void tab_to(const QString& name)
-    {
-        for (int step = 0; step < 40 && window().focusWidget()->objectName() != name; ++step)
-            press(window(), Qt::Key_Tab);
-        ASSERT_EQ(window().focusWidget()->objectName(), name);
-    }
     void choose(const QString& stock)
     {
         for (int step = 0; step < 30 && stock_shown() != stock; ++step)

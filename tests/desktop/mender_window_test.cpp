@@ -31,19 +31,22 @@ const QString no_address = u"2 families without an address record."_s;
 class WatchedWorkstation : public FakeWorkstation
 {
 public:
-    WatchedWorkstation(const FakeWorkstation& like, std::function<void()> watch)
-        : FakeWorkstation(like), m_watch(std::move(watch))
+    WatchedWorkstation(const FakeWorkstation& like, std::function<void()> watch, const bool& fails)
+        : FakeWorkstation(like), m_watch(std::move(watch)), m_fails(fails)
     {
     }
     [[nodiscard]] QString program_folder() const override
     {
         if (m_watch && QThread::currentThread() != QCoreApplication::instance()->thread())
             QMetaObject::invokeMethod(QCoreApplication::instance(), m_watch, Qt::BlockingQueuedConnection);
+        if (m_fails)
+            throw 0;
         return FakeWorkstation::program_folder();
     }
 
 private:
     std::function<void()> m_watch;
+    const bool& m_fails; ///< In a way that nobody reckons with.
 };
 
 class MenderWindowTest : public testing::Test
@@ -75,7 +78,7 @@ protected:
     void open(const core::StartRequest& request = {})
     {
         window = std::make_unique<desktop::MenderWindow>(desktop::MenderSurroundings{
-            .workstation = [this] { return std::make_unique<WatchedWorkstation>(place.workstation, watch); },
+            .workstation = [this] { return std::make_unique<WatchedWorkstation>(place.workstation, watch, fails); },
             .dialogue = place.dialogue,
             .clock = place.clock,
             .windows = windows,
@@ -129,6 +132,7 @@ protected:
 
     TestStart place;
     std::function<void()> watch;
+    bool fails = false;
     desktop::Look look;
     QTemporaryDir remembered_in;
     desktop::Remembered remembered{core::as_folder(remembered_in.path()), 1};
@@ -251,6 +255,7 @@ TEST_F(MenderWindowTest, ADamagedFileIsRecoveredIntoANewOneAndLeftAsItIs)
     EXPECT_TRUE(lines().contains(u"•  families: 2 rows"_s)) << told().toStdString();
     EXPECT_EQ(count(fresh, u"tbl_surname"_s), 2);
     EXPECT_EQ(DataFolder::read(database()), content);
+    EXPECT_EQ(focus(), u"put_in_place"_s);
 
     place.dialogue.expect_file(u"A new church file for what can be read"_s, fresh);
     place.dialogue.expect_confirm(u"Write what can be read of '%1' into '%2'?"_s.arg(database(), fresh), Answer::yes);
@@ -258,6 +263,31 @@ TEST_F(MenderWindowTest, ADamagedFileIsRecoveredIntoANewOneAndLeftAsItIs)
     click(u"recover"_s);
     EXPECT_EQ(outcome(), u"Failed"_s);
     EXPECT_TRUE(lines().contains(u"'%1' exists already; name a new file."_s.arg(fresh))) << told().toStdString();
+}
+
+TEST_F(MenderWindowTest, ARecoveredFileIsPutInPlaceAndTheChurchIsMended)
+{
+    damage();
+    QByteArray content = DataFolder::read(database());
+    content.chop(content.size() / 20);
+    DataFolder::write(database(), content);
+    open_and_check();
+    const QString fresh = place.data.drive() + u"fresh.kdl"_s;
+    place.dialogue.expect_file(u"A new church file for what can be read"_s, fresh);
+    place.dialogue.expect_confirm(u"Write what can be read of '%1' into '%2'?"_s.arg(database(), fresh), Answer::yes);
+    click(u"recover"_s);
+    ASSERT_EQ(focus(), u"put_in_place"_s) << told().toStdString();
+    place.dialogue.expect_confirm(u"Put '%1' in the place of the church file of church 1, which is kept in the folder "
+                                  "'mended', and mend the church? Nobody may be inside."_s.arg(fresh),
+                                  Answer::yes, Answer::no);
+    press(*window, Qt::Key_Return);
+    const QString aside = in_church(u"mended/KR10_records set aside 2024-05-15 103000.kdl"_s);
+    EXPECT_TRUE(lines().contains(u"The recovered records stand in '%1' now."_s.arg(database())))
+        << told().toStdString();
+    EXPECT_TRUE(lines().contains(u"The damaged church file lies in '%1' now."_s.arg(aside))) << told().toStdString();
+    EXPECT_EQ(DataFolder::read(aside), content);
+    EXPECT_EQ(count(database(), u"tbl_address"_s), 2) << told().toStdString();
+    EXPECT_FALSE(QFile::exists(fresh) || offers(u"put_in_place"_s));
 }
 
 TEST_F(MenderWindowTest, ADamagedFileIsSetAsideSoThatABackupCanBeRestored)
@@ -358,6 +388,80 @@ TEST_F(MenderWindowTest, TheWindowIsDrawnWhileItLooksAndStaysOpenUntilItHasLooke
     EXPECT_TRUE(window->isVisible());
     EXPECT_FALSE(child<QProgressBar>(*window, u"running"_s).isVisibleTo(window.get()));
     EXPECT_TRUE(window->close());
+}
+
+TEST_F(MenderWindowTest, ADriveThatIsTypedAndNotConfirmedIsTheOneThatIsChecked)
+{
+    const DataFolder other;
+    DataFolder::make_church(other.root() + u"church1/"_s);
+    open();
+    auto& drive = child<QLineEdit>(*window, u"data_drive"_s);
+    drive.setFocus();
+    drive.setText(other.drive());
+    damage(); // Of the church that is not meant any more.
+    press(*window, Qt::Key_F5);
+    EXPECT_EQ(drive.text(), other.drive());
+    EXPECT_EQ(outcome(), u"Sound"_s) << told().toStdString();
+    EXPECT_FALSE(offers(u"mend"_s));
+}
+
+TEST_F(MenderWindowTest, WhereTheTypedDriveChangesTheChurchThePersonLooksFirst)
+{
+    const DataFolder other;
+    DataFolder::make_church(other.root() + u"church3/"_s);
+    core::write_side_file(other.paths(core::Mode::normal, 3), core::SideRecord(core::side_files::set_up));
+    open();
+    auto& drive = child<QLineEdit>(*window, u"data_drive"_s);
+    drive.setFocus();
+    drive.setText(other.drive());
+    press(*window, Qt::Key_F5);
+    EXPECT_EQ(lines().first(), u"Which church does not open?"_s);
+    EXPECT_EQ(window->note().text(), u"See which church of this data drive is chosen, then check it."_s);
+    EXPECT_EQ(child<QComboBox>(*window, u"church"_s).currentData(), 3);
+}
+
+TEST_F(MenderWindowTest, NoActReachesAChurchOfADriveThatWasTypedAfterTheCheck)
+{
+    damage();
+    const DataFolder other;
+    DataFolder::make_church(other.root() + u"church1/"_s);
+    open_and_check();
+    ASSERT_TRUE(offers(u"mend"_s));
+    auto& drive = child<QLineEdit>(*window, u"data_drive"_s);
+    const QSignalBlocker unconfirmed(&drive);
+    drive.setText(other.drive());
+    child<QPushButton>(*window, u"mend"_s).click(); // As its key does it, without leaving the field.
+    EXPECT_EQ(lines().first(), u"Which church does not open?"_s);
+    EXPECT_EQ(count(database(), u"tbl_address"_s), 0);
+    EXPECT_FALSE(QFile::exists(other.root() + u"church1/mended"_s));
+}
+
+TEST_F(MenderWindowTest, WorkThatFailsInAnUnknownWayLeavesTheWindowUsable)
+{
+    open();
+    watch = [this] {
+        watch = {};
+        fails = true;
+    };
+    press(*window, Qt::Key_F5);
+    EXPECT_EQ(outcome(), u"Failed"_s) << told().toStdString();
+    fails = false;
+    press(*window, Qt::Key_F5);
+    EXPECT_EQ(outcome(), u"Sound"_s) << told().toStdString();
+    EXPECT_TRUE(window->close());
+}
+
+TEST_F(MenderWindowTest, AChurchThatCannotBeSeenIsCheckedAgainAndNotMovedAway)
+{
+    const QString connection = in_church(u"KR10_records.server"_s);
+    DataFolder::write(connection, "host=127.0.0.1 port=1 dbname=church user=office");
+    open_and_check();
+    EXPECT_TRUE(told().contains(u"The server does not answer as it should: ")) << told().toStdString();
+    EXPECT_FALSE(offers(u"set_aside"_s) || offers(u"put_in_place"_s) || offers(u"mend"_s));
+    EXPECT_EQ(focus(), u"check"_s);
+    QFile::remove(connection);
+    press(*window, Qt::Key_Return);
+    EXPECT_EQ(outcome(), u"Sound"_s) << told().toStdString();
 }
 
 TEST_F(MenderWindowTest, HelpOpensInAWindowOfItsOwn)

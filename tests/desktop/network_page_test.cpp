@@ -31,12 +31,6 @@ protected:
     }
     void close_page() { press(window(), Qt::Key_W, Qt::ControlModifier); }
     [[nodiscard]] bool in_page() { return window().page()->objectName() == u"setup_Networking"_s; }
-    void tab_to(const QString& name)
-    {
-        for (int step = 0; step < 30 && window().focusWidget()->objectName() != name; ++step)
-            press(window(), Qt::Key_Tab);
-        ASSERT_EQ(window().focusWidget()->objectName(), name);
-    }
     void push(const QString& name)
     {
         tab_to(name);

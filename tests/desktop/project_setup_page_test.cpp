@@ -138,6 +138,26 @@ TEST_F(ProjectSetupPageTest, AnEmptiedServiceWhoseMarksAreToStayInSightComesBack
     EXPECT_FALSE(window().page()->altered());
 }
 
+TEST_F(ProjectSetupPageTest, WhatIsTypedAndCannotBeLookedIntoIsToldAsAFailedSaveAndStaysTyped)
+{
+    open();
+    add_roll_project(u"Sunday"_s, u"Morning"_s);
+    save();
+    press(window(), Qt::Key_V, Qt::AltModifier);
+    auto& service = child<QLineEdit>(page(), u"description_1"_s);
+    service.selectAll();
+    press(window(), Qt::Key_Delete);
+    place.in_database(u"DROP TABLE [tbl_roll_attendance];"_s);
+    place.dialogue.expect_box(u"Unable to save the projects"_s);
+    save();
+    place.dialogue.verify();
+    EXPECT_EQ(service.text(), QString());
+    EXPECT_TRUE(window().page()->altered());
+    EXPECT_EQ(roll_projects(), QStringList{u"Sunday"_s});
+    service.setText(u"Morning"_s);
+    service.setModified(false); // The page closes without asking.
+}
+
 TEST_F(ProjectSetupPageTest, AnIncompleteProjectIsChosenWhenThePageRefusesToBeLeft)
 {
     open();

@@ -87,7 +87,7 @@ TEST_F(SearchPageTest, EnterGoesFromOneFamilyWithTheTextToTheNextAndTellsTheEnd)
     press(window(), Qt::Key_Return);
     EXPECT_EQ(chosen(), u"Naismith"_s);
     EXPECT_EQ(button(), u"&Search Next"_s);
-    EXPECT_EQ(label(u"found_in"_s), u"Found in Surname"_s);
+    EXPECT_EQ(label(u"found_in"_s), u"Found in the surname of the family"_s);
     press(window(), Qt::Key_Return);
     EXPECT_EQ(chosen(), u"Smith"_s);
 
@@ -95,6 +95,34 @@ TEST_F(SearchPageTest, EnterGoesFromOneFamilyWithTheTextToTheNextAndTellsTheEnd)
     press(window(), Qt::Key_Return);
     EXPECT_EQ(button(), u"&Search"_s);
     EXPECT_EQ(chosen(), u"Smith"_s);
+}
+
+TEST_F(SearchPageTest, AnotherOrderOfTheListKeepsTheFoundFamilyAndLetsTheSearchGoOn)
+{
+    open_search();
+    type(window(), u"smi"_s);
+    press(window(), Qt::Key_Return);
+    ASSERT_EQ(chosen(), u"Naismith"_s);
+    list().sortByColumn(0, Qt::DescendingOrder);
+    EXPECT_EQ(shown(list()), (QStringList{u"Smith"_s, u"Naismith"_s, u"Adder"_s}));
+    EXPECT_EQ(chosen(), u"Naismith"_s);
+    EXPECT_EQ(button(), u"&Search Next"_s);
+    child<QLineEdit>(page(), u"search_text"_s).setFocus();
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(chosen(), u"Smith"_s);
+}
+
+TEST_F(SearchPageTest, AnEmptyListNamesTheChoiceThatEmptiesIt)
+{
+    open_search();
+    child<QComboBox>(page(), u"family_group"_s).setFocus();
+    press(window(), Qt::Key_Down);
+    EXPECT_TRUE(visible_texts(window()).contains(u"Choose another family group or another list above."_s));
+    press(window(), Qt::Key_Up);
+    child<QComboBox>(page(), u"family_list"_s).setFocus();
+    QTest::keyClicks(window().focusWidget(), u"Prospect"_s);
+    settle();
+    EXPECT_TRUE(visible_texts(window()).contains(u"Choose another list above."_s));
 }
 
 TEST_F(SearchPageTest, APreferredNameIsFoundAmongTheNamesAlone)
@@ -180,6 +208,45 @@ TEST_F(SearchPageTest, EnterOnAPartListsThoseWhoHaveAnEntryInIt)
     const auto cards = desk().windows.all<desktop::FamilyCard>();
     ASSERT_EQ(cards.size(), 1U);
     EXPECT_EQ(cards[0]->surname_id(), stored[0].family.Surname_ID);
+}
+
+TEST_F(SearchPageTest, HeadingsOrderTheEntriesAndTheirDatesByTheYear)
+{
+    auto adder = family(u"Adder"_s, {u"Una"_s, u"Bob"_s});
+    adder.people[0].birthdate = core::Date{1977, 12, 30};
+    adder.people[1].birthdate = core::Date{1999, 1, 2};
+    adder.people[1].Decease = true;
+    auto nash = family(u"Nash"_s, {u"Carl"_s});
+    nash.people[0].birthdate = core::Date{1980, 6, 15};
+    begin({adder, nash});
+    running->open_area(u"search"_s);
+    settle();
+    press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+    choose_part(u"Birth Date"_s);
+    entries().sortByColumn(2, Qt::DescendingOrder);
+    EXPECT_EQ(shown(entries(), 1), (QStringList{u"Bob (Deceased)"_s, u"Carl"_s, u"Una"_s}));
+    EXPECT_TRUE(entries().model()->index(0, 1).data(Qt::FontRole).value<QFont>().italic());
+
+    entries().selectRow(2);
+    entries().sortByColumn(1, Qt::AscendingOrder);
+    EXPECT_EQ(entries().currentIndex().row(), 2) << "Una stays chosen.";
+    entries().sortByColumn(0, Qt::AscendingOrder);
+    EXPECT_EQ(shown(entries(), 1), (QStringList{u"Una"_s, u"Bob (Deceased)"_s, u"Carl"_s})) << "As families have it.";
+    EXPECT_EQ(entries().currentIndex().row(), 0);
+    entries().setFocus();
+    press(window(), Qt::Key_Return);
+    settle();
+    EXPECT_TRUE(window().page()->title().contains(u"Adder"_s));
+}
+
+TEST_F(SearchPageTest, ThePartsStandInTheirOrder)
+{
+    open_data_search();
+    const auto& parts = child<QListWidget>(page(), u"parts"_s);
+    for (const auto& [row, name] :
+         {std::pair(0, u"Title"_s), std::pair(1, u"Birth Date"_s), std::pair(2, u"Preferred Given Name"_s),
+          std::pair(parts.count() - 1, u"Family Portraits"_s)})
+        EXPECT_EQ(parts.item(row)->text(), name);
 }
 
 TEST_F(SearchPageTest, APartWithoutItsRightIsRefusedAndListsNobody)

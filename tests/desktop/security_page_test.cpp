@@ -63,13 +63,6 @@ protected:
     [[nodiscard]] bool in_page() { return window().page()->objectName() == u"security"_s; }
     [[nodiscard]] QString focus() { return window().focusWidget()->objectName(); }
 
-    /// Goes on with Tab until the widget of this name has the cursor.
-    void tab_to(const QString& name)
-    {
-        for (int step = 0; step < 80 && focus() != name; ++step)
-            press(window(), Qt::Key_Tab);
-        ASSERT_EQ(focus(), name);
-    }
     void tick(const QString& area)
     {
         tab_to(area);

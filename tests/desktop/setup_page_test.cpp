@@ -17,6 +17,7 @@ using people::SetupKind;
 
 namespace {
 
+const QString cancel_question = u"Do you wish to drop every change since the lists were saved?"_s;
 const QString leave_question = u"Do you wish to save the changes made to the setup lists?"_s;
 
 class SetupPageTest : public DesktopTest
@@ -56,6 +57,12 @@ protected:
     {
         child<QAbstractButton>(tab(), name).setFocus();
         press(window(), Qt::Key_Space);
+    }
+    void cancel()
+    {
+        for (QAction* action : window().page()->actions())
+            if (action->text() == u"Cancel")
+                action->trigger();
     }
     [[nodiscard]] QWidget& tab() { return *child<QTabWidget>(window(), u"lists"_s).currentWidget(); }
     [[nodiscard]] QTableView& table() { return *tab().findChild<QTableView*>(); }
@@ -147,13 +154,24 @@ TEST_F(SetupPageTest, CancelDropsEveryListAfterAsking)
     open(SetupKind::titles);
     add(u"Deacon"_s);
     EXPECT_TRUE(button().marks().altered);
-    place.dialogue.expect_confirm(u"Do you wish to drop every change since the lists were saved?"_s, core::Answer::yes,
-                                  core::Answer::no);
-    for (QAction* action : window().page()->actions())
-        if (action->text() == u"Cancel")
-            action->trigger();
+    place.dialogue.expect_confirm(cancel_question, core::Answer::yes, core::Answer::no);
+    cancel();
     EXPECT_EQ(table().model()->rowCount(), 3);
     EXPECT_FALSE(button().marks().altered);
+}
+
+TEST_F(SetupPageTest, ChangesAreDroppedAlsoWhereTheListsCannotBeReadAgain)
+{
+    open(SetupKind::titles);
+    add(u"Deacon"_s);
+    place.in_database(u"DROP TABLE [tbl_title];"_s);
+    place.dialogue.expect_box(u"Unable to save the setup lists"_s);
+    press(window(), Qt::Key_S, Qt::ControlModifier);
+    place.dialogue.expect_confirm(cancel_question, core::Answer::yes);
+    place.dialogue.expect_box(u"Unable to read the setup lists"_s);
+    cancel();
+    EXPECT_EQ(table().model()->rowCount(), 3);
+    EXPECT_FALSE(window().page()->altered());
 }
 
 TEST_F(SetupPageTest, LeavingAsksAndDoesAsItIsTold)

@@ -7,6 +7,7 @@
 
 #include <QLineEdit>
 #include <QPushButton>
+#include <QSignalSpy>
 #include <QTableView>
 
 namespace kindrel::test {
@@ -103,7 +104,19 @@ TEST_F(SpeedFindWindowTest, WhenNobodyAnswersASecondEnterOpensANewFamily)
     ASSERT_TRUE(add.hasFocus());
     press(popup(), Qt::Key_Return);
     settle();
-    EXPECT_TRUE(qobject_cast<desktop::EditorPage*>(window().page()));
+    ASSERT_TRUE(qobject_cast<desktop::EditorPage*>(window().page()));
+    EXPECT_EQ(child<QLineEdit>(window(), u"surname"_s).text(), u"Xyz"_s);
+}
+
+TEST_F(SpeedFindWindowTest, ANumberThatWasTypedIsNoSurnameOfANewFamily)
+{
+    begin_and_ask();
+    QSignalSpy wanted(&popup(), &SpeedFindWindow::family_wanted);
+    type(popup(), u"555 123"_s);
+    press(popup(), Qt::Key_Return);
+    press(popup(), Qt::Key_Return);
+    ASSERT_EQ(wanted.size(), 1);
+    EXPECT_EQ(wanted[0][0].toString(), QString());
 }
 
 TEST_F(SpeedFindWindowTest, AFamilyThatAnotherWorkstationStoredIsThereTheNextTime)

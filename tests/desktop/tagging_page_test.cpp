@@ -2,12 +2,14 @@
 #include "desktop/desktop_fixture.h"
 #include "desktop/output/preview_window.h"
 #include "desktop/output/report_tree.h"
+#include "desktop/people/found_people_model.h"
 #include "desktop/shell/note_bar.h"
 #include "desktop/shell/page.h"
 #include "pages/find.h"
 #include "people/filter.h"
 #include "support/families.h"
 
+#include <QAction>
 #include <QComboBox>
 #include <QLineEdit>
 #include <QListWidget>
@@ -146,6 +148,22 @@ TEST_F(TaggingPageTest, TheSortStepOrdersAndNarrowsTheList)
     EXPECT_EQ(listed(), QStringList({u"Cy"_s}));
 }
 
+TEST_F(TaggingPageTest, AnOrderByWhatMayNotBeSeenKeepsTheSortStepOpenAndTheListAsItWas)
+{
+    push(u"sort"_s);
+    const QStringList before = listed();
+    for (const auto& [order, right] :
+         {std::pair(birth_date, core::Area::birth_dates), std::pair(birth_date + 1, core::Area::visitation_tab)}) {
+        desk().office.rights = core::Rights::all();
+        desk().office.rights.set(right, false);
+        choose(u"orders"_s, order);
+        place.dialogue.expect_box(u"Your password does not give access to \"%1\""_s.arg(core::area_name(right)));
+        press(window(), Qt::Key_PageDown, Qt::ControlModifier);
+        EXPECT_EQ(open_step(), u"sort"_s);
+        EXPECT_EQ(listed(), before);
+    }
+}
+
 TEST_F(TaggingPageTest, ASearchWithoutItsValueKeepsTheSortStepOpen)
 {
     struct Case
@@ -213,6 +231,97 @@ TEST_F(TaggingPageTest, ABulkChangeTellsWhatItWouldDoDoesItAndIsTakenBack)
     EXPECT_EQ(rows(u"tbl_group"_s), 0);
     push(u"offer"_s);
     EXPECT_EQ(rows(u"tbl_group"_s), 3);
+}
+
+TEST_F(TaggingPageTest, ABulkChangeIsStillTakenBackAfterSmallerActsAndOneThatChangedNobody)
+{
+    choose_second(1, u"group 2"_s);
+    place.dialogue.expect_box(done);
+    push(u"btn_tag_all"_s);
+    const QString given = page().note().text();
+    EXPECT_EQ(given, u"\u201cgroup 2\u201d was given to 3 people."_s);
+    place.dialogue.expect_box(done);
+    push(u"btn_tag_all"_s);
+    EXPECT_EQ(page().note().text(), given);
+    child<QTableView>(bench(), u"working_people"_s).setFocus();
+    press(window(), Qt::Key_Delete);
+    EXPECT_EQ(listed().size(), 3);
+
+    press(window(), Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(listed().size(), 4);
+    EXPECT_EQ(page().note().text(), given);
+    desk().office.rights.set(core::Area::tagging, false);
+    place.dialogue.expect_box(u"Your password does not give access to \"Tagging\""_s);
+    press(window(), Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(page().note().text(), given);
+    desk().office.rights.set(core::Area::tagging, true);
+    press(window(), Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(rows(u"tbl_group"_s), 0);
+    EXPECT_EQ(page().note().text(), u"The change was taken back."_s);
+}
+
+TEST_F(TaggingPageTest, ABulkChangeIsTakenBackByKeyFromTheLineThatFoundItsItem)
+{
+    choose_second(1, u"group 2"_s);
+    EXPECT_EQ(window().focusWidget()->objectName(), u"item_filter");
+    place.dialogue.expect_box(done);
+    child<QPushButton>(bench(), u"btn_tag_all"_s).click(); // As its letter does, wherever the cursor stands.
+    EXPECT_EQ(rows(u"tbl_group"_s), 3);
+    EXPECT_EQ(child<QPushButton>(page(), u"offer"_s).shortcut(), QKeySequence(u"Alt+U"_s));
+    press(window(), Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(rows(u"tbl_group"_s), 0);
+}
+
+TEST_F(TaggingPageTest, ADateIsGivenOnlyOnceItIsTypedAndTellsWhoseItReplaces)
+{
+    choose_second(3, u"2"_s);
+    auto& date = child<QLineEdit>(bench(), u"date"_s);
+    EXPECT_EQ(date.text(), QString());
+    place.dialogue.expect_box(u"Please enter the date that the people are given"_s);
+    push(u"btn_tag_all"_s);
+    EXPECT_EQ(window().focusWidget(), &date);
+    type(window(), u"01/02/2024"_s);
+    place.dialogue.expect_box(done, u"3 people change, 1 in booked out families skipped"_s);
+    push(u"btn_tag_all"_s);
+    date.setFocus();
+    date.selectAll();
+    type(window(), u"02/02/2024"_s);
+    place.dialogue.expect_box(done,
+                              u"3 people get it in place of another value or mark, 1 in booked out families skipped"_s);
+    push(u"btn_tag_all"_s);
+}
+
+TEST_F(TaggingPageTest, SomebodyIsFoundAndListedByTheirOwnSurname)
+{
+    place.in_database(u"UPDATE [tbl_personal_details] SET [other_surname]='Achterberg' WHERE [person_id]=(SELECT "
+                      "[person_id] FROM [tbl_people] WHERE [Name]='Ben');"_s);
+    push(u"sort"_s);
+    EXPECT_EQ(listed(), QStringList({u"Di"_s, u"Ann"_s, u"Ben Achterberg"_s, u"Cy"_s}));
+    press(window(), Qt::Key_F, Qt::ControlModifier);
+    type(window(), u"achterb"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(page().note().text(), u"\u201cNaismith, Ben Achterberg\u201d is on the list already."_s);
+
+    const auto& ben = stored[0].people[1];
+    const auto found = desktop::read_people(desk(), {{{ben.person_id, stored[0].family.Surname_ID}}, {}});
+    ASSERT_TRUE(found && found->size() == 1);
+    EXPECT_EQ(found->front().name, u"Ben Achterberg"_s);
+}
+
+TEST_F(TaggingPageTest, TheListIsPrintedOnlyWithTheRightToReports)
+{
+    push(u"sort"_s);
+    for (const bool granted : {false, true}) {
+        desk().office.rights.set(core::Area::report_outputs, granted);
+        if (!granted)
+            place.dialogue.expect_box(
+                u"Your password does not give access to \"%1\""_s.arg(core::area_name(core::Area::report_outputs)));
+        for (QAction* action : page().actions())
+            if (action->text() == u"Print")
+                action->trigger();
+        settle();
+        EXPECT_EQ(desk().windows.all<desktop::PreviewWindow>().size(), granted ? 1 : 0);
+    }
 }
 
 TEST_F(TaggingPageTest, ABulkChangeAsksForItsItem)

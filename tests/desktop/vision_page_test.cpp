@@ -25,12 +25,6 @@ protected:
         running->open_area(u"vision"_s);
         settle();
     }
-    void tab_to(const QString& name)
-    {
-        for (int step = 0; step < 30 && window().focusWidget()->objectName() != name; ++step)
-            press(window(), Qt::Key_Tab);
-        ASSERT_EQ(window().focusWidget()->objectName(), name);
-    }
     void save() { press(window(), Qt::Key_S, Qt::ControlModifier); }
     void close_page() { press(window(), Qt::Key_W, Qt::ControlModifier); }
     [[nodiscard]] bool in_page() { return window().page()->objectName() == u"setup_vision"_s; }

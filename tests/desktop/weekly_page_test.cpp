@@ -251,6 +251,7 @@ TEST_F(WeeklyPageTest, ARefusedDateStaysSelectedInItsField)
     auto& field = child<QLineEdit>(page(), u"new_date"_s);
     for (const auto& [typed, refusal] :
          {std::pair{u"5/5/24"_s, u"This date has already been used. Please enter another date."_s},
+          std::pair{u"05/03/XXXX"_s, u"Please enter the year too."_s},
           std::pair{u"31/2/24"_s, core::bad_date_message(core::DayOrder::day_first).text}}) {
         field.clear();
         place.dialogue.expect_box(refusal);
@@ -259,6 +260,7 @@ TEST_F(WeeklyPageTest, ARefusedDateStaysSelectedInItsField)
         EXPECT_EQ(field.selectedText(), field.text());
         EXPECT_FALSE(field.text().isEmpty());
     }
+    EXPECT_FALSE(field.toolTip().contains(u"XXXX"_s));
 }
 
 TEST_F(WeeklyPageTest, AnOddDateIsRemarkedOnInTheNoteBarAndAddedAllTheSame)
@@ -274,17 +276,23 @@ TEST_F(WeeklyPageTest, AnOddDateIsRemarkedOnInTheNoteBarAndAddedAllTheSame)
     EXPECT_EQ(in_focus(), u"figures"_s);
 }
 
-TEST_F(WeeklyPageTest, ADateGetsAnotherDayUnlessThatIsUsed)
+TEST_F(WeeklyPageTest, AnotherDayForADateIsAskedForUntilItCanBeTaken)
 {
     start();
     open_page();
     auto& button = child<QAbstractButton>(page(), u"btn_edit"_s);
     button.setFocus();
+    place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"05/03/XXXX"_s);
+    place.dialogue.expect_box(u"Please enter the year too."_s);
+    place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"31/2/24"_s);
+    place.dialogue.expect_box(core::bad_date_message(core::DayOrder::day_first).text);
     place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"28/04/2024"_s);
     place.dialogue.expect_box(
         u"Unable to change to this date as it already exists, please choose a date which has not been used yet."_s);
+    place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, std::nullopt);
     act(Qt::Key_Space);
-    EXPECT_EQ(in_focus(), u"dates"_s);
+    EXPECT_EQ(place.dialogue.seen().back().more, u"You typed \"28/04/2024\"."_s);
+    EXPECT_EQ(dates().front(), u"05/05/2024  open"_s);
     button.setFocus();
     place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"06/05/2024"_s);
     act(Qt::Key_Space);
@@ -360,38 +368,6 @@ TEST_F(WeeklyPageTest, TheAreaStaysClosedWhileSomebodyIsInTheProjectSetup)
         u"Unable to enter the Weekly Statistics program as another user is in the setup area of Kindrel"_s);
     act(Qt::Key_7, Qt::ControlModifier);
     EXPECT_EQ(page().objectName(), u"main_menu"_s);
-}
-
-TEST_F(WeeklyPageTest, CategoriesLeftOutOfAReportAndItsPeriodAreRememberedAndTooFewOrTooManyAreRefused)
-{
-    start(10, 0);
-    open_page();
-    act(Qt::Key_PageDown, Qt::ControlModifier);
-    auto* reports = &child<QListWidget>(page(), u"output_type"_s);
-    EXPECT_EQ(reports->currentRow(), 3); // The first that holds ten categories.
-    act(Qt::Key_Home);
-    place.dialogue.expect_box(
-        u"For the records data report you are only able to select a maximum amount of 9 categories"_s);
-    act(Qt::Key_Return);
-    EXPECT_TRUE(previews().empty());
-    window().activateWindow();
-    child<QWidget>(page(), u"A_att"_s).setFocus();
-    act(Qt::Key_Down);
-    act(Qt::Key_Space);
-    act(Qt::Key_P, Qt::ControlModifier);
-    EXPECT_EQ(previews().size(), 1);
-
-    begin_again();
-    open_page();
-    act(Qt::Key_PageDown, Qt::ControlModifier);
-    reports = &child<QListWidget>(page(), u"output_type"_s);
-    EXPECT_EQ(reports->currentRow(), 0);
-    EXPECT_EQ(child<QListWidget>(page(), u"A_att"_s).item(1)->checkState(), Qt::Unchecked);
-    child<QAbstractButton>(page(), u"A_att_none"_s).setFocus();
-    act(Qt::Key_Space);
-    place.dialogue.expect_box(u"Please select either a financial or attendance item"_s);
-    act(Qt::Key_P, Qt::ControlModifier);
-    EXPECT_TRUE(previews().empty());
 }
 
 } // namespace kindrel::test

@@ -1,6 +1,7 @@
 #include "output/output_fixture.h"
 
 #include <QImage>
+#include <QRegularExpression>
 
 namespace kindrel::test {
 
@@ -88,6 +89,22 @@ TEST_F(DecorationTest, AListWithoutCriteriaHasNoFilterLine)
     list.criteria.clear();
 
     EXPECT_FALSE(texts().join(u'\n').contains(u"Filters in Use"_s));
+}
+
+TEST_F(DecorationTest, ManyFiltersAreToldInThreeLinesAndAnEllipsis)
+{
+    office.settings.title_filters = true;
+    QStringList groups;
+    for (int number = 1; number <= 300; ++number)
+        groups += u"in group %1"_s.arg(number);
+    list.criteria = groups.join(u" or "_s);
+
+    const auto all = texts();
+
+    const auto first = all.indexOf(QRegularExpression(u"^Filters in Use = in group 1 .*"_s));
+    ASSERT_GE(first, 0);
+    EXPECT_TRUE(all[first + 2].endsWith(u" \u2026"_s)) << all[first + 2].toStdString();
+    EXPECT_FALSE(all[first + 3].contains(u"in group"_s)) << all[first + 3].toStdString();
 }
 
 TEST_F(DecorationTest, TheVisionStatementHasTheChurchsFontSizeAndFormat)

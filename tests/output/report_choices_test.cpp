@@ -105,6 +105,17 @@ TEST_F(ReportChoicesTest, WhatWouldBeRefusedHasNoPictureAndShowsNoBox)
     EXPECT_FALSE(first_page(u"Directory 1"_s));
 }
 
+TEST_F(ReportChoicesTest, NoPictureShowsABoxWhereEverybodyOnTheListIsGone)
+{
+    for (const auto& table : {u"tbl_people"_s, u"tbl_surname"_s})
+        office.session->execute(u"DELETE FROM [%1];"_s.arg(table));
+
+    for (const auto& each : output::report_choices(office))
+        static_cast<void>(output::first_page(each, {office, list, options}));
+    for (const auto& leaf : {u"Mailing Labels"_s, u"Name Tag Labels"_s})
+        EXPECT_FALSE(first_page(leaf));
+}
+
 TEST_F(ReportChoicesTest, APictureEndsTheRunWithItsPage)
 {
     std::vector<people::FamilyFile> families(200, family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s}));

@@ -257,6 +257,24 @@ TEST_F(ChartTest, APieNamesTheShareOfEachSlice)
     }
 }
 
+TEST_F(ChartTest, APieShortensTheNameOfASliceAndNeverItsFigure)
+{
+    const auto name = u"Thanksgiving offering for the work in distant countries"_s;
+    const ChartData data{.title = {},
+                         .categories = {name, name, name},
+                         .series = {series({}, {62599374, 62599374, 125198748})},
+                         .shown = [](double value) {
+                             return QString::number(value, 'f', 0);
+                         }};
+    const auto found = texts(draw(data, u"2D Pie"_s));
+    ASSERT_EQ(found.size(), 3);
+    for (const auto& label : found) {
+        EXPECT_TRUE(label.endsWith(u": 62599374 (25.0%)"_s) || label.endsWith(u": 125198748 (50.0%)"_s))
+            << label.toStdString();
+        EXPECT_TRUE(label.contains(u'…')) << label.toStdString();
+    }
+}
+
 TEST_F(ChartTest, WithoutFiguresEveryStyleSaysSo)
 {
     for (const auto& style : chart_styles()) {

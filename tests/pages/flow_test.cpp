@@ -209,6 +209,40 @@ TEST_F(FlowTest, ColumnsKeepClearOfHeaderAndFooterHoweverHighTheyAre)
     }
 }
 
+TEST_F(FlowTest, HeaderAndFooterThatWouldFillThePageAreCutSoThatTheReportHasRoom)
+{
+    struct Case
+    {
+        int header, footer; ///< Lines, of which a page holds fewer than 100.
+        const char* what;
+    };
+    for (const Case& one : {Case{200, 2, "header"}, Case{2, 200, "footer"}, Case{200, 200, "both"}}) {
+        PageSpool pages;
+        Flow flow(pages, {});
+        flow.set_header([&](Writer& band, int) { write_lines(band, 1, one.header); });
+        flow.set_footer([&](Writer& band, int) { write_lines(band, 1001, 1000 + one.footer); });
+        flow.line(u"body"_s);
+        flow.line(u"end"_s);
+        flow.finish();
+        ASSERT_EQ(pages.page_count(), 1) << one.what;
+        const auto all = texts_of(pages.page(1), 1);
+        EXPECT_EQ(all.front(), u"1"_s) << one.what;
+        EXPECT_TRUE(all.contains(QString::number(1000 + one.footer))) << one.what;
+        qreal above = 0, below = 1e6, at = 0;
+        for (const auto& item : pages.page(1).items) {
+            const auto& text = std::get<TextItem>(item);
+            const auto number = text.text.toInt();
+            if (number > 1000)
+                below = std::min(below, text.at.y());
+            else if (number > 0)
+                above = std::max(above, text.at.y());
+            else
+                at = text.at.y();
+        }
+        EXPECT_TRUE(above < at && at < below) << one.what;
+    }
+}
+
 TEST_F(FlowTest, AFlowThatIsDroppedLeavesTheSpoolOpen)
 {
     {

@@ -168,20 +168,35 @@ TEST_P(DataSearchTest, PhotographsAndNotesBelongToWhomTheirNamesSay)
     EXPECT_EQ(lines("Personal Notes"), QStringList());
 }
 
-TEST_P(DataSearchTest, ThePeopleFoundMakeAWorkingListInOrderOfSurname)
+TEST_P(DataSearchTest, WhoIsNotSimplyActiveIsMarkedInEitherKindOfPart)
 {
-    auto nash = family(u"Nash"_s, {u"Carl"_s, u"Dora"_s});
-    nash.people[0].Title = nash.people[1].Title = u"Dr"_s;
-    auto adder = family(u"Adder"_s, {u"Ann"_s});
-    adder.people[0].Title = u"Ms"_s;
-    nash = keep(nash);
-    adder = keep(adder);
+    auto adder = family(u"Adder"_s, {u"Ann"_s, u"Ben"_s});
+    adder.people[0].Decease = true;
+    adder.people[1].contact = true;
+    adder.people[0].Title = adder.people[1].Title = u"Dr"_s;
+    adder.address.phone = u"555"_s;
+    keep(adder);
 
-    const auto list = working_list(part("Title"), found("Title"));
-    EXPECT_EQ(list.criteria, u"People with an entry in Title"_s);
-    EXPECT_EQ(list.families(), (std::vector{adder.family.Surname_ID, nash.family.Surname_ID}));
-    ASSERT_EQ(list.members.size(), 3U);
-    EXPECT_EQ(list.members[2].person_id, nash.people[1].person_id);
+    EXPECT_EQ(lines("Title"), (QStringList{u"Ann (Deceased): Dr"_s, u"Ben (Contact): Dr"_s}));
+    EXPECT_EQ(lines("Family Phone"), QStringList{u"Ann (Deceased): 555"_s});
+    EXPECT_TRUE(found("Title")[0].deceased && !found("Title")[0].contact);
+    EXPECT_TRUE(found("Title")[1].contact && !found("Title")[1].deceased);
+}
+
+TEST_P(DataSearchTest, EntriesOrderByTheirDatesAndNumbersNotByTheirText)
+{
+    auto adder = family(u"Adder"_s, {u"Ann"_s, u"Ben"_s});
+    adder.people[0].birthdate = core::Date{1977, 12, 30};
+    adder.people[1].birthdate = core::Date{1978, 1, 2};
+    adder.people[0].school_year = -2;
+    adder.people[1].school_year = 3;
+    keep(adder);
+    for (const auto* name : {"Birth Date", "School Year"}) {
+        const auto entries = found(name);
+        ASSERT_EQ(entries.size(), 2U);
+        EXPECT_LT(entries[0].order, entries[1].order) << name;
+    }
+    EXPECT_LT(u"02/01/1978"_s, found("Birth Date")[0].value) << "The texts order otherwise.";
 }
 
 } // namespace kindrel::test

@@ -175,10 +175,12 @@ Filter Chance::filter(int fusions)
         made.items.push_back(added);
         // Another item of the same kind more often than chance would have it.
         if (percent(40)) {
-            added.item = 1 + below(items);
-            added.exclude = percent(50);
-            if (added.kind == FilterKind::flexi && percent(50))
-                added.value = percent(50) ? std::nullopt : std::optional(one_of(values).toString());
+            const bool another_value = added.kind == FilterKind::flexi && added.value && percent(50);
+            if (!another_value)
+                added.item = 1 + below(items);
+            added.exclude = another_value ? added.exclude : percent(50);
+            if (added.kind == FilterKind::flexi && (another_value || percent(50)))
+                added.value = percent(50) && !another_value ? std::nullopt : std::optional(one_of(values).toString());
             made.items.push_back(added);
         }
     }

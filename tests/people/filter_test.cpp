@@ -211,6 +211,9 @@ TEST_P(FilterTest, StatesMarksAndValuesNarrowAnItem)
     auto other_than_vegan = everybody();
     other_than_vegan.items = {with(Marks::any, {}), with(Marks::any, u"Vegan"_s, true)};
     EXPECT_EQ(found(other_than_vegan), u"Void"_s) << "An empty value is another value.";
+    auto several = everybody();
+    several.items = {with(Marks::any, u"Vegan"_s), with(Marks::any, u""_s)};
+    EXPECT_EQ(found(several), u"Vegan Void"_s) << "Values of one field are alternatives.";
     EXPECT_EQ(flexi_values(session(), 1), QStringList{u"Vegan"_s});
 }
 

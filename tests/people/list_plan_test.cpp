@@ -99,6 +99,28 @@ TEST_P(ListPlanTest, ARangeTakesLettersFirstAndPlacesOfWhatIsLeft)
     }
 }
 
+TEST_P(ListPlanTest, TheOwnSurnameIsShownAndOrdersIndividualsUnlessItIsHiddenOrTheFamilys)
+{
+    store(u"Tiplady"_s, {u"Flo"_s, u"Gus"_s, u"Hal"_s}, [](people::FamilyFile& file) {
+        file.people[0].other_surname = u"Achterberg"_s;
+        file.people[0].Decease = true;
+        file.people[1].other_surname = u"Abbot"_s;
+        file.people[1].surname_hidden = true;
+        file.people[2].other_surname = u"Tiplady"_s;
+    });
+    plan.filter.states.deceased = true;
+    plan.range.first_letter = u"T"_s;
+    QStringList names;
+    for (const auto& person : people::make_list(office(), plan).people)
+        names += u"%1, %2"_s.arg(person.surname, person.name);
+    EXPECT_EQ(names, QStringList({u"Tiplady, Flo Achterberg (Deceased)"_s, u"Tiplady, Gus"_s, u"Tiplady, Hal"_s}));
+
+    plan.sort.by = people::SortBy::individual;
+    EXPECT_EQ(made(), u"GH");
+    plan.range = {.first_letter = u"A"_s, .last_letter = u"A"_s};
+    EXPECT_EQ(made(), u"FAB");
+}
+
 TEST_P(ListPlanTest, WhatIsNeededMayBeTheFamilysOrTheOwnAndHiddenOnesDoNotCount)
 {
     const std::vector<std::pair<Needs, QString>> cases{

@@ -131,20 +131,42 @@ TEST_P(SavedFiltersTest, AFilterThatIsGoneOrTooNewIsRefused)
 
 KINDREL_ON_BOTH_ENGINES(SavedFiltersTest);
 
-TEST_P(SavedFiltersTest, OneThatAsksForBirthDatesNeedsTheirRight)
+TEST_P(SavedFiltersTest, OneThatAsksForBirthDatesOrVisitsNeedsTheirRight)
 {
     const Filter by_age{.families = FamilyList::active, .ages = Ages{18, 30, {}}};
-    Filter by_month{.families = FamilyList::active};
-    by_month.dates.push_back({.span = DateSpan::month, .month = 3});
-    const int age = save_filter(office(), u"Young adults"_s, by_age).value();
-    const int month = save_filter(office(), u"March"_s, by_month).value();
-    EXPECT_EQ(load_filter(office(), age), by_age);
-
-    office().rights.set(core::Area::birth_dates, false);
-    for (const int filter : {age, month}) {
-        dialogue().expect_box(u"Your password does not give access to \"Birth Dates Access\""_s);
-        EXPECT_EQ(load_filter(office(), filter), std::nullopt);
+    const auto in_march = [](DateSource source) {
+        Filter filter{.families = FamilyList::active};
+        filter.dates.push_back({.source = source, .span = DateSpan::month, .month = 3});
+        return filter;
+    };
+    for (const auto& [filter, right] : std::initializer_list<std::pair<Filter, core::Area>>{
+             {by_age, core::Area::birth_dates},
+             {in_march(DateSource::birth_date), core::Area::birth_dates},
+             {in_march(DateSource::visits), core::Area::visitation_tab}}) {
+        office().rights = core::Rights::all();
+        const auto key = save_filter(office(), core::area_name(right).toString(), filter).value();
+        EXPECT_EQ(load_filter(office(), key), filter);
+        office().rights.set(right, false);
+        dialogue().expect_box(u"Your password does not give access to \"%1\""_s.arg(core::area_name(right)));
+        EXPECT_EQ(load_filter(office(), key), std::nullopt);
+        session().execute(u"DELETE FROM [tbl_filter_memory];"_s);
     }
+    office().rights.set(core::Area::birth_dates, false);
+    const auto events = in_march(DateSource::events);
+    EXPECT_EQ(load_filter(office(), save_filter(office(), u"Events"_s, events).value()), events);
+}
+
+TEST_P(SavedFiltersTest, ASavedFilterIsReplacedUnderItsNameWithoutAQuestion)
+{
+    const Filter old{.families = FamilyList::active}, fresh{.families = FamilyList::archive};
+    const int key = save_filter(office(), u"Choir"_s, old).value();
+    EXPECT_TRUE(replace_filter(office(), key, fresh));
+    EXPECT_EQ(load_filter(office(), key), fresh);
+    EXPECT_EQ(names(), QStringList{u"Choir"_s});
+
+    session().execute(u"DELETE FROM [tbl_filter_memory];"_s);
+    dialogue().expect_box(u"Unable to save this filter as another user has removed it"_s);
+    EXPECT_FALSE(replace_filter(office(), key, old));
 }
 
 } // namespace kindrel::test

@@ -7,6 +7,7 @@ using namespace Qt::StringLiterals;
 using core::Date;
 using people::DateSearch;
 using people::FamilyType;
+using people::right_for;
 using people::SortBy;
 using people::SortOrder;
 
@@ -71,6 +72,18 @@ protected:
 KINDREL_ON_BOTH_ENGINES(SortingTest);
 
 } // namespace
+
+TEST(SortRightTest, BirthDatesAndVisitsAloneAskForTheirRight)
+{
+    using core::Area;
+    for (const auto& [by, right] :
+         std::initializer_list<std::pair<SortBy, std::optional<Area>>>{{SortBy::birth_date, Area::birth_dates},
+                                                                       {SortBy::visitation, Area::visitation_tab},
+                                                                       {SortBy::family, {}},
+                                                                       {SortBy::family_events, {}},
+                                                                       {SortBy::personal_date, {}}})
+        EXPECT_EQ(right_for(by), right) << people::sort_label(by).toStdString();
+}
 
 TEST_P(SortingTest, EveryOrderStandsAsItsScreenSays)
 {

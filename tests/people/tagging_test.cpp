@@ -130,13 +130,62 @@ TEST_P(TaggingTest, APotentialMinistryStandsBesideAnActiveOne)
 
 TEST_P(TaggingTest, DatesAndFlexiFieldsGetTheirNewContentInPlace)
 {
-    (void)run({.kind = TagKind::flexi, .item = 2, .field = u"blue"_s}, TagAct::give);
-    const auto again = run({.kind = TagKind::flexi, .item = 2, .field = u"red"_s, .tagged = true}, TagAct::give);
-    EXPECT_EQ(again.count.changed, 2);
-    EXPECT_EQ(rows(&people::Person::flexi)[0].field, u"red");
-    EXPECT_EQ(people::undo_tagging(office(), again), 0);
-    EXPECT_EQ(rows(&people::Person::flexi)[0].field, u"blue");
-    EXPECT_FALSE(rows(&people::Person::flexi)[0].tagged);
+    const TagItem blue{.kind = TagKind::flexi, .item = 2, .field = u"blue"_s};
+    const TagItem red{.kind = TagKind::flexi, .item = 2, .field = u"red"_s, .tagged = true};
+    const TagItem may{.kind = TagKind::date, .item = 2, .date = Date{2024, 5, 1}, .tagged = true};
+    const TagItem june{.kind = TagKind::date, .item = 2, .date = Date{2024, 6, 1}};
+    for (const auto& [before, after] : {std::pair(blue, red), std::pair(may, june)}) {
+        const auto of = kinds[int(before.kind) - 1].rows;
+        (void)run(before, TagAct::give);
+        const auto old_row = rows(of)[0];
+        const auto again = run(after, TagAct::give);
+        EXPECT_EQ(again.count, (people::TagCount{2, 0, 1, 1, 2}));
+        ASSERT_EQ(rows(of).size(), 1u);
+        EXPECT_EQ(rows(of)[0].field, after.field);
+        EXPECT_EQ(rows(of)[0].date, after.date);
+        EXPECT_EQ(rows(of)[0].tagged, after.tagged);
+        EXPECT_EQ(people::undo_tagging(office(), again), 0);
+        EXPECT_TRUE(rows(of)[0] == old_row);
+    }
+}
+
+TEST_P(TaggingTest, BeforehandItTellsHowManyGetTheItemInPlaceOfAnotherValue)
+{
+    using people::TagCount;
+    const std::vector<std::pair<TagCount, QString>> cases{
+        {{.changed = 2}, u"2 people change"_s},
+        {{.changed = 5, .as_it_was = 1, .replaced = 1},
+         u"4 people get it, 1 gets it in place of another value or mark, 1 stays as it is"_s},
+        {{.changed = 4, .replaced = 3}, u"1 person gets it, 3 get it in place of another value or mark"_s},
+        {{.changed = 2, .replaced = 2}, u"2 people get it in place of another value or mark"_s},
+    };
+    for (const auto& [counted, words] : cases)
+        EXPECT_EQ(counted.words(), words);
+
+    TagItem item{.kind = TagKind::flexi, .item = 2};
+    (void)run(item, TagAct::give);
+    item.field = u"blue"_s;
+    EXPECT_EQ(people::count_tagging(office(), *list, item, TagAct::give).replaced, 0) << "Nothing is lost.";
+    (void)run(item, TagAct::give);
+    EXPECT_EQ(people::count_tagging(office(), *list, item, TagAct::take).replaced, 0);
+    item.tagged = true;
+    EXPECT_EQ(people::count_tagging(office(), *list, item, TagAct::give).replaced, 2);
+}
+
+TEST_P(TaggingTest, AChangeIsTakenBackOnlyByWhoMayTagAndWhileTheNetworkAnswers)
+{
+    const auto given = run({.kind = TagKind::status, .item = 2}, TagAct::give);
+    office().mode = core::Mode::network;
+    dialogue().expect_box(u"Unable to access your network files."_s);
+    EXPECT_FALSE(people::undo_tagging(office(), given));
+    office().mode = core::Mode::normal;
+    office().rights.set(Area::read_only_family_data, true);
+    dialogue().expect_box(u"Unable to tag people as you only have read only access within family files"_s);
+    EXPECT_FALSE(people::undo_tagging(office(), given));
+    office().rights.set(Area::tagging, false);
+    dialogue().expect_box(u"Your password does not give access to \"Tagging\""_s);
+    EXPECT_FALSE(people::undo_tagging(office(), given));
+    EXPECT_EQ(count(u"[tbl_status];"_s), 2);
 }
 
 TEST_P(TaggingTest, AGroupComesLastAndIsWrittenIntoTheHistory)
@@ -198,6 +247,8 @@ TEST_P(TaggingTest, ARunIsRefusedInTheWordsOfItsKind)
                               u" until you choose one from the list"_s);
         EXPECT_FALSE(people::tag(office(), list, {.kind = kind}, TagAct::take));
     }
+    dialogue().expect_box(u"Please enter the date that the people are given"_s);
+    EXPECT_FALSE(people::tag(office(), list, {.kind = TagKind::date, .item = 1}, TagAct::give));
     office().rights.set(Area::read_only_family_data, true);
     dialogue().expect_box(u"Unable to tag people as you only have read only access within family files"_s);
     EXPECT_FALSE(people::tag(office(), list, status, TagAct::give));

@@ -102,7 +102,7 @@ TEST_P(TextSearchTest, TwoPeopleOfAFamilyFindItOnceByTheFirstOfThem)
 
     const auto match = search.next(u"ros"_s, SearchFields::all, everybody());
     ASSERT_TRUE(match);
-    EXPECT_EQ(*match, (TextMatch{first, stored(first).people[0].person_id, u"Name"_s}));
+    EXPECT_EQ(*match, (TextMatch{first, stored(first).people[0].person_id, u"given name", u"Rosemary"_s}));
     EXPECT_TRUE(search.under_way());
     EXPECT_EQ(search.next(u"ros"_s, SearchFields::all, everybody())->surname_id, second);
     dialogue().expect_box(QString::fromUtf16(none_found));
@@ -124,6 +124,33 @@ TEST_P(TextSearchTest, AnythingElseAskedForStartsTheSearchAnew)
     EXPECT_EQ(first_then(u"an"_s, SearchFields::all, everybody()), ann);
     EXPECT_EQ(first_then(u"ann"_s, SearchFields::names, everybody()), ann);
     EXPECT_EQ(first_then(u"ann"_s, SearchFields::all, {ann}), ann);
+}
+
+TEST_P(TextSearchTest, AnotherOrderOfTheSameFamiliesLetsTheSearchGoOn)
+{
+    const int ann = add(u"Adder"_s, {u"Ann"_s});
+    const int anna = add(u"Nash"_s, {u"Anna"_s});
+    TextSearch search(office());
+    EXPECT_EQ(search.next(u"ann"_s, SearchFields::all, {ann, anna})->surname_id, ann);
+    EXPECT_EQ(search.next(u"ann"_s, SearchFields::all, {anna, ann})->surname_id, anna);
+}
+
+TEST_P(TextSearchTest, AMatchSaysWhoWasFoundAndWhere)
+{
+    auto file = family(u"Rotherham"_s, {u"Deborah"_s, u"Jasmine"_s});
+    file.people[1].other_surname = u"q-other"_s;
+    file.people[1].business_email = u"q-mail"_s;
+    file.address.post_street2 = u"q-line"_s;
+    keep(file);
+    for (const auto& [text, words] : std::initializer_list<std::pair<QString, QString>>{
+             {u"smin"_s, u"Found in the given name of Jasmine"_s},
+             {u"q-other"_s, u"Found in the other surname of Jasmine"_s},
+             {u"q-mail"_s, u"Found in the business e-mail of Jasmine"_s},
+             {u"rother"_s, u"Found in the surname of the family"_s},
+             {u"q-line"_s, u"Found in the second line of the postal street of the family"_s}}) {
+        TextSearch search(office());
+        EXPECT_EQ(found_words(*search.next(text, SearchFields::all, everybody())), words);
+    }
 }
 
 TEST_P(TextSearchTest, FamiliesThatAreNotListedArePassedOver)

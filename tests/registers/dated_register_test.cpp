@@ -130,8 +130,9 @@ TEST_P(DatedRegisterTest, ADayIsUsedOnceInAProjectAndMayBeUsedInAnother)
 TEST_P(DatedRegisterTest, ADayWithoutAYearOrOutsideTheCalendarIsRefused)
 {
     ASSERT_TRUE(weekly->enter());
-    for (const Date day : {Date{1800, 5, 12}, Date{2024, 2, 30}, Date{}}) {
-        const auto message = core::bad_date_message(core::DayOrder::day_first);
+    const auto unreadable = core::bad_date_message(core::DayOrder::day_first);
+    for (const auto& [day, message] : {std::pair{Date{1800, 5, 12}, core::Message{u"Please enter the year too."_s}},
+                                       std::pair{Date{2024, 2, 30}, unreadable}, std::pair{Date{}, unreadable}}) {
         dialogue().expect_box(message.text, message.more);
         EXPECT_FALSE(weekly->add(day));
     }

@@ -16,6 +16,7 @@ namespace {
 const QString one_at_a_time =
     u"To protect the integrity of your data, Kindrel only allows one user at a time to edit the weekly Project. If no "
     "user is on the system then you will need to enter the 'Network Setup' area to unlock this Weekly project."_s;
+const QString changed = u"What is stored of this date has changed since it was opened here."_s;
 const QString kept = u"Nothing was stored. What was typed stands here until you leave the date."_s;
 const QString removed_elsewhere = u"This date has been removed by another user."_s;
 
@@ -114,9 +115,10 @@ TEST_P(RegisterRaceTest, WhoeverLostTheLockOverwritesNothingThatOthersStoredMean
     ASSERT_TRUE(theirs->save());
     ASSERT_TRUE(theirs->leave());
 
-    dialogue().expect_box(u"The lock on this Weekly Project was taken away while the date was open here, and another "
-                          "user has changed the date meanwhile."_s,
-                          kept);
+    dialogue().expect_box(changed,
+                          u"Another user may have changed it after the lock on this Weekly Project was taken away, or "
+                          "the connection was lost while it was being stored. "_s +
+                              kept);
     EXPECT_FALSE(weekly->save());
     EXPECT_EQ(stored(first), u"1:12 2:20 3:$30.00");
     EXPECT_EQ(locks(), 0) << "The refused save took the lock.";
@@ -157,11 +159,9 @@ TEST_P(RegisterRaceTest, ALockTakenAgainForSomethingElseHidesNoChange)
     ASSERT_TRUE(theirs->save());
     ASSERT_TRUE(theirs->leave());
     dialogue().expect_confirm(u"Please confirm that you wish to remove this record"_s, Answer::yes);
-    dialogue().expect_box(u"The lock on this Weekly Project was taken away while the date was open here, and another "
-                          "user has changed the date meanwhile."_s);
+    dialogue().expect_box(changed);
     EXPECT_FALSE(weekly->remove(key));
-    dialogue().expect_box(u"The lock on this Weekly Project was taken away while the date was open here, and another "
-                          "user has changed the date meanwhile."_s);
+    dialogue().expect_box(changed);
     EXPECT_FALSE(weekly->save());
     EXPECT_EQ(stored(second), u"1:41");
 }
@@ -227,8 +227,7 @@ TEST_P(RegisterRaceTest, ACategoryThatIsGoneWithTheLockGetsNoFigure)
     core::Locks(other->office).unlock(core::LockKind::weekly, 1);
     core::remove_entities(*other->office.session, core::Entity::weekly_group, std::array{2});
 
-    dialogue().expect_box(u"The lock on this Weekly Project was taken away while the date was open here, and another "
-                          "user has changed the date meanwhile."_s);
+    dialogue().expect_box(changed);
     EXPECT_FALSE(weekly->save());
     EXPECT_EQ(count(u"[tbl_weekly_amount]"_s), 0);
 }

@@ -42,6 +42,7 @@ struct RefusedCase
 {
     PeriodChoice choice;
     QString words;
+    registers::ReportField guilty = registers::ReportField::from;
 };
 
 const auto no_year = u"Please enter an analysis year"_s;
@@ -63,7 +64,8 @@ TEST(WeeklyPeriodsTest, APeriodRunsFromItsFirstDayToItsLast)
     };
     for (const auto& one : cases) {
         ScriptedDialogue dialogue;
-        const auto period = read_period(one.choice, core::DayOrder::day_first, dialogue);
+        registers::ReportCheck check{dialogue};
+        const auto period = read_period(one.choice, core::DayOrder::day_first, check);
         ASSERT_TRUE(period) << one.title.toStdString();
         EXPECT_EQ(period->title, one.title);
         EXPECT_EQ(period->first, one.first) << one.title.toStdString();
@@ -75,9 +77,11 @@ TEST(WeeklyPeriodsTest, WhatMakesNoPeriodIsRefusedInWords)
 {
     const std::vector<RefusedCase> cases{
         {days({}, {}), u"Please select a date to begin the search from"_s},
-        {days(Date{2007, 1, 1}, {}), u"Please select a date to end the search from"_s},
+        {days(Date{2007, 1, 1}, {}), u"Please select a date to end the search from"_s, registers::ReportField::to},
+        {days(Date{1800, 3, 5}, Date{2007, 1, 1}), u"Please enter the year too."_s},
+        {days(Date{2007, 1, 1}, Date{1800, 3, 5}), u"Please enter the year too."_s, registers::ReportField::to},
         {days(Date{2007, 1, 2}, Date{2007, 1, 1}),
-         u"The date to end the search from is before the date to begin the search from"_s},
+         u"The date to end the search from is before the date to begin the search from"_s, registers::ReportField::to},
         {years(calendar_year, u" "_s), no_year},
         {years(financial_year, {}), no_year},
         {years(calendar_year, u"07"_s), bad_year},
@@ -86,23 +90,27 @@ TEST(WeeklyPeriodsTest, WhatMakesNoPeriodIsRefusedInWords)
         {years(calendar_year, u"20071"_s), bad_year},
         {years(calendar_year, u"0000"_s), bad_year},
         {years(year_span, {}, u"2007"_s), no_year},
-        {years(year_span, u"2007"_s, {}), u"Please enter a `To' year for analysis"_s},
-        {years(year_span, u"2007"_s, u"8"_s), bad_year},
-        {years(year_span, u"2007"_s, u"2006"_s), u"The `To' year for analysis is before the year to begin from"_s},
-        {years(year_span, u"2000"_s, u"2012"_s), too_long},
+        {years(year_span, u"2007"_s, {}), u"Please enter a `To' year for analysis"_s, registers::ReportField::to},
+        {years(year_span, u"2007"_s, u"8"_s), bad_year, registers::ReportField::to},
+        {years(year_span, u"2007"_s, u"2006"_s), u"The `To' year for analysis is before the year to begin from"_s,
+         registers::ReportField::to},
+        {years(year_span, u"2000"_s, u"2012"_s), too_long, registers::ReportField::to},
     };
     for (const auto& one : cases) {
         ScriptedDialogue dialogue;
         dialogue.expect_box(one.words);
-        EXPECT_FALSE(read_period(one.choice, core::DayOrder::day_first, dialogue)) << one.words.toStdString();
+        registers::ReportCheck check{dialogue};
+        EXPECT_FALSE(read_period(one.choice, core::DayOrder::day_first, check)) << one.words.toStdString();
+        EXPECT_EQ(check.guilty, one.guilty) << one.words.toStdString();
     }
 }
 
 TEST(WeeklyPeriodsTest, MonthsCountFromTheFirstOfThePeriod)
 {
     ScriptedDialogue dialogue;
-    const auto calendar = *read_period(years(calendar_year, u"2008"_s), core::DayOrder::day_first, dialogue);
-    const auto financial = *read_period(years(financial_year, u"2007"_s), core::DayOrder::day_first, dialogue);
+    registers::ReportCheck check{dialogue};
+    const auto calendar = *read_period(years(calendar_year, u"2008"_s), core::DayOrder::day_first, check);
+    const auto financial = *read_period(years(financial_year, u"2007"_s), core::DayOrder::day_first, check);
     struct Case
     {
         registers::Period period;

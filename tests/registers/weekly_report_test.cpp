@@ -1,5 +1,7 @@
 #include "registers/weekly_reports.h"
 
+#include "pages/find.h"
+
 #include "weekly_fixture.h"
 
 namespace kindrel::test {
@@ -50,7 +52,8 @@ protected:
         asked.project = 1;
         asked.report = registers::find_weekly_report(report);
         asked.categories = {3, 2, 1};
-        const bool several = asked.report && asked.report->period == registers::ReportPeriod::years;
+        const bool several = asked.report && (asked.report->period == registers::ReportPeriod::years ||
+                                              asked.report->period == registers::ReportPeriod::two_years);
         asked.period.kind = several ? PeriodKind::year_span : PeriodKind::calendar_year;
         asked.period.year = several ? u"2006"_s : u"2007"_s;
         asked.period.to_year = u"2007"_s;
@@ -60,7 +63,11 @@ protected:
     }
     bool run(const WeeklyReportRequest& asked, pages::Paper paper = pages::Paper::a4)
     {
-        return run_weekly_report(desk.office, asked, paper, progress, spool.emplace());
+        spool.emplace();
+        registers::ReportCheck check{desk.dialogue};
+        const auto plan = plan_weekly_report(desk.office, asked, check);
+        guilty = check.guilty;
+        return plan && write_weekly_report(desk.office, *plan, paper, progress, *spool);
     }
     /// The texts of all pages, each page's in the order of writing.
     QStringList texts()
@@ -76,13 +83,15 @@ protected:
         const auto all = texts();
         return all.mid(std::max<qsizetype>(0, all.indexOf(first)), cells).join(u' ');
     }
-    void refused(const WeeklyReportRequest& asked, const QString& words)
+    void refused(const WeeklyReportRequest& asked, const QString& words,
+                 std::optional<registers::ReportField> field = {})
     {
         desk.dialogue.expect_box(words);
         EXPECT_FALSE(run(asked)) << words.toStdString();
         desk.dialogue.verify();
         EXPECT_EQ(spool->page_count(), 0);
         EXPECT_FALSE(spool->finished());
+        EXPECT_TRUE(!field || guilty == field) << words.toStdString();
     }
     /// Makes `count` categories of attendance, each with a figure in March 2007, and returns their keys.
     std::vector<int> many_categories(int count)
@@ -102,7 +111,8 @@ protected:
     SetupOffice desk;
     WeeklyFigures figures;
     CancellingProgress progress;
-    std::optional<pages::PageSpool> spool; ///< Of the last run.
+    std::optional<pages::PageSpool> spool;        ///< Of the last run.
+    std::optional<registers::ReportField> guilty; ///< Likewise.
 };
 
 struct ReportCase
@@ -191,22 +201,23 @@ TEST_F(WeeklyReportTest, EveryReportOfTheListCanBeRun)
 
 TEST_F(WeeklyReportTest, WhatIsMissingIsAskedForInOrder)
 {
+    using enum registers::ReportField;
     WeeklyReportRequest asked;
-    refused(asked, u"Please choose a weekly project"_s);
+    refused(asked, u"Please choose a weekly project"_s, project);
     asked.project = 1;
-    refused(asked, u"Please choose a report"_s);
+    refused(asked, u"Please choose a report"_s, report);
     asked.report = registers::find_weekly_report(u"weekly_analysis_report");
     refused(asked, u"Please select either a financial or attendance item"_s);
     asked.categories = {4};
-    refused(asked, u"Please select either a financial or attendance item"_s);
+    refused(asked, u"Please select either a financial or attendance item"_s, categories);
     asked.categories = {1};
-    refused(asked, u"Please choose a chart style"_s);
+    refused(asked, u"Please choose a chart style"_s, chart);
     asked.chart = pages::find_chart_style(u"2D Bar");
     refused(asked, u"Please select a date to begin the search from"_s);
     asked.period.from = Date{2007, 5, 1};
     refused(asked, u"Please select a date to end the search from"_s);
     asked.period.to = Date{2007, 5, 31};
-    refused(asked, u"No figures found for creating a report"_s);
+    refused(asked, u"No figures found for creating a report"_s, from);
     asked.period.from = Date{2007, 3, 18};
     EXPECT_TRUE(run(asked));
 }
@@ -274,10 +285,11 @@ INSTANTIATE_TEST_SUITE_P(
 
 TEST_F(WeeklyReportTest, SixGraphsAreTheMostOfAMonthlyReport)
 {
+    using enum registers::ReportField;
     auto asked = request(u"weekly_table_average_report"_s);
     asked.chart = pages::find_chart_style(u"3D Bar");
     asked.categories = many_categories(7);
-    refused(asked, u"A maximum of six graphs can only be displayed at once for the monthly analysis Report"_s);
+    refused(asked, u"A maximum of six graphs can only be displayed at once for the monthly analysis Report"_s, chart);
 
     asked.categories.pop_back();
     ASSERT_TRUE(run(asked));
@@ -330,6 +342,83 @@ TEST_F(WeeklyReportTest, AComparisonLooksAtItsTwoYearsAlone)
     EXPECT_EQ(row_of(u"Morning"_s, 4), u"Morning +4 +4 Evening"_s);
     asked.categories = {2};
     refused(asked, u"No figures found for creating a report"_s);
+}
+
+TEST_F(WeeklyReportTest, ATableOfChangesWithoutAChangeIsRefusedNamingTheYearWithoutFigures)
+{
+    figures.add({{{2009, 1, 4}, 2, 34}, {{2009, 3, 1}, 2, 34}});
+    struct Case
+    {
+        QString report, from, to, words;
+        std::vector<int> categories = {1, 2, 3};
+    };
+    for (const auto& [report, from, to, words, categories] :
+         {Case{u"Yearly_variance_report"_s, u"2003"_s, u"2007"_s,
+               u"There are no figures of 2003 to compare with those of 2007."_s},
+          Case{u"Yearly_variance_report"_s, u"2007"_s, u"2011"_s,
+               u"There are no figures of 2011 to compare with those of 2007."_s},
+          Case{u"Yearly_variance_report"_s, u"2007"_s, u"2009"_s,
+               u"None of the chosen categories has figures of both 2007 and 2009."_s},
+          Case{u"weekly_table_variance_report"_s,
+               u"2009"_s,
+               {},
+               u"No month of the period and the month before it both have figures of the chosen categories."_s}}) {
+        auto asked = request(report);
+        asked.categories = categories;
+        asked.period.year = from;
+        asked.period.to_year = to;
+        refused(asked, words, registers::ReportField::from);
+    }
+}
+
+TEST_F(WeeklyReportTest, ChartsFillThePageThatTheirTableLeaves)
+{
+    struct Case
+    {
+        QString report, last; ///< The lowest text of a chart, or of the table beneath it.
+    };
+    for (const auto& [report, last] :
+         {Case{u"weekly_table_report"_s, u"December"_s}, Case{u"weekly_table_average_report"_s, u"December"_s},
+          Case{u"weekly_analysis_report"_s, u"Lowest Amount"_s}}) {
+        auto asked = request(report);
+        asked.chart = pages::find_chart_style(u"2D Line");
+        if (report != u"weekly_analysis_report")
+            asked.categories = {1, 3};
+        ASSERT_TRUE(run(asked));
+        EXPECT_EQ(spool->page_count(), 1) << report.toStdString();
+        const auto page = spool->page(1);
+        const auto places = pages::find(page, last);
+        ASSERT_FALSE(places.empty()) << report.toStdString();
+        EXPECT_GT(places.back().where.bottom(), page.size.height() * 0.75) << report.toStdString();
+    }
+}
+
+TEST_F(WeeklyReportTest, FiguresThatAddUpToNothingHaveADashForAnAverage)
+{
+    figures.add({{{2007, 3, 11}, 2, 0}});
+    auto asked = request(u"weekly_total_report"_s);
+    asked.categories = {2, 3};
+    ASSERT_TRUE(run(asked));
+    EXPECT_EQ(row_of(u"Average Amount"_s, 3), u"Average Amount – $63.50"_s);
+}
+
+TEST_F(WeeklyReportTest, TheLargestFiguresAndTheWordsOfHeadingsStandWhole)
+{
+    const std::array keys{100, 101, 102, 103, 104, 105, 106, 107, 108};
+    for (const int key : keys) {
+        figures.category(key, u"Thanksgiving %1"_s.arg(key), money);
+        for (int week = 1; week < 53; ++week)
+            figures.add({{Date::from(QDate(2007, 1, 1).addDays(7 * week - 7)), key, 99999}});
+    }
+    for (const auto& report : {u"weekly_total_report"_s, u"weekly_table_report"_s, u"Yearly_table_report"_s}) {
+        auto asked = request(report);
+        asked.categories.assign(keys.begin(), keys.end());
+        asked.period.year = u"2007"_s;
+        ASSERT_TRUE(run(asked)) << report.toStdString();
+        const auto all = texts();
+        EXPECT_GE(all.count(u"$5199948.00"_s), 9) << all.join(u'|').toStdString();
+        EXPECT_TRUE(all.contains(u"Thanksgiving"_s) || all.contains(u"Thanksgiving 100 ($)"_s));
+    }
 }
 
 TEST_F(WeeklyReportTest, OfAProjectsCategoriesOnlyTheChosenOnesPrint)

@@ -25,6 +25,12 @@ QString database(const QString& name)
     return u"%1 dbname=%2"_s.arg(server(), name);
 }
 
+/// What is done to whole databases stands outside any transaction, and what is executed never does.
+void run_outside(core::Session& session, const QString& statement)
+{
+    (void)session.select(statement);
+}
+
 /// Laying the schema takes a second, copying it a fraction: the first test that needs it makes the template for all.
 void provide_template(core::Session& server_session)
 {
@@ -34,10 +40,10 @@ void provide_template(core::Session& server_session)
         return;
     const QString half_made = template_database + u"_half"_s;
     const auto maker = core::open_postgres(server());
-    maker->execute(u"DROP DATABASE IF EXISTS [%1]"_s.arg(half_made));
-    maker->execute(u"CREATE DATABASE [%1]"_s.arg(half_made));
+    run_outside(*maker, u"DROP DATABASE IF EXISTS [%1]"_s.arg(half_made));
+    run_outside(*maker, u"CREATE DATABASE [%1]"_s.arg(half_made));
     core::create_schema(*core::open_postgres(database(half_made)));
-    maker->execute(u"ALTER DATABASE [%1] RENAME TO [%2]"_s.arg(half_made, template_database));
+    run_outside(*maker, u"ALTER DATABASE [%1] RENAME TO [%2]"_s.arg(half_made, template_database));
 }
 
 /// Unique among all test programs that share the server.
@@ -64,7 +70,7 @@ TestChurch::TestChurch(core::EngineKind engine)
         m_database = next_name();
         const auto server_session = core::open_postgres(server());
         provide_template(*server_session);
-        server_session->execute(u"CREATE DATABASE [%1] TEMPLATE [%2]"_s.arg(m_database, template_database));
+        run_outside(*server_session, u"CREATE DATABASE [%1] TEMPLATE [%2]"_s.arg(m_database, template_database));
         m_connection = database(m_database);
         m_session = core::open_postgres(m_connection);
     }
@@ -74,7 +80,7 @@ TestChurch::~TestChurch()
 {
     m_session.reset();
     if (!m_database.isEmpty())
-        core::open_postgres(server())->execute(u"DROP DATABASE [%1] WITH (FORCE)"_s.arg(m_database));
+        run_outside(*core::open_postgres(server()), u"DROP DATABASE [%1] WITH (FORCE)"_s.arg(m_database));
 }
 
 std::unique_ptr<core::Session> TestChurch::another() const

@@ -39,8 +39,9 @@ struct Choice
 };
 constexpr std::array choices{
     Choice{"with_pictures", u"&Photographs and pictures", &BackupChoice::with_pictures},
-    Choice{"with_documents", u"&Notebook pages, roster history and Wardline documents", &BackupChoice::with_documents},
-    Choice{"with_letters", u"&Letters and custom layouts", &BackupChoice::with_letters},
+    Choice{"with_documents", u"&Notebook pages, sounds, roster history and Wardline documents",
+           &BackupChoice::with_documents},
+    Choice{"with_letters", u"&Letters, custom layouts and plug-ins", &BackupChoice::with_letters},
 };
 
 QString last_words(const core::KnownBackup* last, core::DayOrder order)

@@ -69,10 +69,8 @@ std::vector<ComparedLine> compare(const core::Office& office, const core::Backup
 {
     const core::ChurchSummary present = core::present_state(office);
     std::vector<ComparedLine> lines{church_line(backup.church, present), age_line(backup, present, office.day_order())};
-    const auto then = core::kinds_of(backup.church);
-    const auto now = core::kinds_of(present);
-    for (std::size_t kind = 0; kind < then.size(); ++kind)
-        lines.push_back(counts(then[kind].words, then[kind].rows, now[kind].rows));
+    for (const auto& kind : core::compared_kinds(backup.church, present))
+        lines.push_back(counts(kind.words, kind.then, kind.now));
     for (const core::BackupPart& part : core::backup_parts()) {
         const auto found = std::ranges::find(backup.parts, QString::fromUtf16(part.words), &core::PartContents::words);
         lines.push_back(part_line(office, part, found == backup.parts.end() ? nullptr : &*found));

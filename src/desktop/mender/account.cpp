@@ -97,16 +97,18 @@ Account account_of_no_place(const QString& why)
 
 Account account_of_no_church(const QString& church, const QString& file)
 {
-    return {.chip = u"No records"_s,
-            .state = State::error,
-            .title = u"There are no records of %1 here."_s.arg(church),
-            .lines = {plain(u"'%1' is missing."_s.arg(file)),
-                      plain(u"If this church was never set up, choose another one above."_s),
-                      plain(u"If it had records, put back a backup: started without them, %1 would begin an empty "
-                            "church. Where there is only a damaged church file, 'Recover what can be read' makes a new "
-                            "one of it."_s.arg(core::product))},
-            .next = MenderAct::none,
-            .looked = true};
+    return {
+        .chip = u"No records"_s,
+        .state = State::error,
+        .title = u"There are no records of %1 here."_s.arg(church),
+        .lines = {plain(u"'%1' is missing."_s.arg(file)),
+                  plain(u"If this church was never set up, choose another one above."_s),
+                  plain(u"If it had records, put back a backup: started without them, %1 would begin an empty "
+                        "church. Where there is only a damaged church file, 'Recover what can be read' makes a new "
+                        "one of it, and 'Put recovered file in place' gives that to the church."_s.arg(core::product))},
+        .next = MenderAct::none,
+        .looked = true,
+        .makes_way = true};
 }
 
 Account account_of_failure(const QString& why)
@@ -201,11 +203,33 @@ Account account_of_recovery(const QString& damaged, const QString& fresh,
                     .lines = {{.words = words::where_recovered(damaged, fresh),
                                .in_report = u"What could be read stands in a new church file; the damaged one was left "
                                             "as it is."_s},
-                              plain(words::after_recovering())}};
+                              plain(without_commands(words::after_recovering()))},
+                    .next = MenderAct::put_in_place,
+                    .makes_way = true,
+                    .recovered = fresh};
     for (auto group : {recovered_group(u"Not whole"_s, tables, false), recovered_group(u"Whole"_s, tables, true)}) {
         if (!group.lines.empty())
             account.groups.push_back(std::move(group));
     }
+    return account;
+}
+
+Account account_of_placing(const QString& church, const core::Placement& placement, const QString& database,
+                           const Findings& findings)
+{
+    const auto& mending = placement.mending;
+    auto account = mending.refusal.isEmpty() ? account_of_mending(church, mending)
+                                             : account_of_refusal(church, mending.refusal.split(u'\n'), findings);
+    if (!mending.refusal.isEmpty()) {
+        account.chip = u"Not mended yet"_s;
+        account.title = u"%1: the recovered file is in place"_s.arg(church);
+    } else if (mending.mended.empty()) {
+        account.lines.erase(account.lines.begin()); // That nothing was changed holds for the mending alone.
+    }
+    std::vector<AccountLine> lines;
+    for (const auto& line : words::where_put(placement, database))
+        lines.push_back({.words = line, .in_report = line.section(u'\'', 0, 0) + u"…"_s});
+    account.lines.insert(account.lines.begin(), lines.begin(), lines.end());
     return account;
 }
 

@@ -7,7 +7,7 @@
 namespace kindrel::desktop {
 
 /// What can be done in the mender's window.
-enum class MenderAct { none, check, mend, unlock, recover, set_aside };
+enum class MenderAct { none, check, mend, unlock, recover, put_in_place, set_aside };
 
 /// A sentence, and what stands quietly beneath it.
 struct AccountLine
@@ -37,6 +37,8 @@ struct Account
     bool mendable = false;             ///< There is something that mending cures.
     bool damaged = false;              ///< The church's own file is, so that it may be set aside.
     QString database = {};             ///< The church's own file; empty where there is none.
+    bool makes_way = false;            ///< A recovered file may take the place of the church's own.
+    QString recovered = {};            ///< That file; empty where none was recovered just now.
     QString data_root = {};            ///< Under which the church lies.
 };
 
@@ -62,5 +64,8 @@ struct Account
                                           const std::vector<core::RecoveredTable>& tables);
 
 [[nodiscard]] Account account_of_setting_aside(const QString& aside);
+/// `database` is the church's own file; the findings are those that are left.
+[[nodiscard]] Account account_of_placing(const QString& church, const core::Placement& placement,
+                                         const QString& database, const core::Findings& findings);
 
 } // namespace kindrel::desktop

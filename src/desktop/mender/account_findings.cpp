@@ -26,7 +26,7 @@ constexpr std::array cure_groups{
     CureGroup{
         Cure::recover, MenderAct::recover, u"The database itself is damaged",
         u"Where there is a backup, press 'Set damaged file aside', start Kindrel and put the backup back. Otherwise "
-        u"press 'Recover what can be read', which writes a new church file and leaves this one as it is."},
+        u"press 'Recover what can be read', which writes a new church file, and then 'Put recovered file in place'."},
     CureGroup{Cure::unlock, MenderAct::unlock, u"Locks and markers that keep people out",
               u"Ask whether anybody is at work in the church. When nobody is, press 'Remove locks and markers'."},
     CureGroup{Cure::mend, MenderAct::mend, u"What mending puts right",
@@ -66,6 +66,8 @@ void add_findings(Account& account, const Findings& findings)
 
 MenderAct next_act(const Findings& findings)
 {
+    if (core::out_of_sight(findings))
+        return MenderAct::check;
     if (is_damaged(findings))
         return MenderAct::recover;
     if (has(findings, Cure::unlock))
@@ -105,7 +107,7 @@ void judge(Account& account, const Findings& findings)
 {
     account.looked = true;
     account.mendable = has(findings, Cure::mend);
-    account.damaged = has(findings, Cure::recover);
+    account.damaged = account.makes_way = has(findings, Cure::recover);
     account.next = next_act(findings);
     const bool sound = findings.empty();
     account.state = sound ? State::contact : is_damaged(findings) ? State::error : State::altered;

@@ -12,8 +12,8 @@ namespace {
 /// Findings whose words are the program's own, with counts and names of tables and settings files. What is not listed
 /// is told by its kind alone.
 constexpr std::array impersonal{
-    u"companions", u"orphans",    u"positions", u"counters", u"version",        u"schema", u"indexes",
-    u"markers",    u"side_files", u"names",     u"damaged",  u"orphaned_files", u"closed", u"unreadable",
+    u"companions", u"orphans", u"positions", u"counters",       u"version", u"schema",     u"indexes", u"markers",
+    u"side_files", u"names",   u"damaged",   u"orphaned_files", u"closed",  u"unreadable", u"in_use",
 };
 
 /// What stands before the first of these.
@@ -35,7 +35,7 @@ QString discreet(const core::Finding& finding)
         return discreet_lock(finding.words);
     if (is_kind(u"doubles"))
         return before(finding.words, u"(the first"_s) + u'.';
-    if (is_kind(u"leftovers"))
+    if (is_kind(u"leftovers") || is_kind(u"server"))
         return before(finding.words, u":"_s) + u'.';
     return u"%1: %2"_s.arg(finding.kind, core::counted(finding.count, u"entry"_s, u"entries"_s));
 }

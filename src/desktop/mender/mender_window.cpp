@@ -5,6 +5,7 @@
 #include "desktop/mender/account_view.h"
 #include "desktop/mender/act_panel.h"
 #include "desktop/mender/beside.h"
+#include "desktop/mender/mender_questions.h"
 #include "desktop/mender/place_bar.h"
 #include "desktop/shell/chip.h"
 #include "desktop/shell/help.h"
@@ -13,7 +14,6 @@
 
 #include <QAction>
 #include <QCloseEvent>
-#include <QFileInfo>
 #include <QProgressBar>
 #include <QShortcut>
 #include <QStandardPaths>
@@ -31,7 +31,6 @@ namespace {
 namespace words = core::mender_words;
 
 constexpr QSize least_size{760, 520};
-const QString church_files = u"Church files (*.kdl)"_s;
 
 /// What needs no more than a yes.
 struct PlannedAct
@@ -63,7 +62,10 @@ MenderWindow::MenderWindow(MenderSurroundings surroundings)
     content->setLayout(make_content());
     set_content(content);
     connect(m_report, &QAction::triggered, this, &MenderWindow::save_report);
-    connect(m_place, &PlaceBar::drive_chosen, this, [this] { list_churches(m_place->data_drive(), 0); });
+    connect(m_place, &PlaceBar::drive_chosen, this, [this] {
+        if (!m_busy) // Then the field is only left because it is closed.
+            list_churches(m_place->data_drive(), 0);
+    });
     connect(m_place, &PlaceBar::browse_wanted, this, &MenderWindow::browse);
     connect(m_place, &PlaceBar::church_chosen, this, &MenderWindow::forget);
     connect(m_place, &PlaceBar::check_wanted, this, &MenderWindow::check);
@@ -123,6 +125,7 @@ void MenderWindow::browse()
 void MenderWindow::forget()
 {
     note().clear();
+    m_told.reset();
     show_account(account_at_start());
 }
 
@@ -150,17 +153,23 @@ void MenderWindow::lead_on()
 
 void MenderWindow::act(MenderAct what)
 {
-    if (what == MenderAct::recover) {
-        recover();
+    if (m_place->settle_drive() || !m_told) // Nothing is known of a church of that drive.
         return;
-    }
+    const MenderJob job = *m_told;
+    if (what == MenderAct::recover)
+        recover(job);
+    else if (what == MenderAct::put_in_place)
+        put_in_place(job);
     for (const auto& planned : planned_acts) {
-        if (planned.act == what && agreed(planned.question(m_place->church()), found_for(m_account, what)))
-            work(QString::fromUtf16(planned.doing).arg(m_place->church_in_words()), true, planned.work);
+        const core::Message question{.text = planned.question(job.request.church),
+                                     .more = found_for(m_account, what),
+                                     .icon = core::Icon::question};
+        if (planned.act == what && m_surroundings.dialogue.confirm(question, core::Answer::no))
+            work(job, QString::fromUtf16(planned.doing).arg(job.church), true, planned.work);
     }
 }
 
-MenderJob MenderWindow::job() const
+MenderJob MenderWindow::chosen_job() const
 {
     return {.workstation = m_surroundings.workstation,
             .clock = m_surroundings.clock,
@@ -168,15 +177,20 @@ MenderJob MenderWindow::job() const
             .church = m_place->church_in_words()};
 }
 
-void MenderWindow::work(const QString& what, bool changes, const std::function<Account(const MenderJob&)>& work)
+void MenderWindow::work(const MenderJob& job, const QString& what, bool changes,
+                        const std::function<Account(const MenderJob&)>& work)
 {
     note().clear();
-    const MenderJob given = job();
     m_busy = true;
     show_account(account_of_work(what, changes));
     Account account;
-    run_beside([&] { account = work(given); });
+    try {
+        run_beside([&] { account = work(job); });
+    } catch (...) { // Whatever it is, the window must not stay at work.
+        account = account_of_failure(u"The work ended in a way that cannot be told."_s);
+    }
     m_busy = false;
+    m_told.emplace(job);
     show_account(account);
     lead_on();
 }
@@ -185,36 +199,27 @@ void MenderWindow::check()
 {
     if (m_busy)
         return;
-    if (m_place->church() == 0) {
-        m_place->lead_to_check();
-        note().say(u"Choose the church first: there are several on this data drive."_s);
-        return;
-    }
-    work(u"Looking at %1"_s.arg(m_place->church_in_words()), false, check_church);
+    const int church = m_place->church();
+    m_place->settle_drive();
+    if (m_place->church() > 0 && m_place->church() == church)
+        return work(chosen_job(), u"Looking at %1"_s.arg(m_place->church_in_words()), false, check_church);
+    m_place->lead_to_check();
+    note().say(m_place->church() == 0 ? u"Choose the church first: there are several on this data drive."_s
+                                      : u"See which church of this data drive is chosen, then check it."_s);
 }
 
-bool MenderWindow::agreed(const QString& question, const QString& more)
+void MenderWindow::recover(const MenderJob& job)
 {
-    return m_surroundings.dialogue.confirm({.text = question, .more = more, .icon = core::Icon::question},
-                                           core::Answer::no);
+    if (const auto files = ask_for_recovery(m_surroundings.dialogue, m_account, job.request.data_drive))
+        work(job, u"Recovering what can be read"_s, true,
+             [&](const MenderJob& given) { return recover_church(given, files->damaged, files->fresh); });
 }
 
-void MenderWindow::recover()
+void MenderWindow::put_in_place(const MenderJob& job)
 {
-    auto& dialogue = m_surroundings.dialogue;
-    const auto damaged = m_account.database.isEmpty()
-                             ? dialogue.choose_file({u"The damaged church file"_s, church_files, m_place->data_drive()})
-                             : m_account.database;
-    if (!damaged)
-        return;
-    const auto fresh = dialogue.choose_file({.title = u"A new church file for what can be read"_s,
-                                             .filter = church_files,
-                                             .suggested = QFileInfo(*damaged).path() + u"/KR10_records recovered.kdl"_s,
-                                             .kind = FileQuestion::Kind::save});
-    if (!fresh || !agreed(words::recovering_question(*damaged, *fresh), {}))
-        return;
-    work(u"Recovering what can be read"_s, true,
-         [&](const MenderJob& given) { return recover_church(given, *damaged, *fresh); });
+    if (const auto recovered = ask_for_placing(m_surroundings.dialogue, m_account, job))
+        work(job, u"Putting the recovered file in the place of %1"_s.arg(job.church), true,
+             [&](const MenderJob& given) { return put_church_in_place(given, *recovered); });
 }
 
 void MenderWindow::save_report()
@@ -228,7 +233,7 @@ void MenderWindow::save_report()
          .kind = FileQuestion::Kind::save});
     if (!file)
         return;
-    core::write_file(*file, report_of(m_account, m_place->church(), now));
+    core::write_file(*file, report_of(m_account, m_told ? m_told->request.church : m_place->church(), now));
     note().say(u"The report is saved as '%1'. It names nobody."_s.arg(*file));
 }
 

@@ -54,11 +54,12 @@ private:
 
     void act(MenderAct what);
     void check();
-    void recover();
-    [[nodiscard]] bool agreed(const QString& question, const QString& more);
-    [[nodiscard]] MenderJob job() const;
+    void recover(const MenderJob& job);
+    void put_in_place(const MenderJob& job);
+    [[nodiscard]] MenderJob chosen_job() const;
     /// Shows `what` while the work runs beside the window, then what came of it.
-    void work(const QString& what, bool changes, const std::function<Account(const MenderJob&)>& work);
+    void work(const MenderJob& job, const QString& what, bool changes,
+              const std::function<Account(const MenderJob&)>& work);
 
     MenderSurroundings m_surroundings;
     PlaceBar* m_place;
@@ -67,6 +68,7 @@ private:
     ActPanel* m_acts;
     QAction* m_report;
     Account m_account;
+    std::optional<MenderJob> m_told; ///< Of which church the account tells; that one is worked on, whatever is chosen.
     bool m_busy = false;
 };
 

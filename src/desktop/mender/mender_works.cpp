@@ -63,8 +63,8 @@ Account with_place(const MenderJob& job, core::Workstation& workstation,
 /// The edge at which every failure turns into an account.
 Account at_the_church(const MenderJob& job, const std::function<Account(MenderPlace&)>& act)
 {
-    const auto workstation = job.workstation();
     try {
+        const auto workstation = job.workstation();
         return with_place(job, *workstation, act);
     } catch (const core::DatabaseError& error) {
         return account_of_failure(error.text());
@@ -119,7 +119,13 @@ Account recover_church(const MenderJob& job, const QString& damaged, const QStri
             return *refusal;
         place.session.reset();
         const QString from = damaged.isEmpty() ? place.paths.database() : damaged;
-        return account_of_recovery(from, fresh, core::recover_church(from, fresh));
+        auto account = account_of_recovery(from, fresh, core::recover_church(from, fresh));
+        if (const QFileInfo own(place.paths.database());
+            own.exists() && own == QFileInfo(fresh)) { // It is in place already.
+            account.makes_way = false;
+            account.next = MenderAct::check;
+        }
+        return account;
     });
 }
 
@@ -129,6 +135,17 @@ Account set_church_aside(const MenderJob& job)
         if (const auto refusal = refusal_while_running(job, place))
             return *refusal;
         return account_of_setting_aside(core::set_database_aside(place));
+    });
+}
+
+Account put_church_in_place(const MenderJob& job, const QString& recovered)
+{
+    return at_the_church(job, [&](MenderPlace& place) {
+        if (const auto refusal = refusal_while_running(job, place))
+            return *refusal;
+        const auto placement = core::put_in_place(place, recovered, people::mender_checks());
+        const auto left = placement.mending.refusal.isEmpty() ? placement.mending.left : examine(place);
+        return account_of_placing(job.church, placement, place.paths.database(), left);
     });
 }
 

@@ -25,5 +25,6 @@ struct MenderJob
 /// `damaged` may be empty: the church's own file.
 [[nodiscard]] Account recover_church(const MenderJob& job, const QString& damaged, const QString& fresh);
 [[nodiscard]] Account set_church_aside(const MenderJob& job);
+[[nodiscard]] Account put_church_in_place(const MenderJob& job, const QString& recovered);
 
 } // namespace kindrel::desktop

@@ -43,7 +43,7 @@ PlaceBar::PlaceBar()
     m_check->setToolTip(u"Looks for everything that may be wrong and changes nothing (F5)"_s);
     for (auto* button : {m_browse, m_check})
         button->setAutoDefault(true); // Enter presses it.
-    connect(m_drive, &QLineEdit::editingFinished, this, &PlaceBar::drive_typed);
+    connect(m_drive, &QLineEdit::editingFinished, this, &PlaceBar::settle_drive);
     connect(m_browse, &QPushButton::clicked, this, &PlaceBar::browse_wanted);
     connect(m_church, &QComboBox::currentIndexChanged, this, &PlaceBar::church_chosen);
     connect(m_check, &QPushButton::clicked, this, &PlaceBar::check_wanted);
@@ -100,10 +100,12 @@ void PlaceBar::lead_to_drive()
     m_drive->selectAll();
 }
 
-void PlaceBar::drive_typed()
+bool PlaceBar::settle_drive()
 {
-    if (data_drive() != m_list.data_drive)
-        Q_EMIT drive_chosen();
+    if (data_drive() == m_list.data_drive)
+        return false;
+    Q_EMIT drive_chosen();
+    return true;
 }
 
 } // namespace kindrel::desktop

@@ -22,6 +22,8 @@ public:
     /// 0 while none is chosen.
     [[nodiscard]] int church() const;
     [[nodiscard]] QString church_in_words() const;
+    /// Asks for the churches of a data drive that was typed and not confirmed yet; false where there is none.
+    bool settle_drive();
     /// To the button, or to the church while none is chosen.
     void lead_to_check();
     void lead_to_drive();
@@ -33,8 +35,6 @@ Q_SIGNALS:
     void check_wanted();
 
 private:
-    void drive_typed();
-
     ChurchList m_list;
     QLineEdit* m_drive;
     QPushButton* m_browse;

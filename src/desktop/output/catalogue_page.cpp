@@ -1,5 +1,6 @@
 #include "desktop/output/catalogue_page.h"
 
+#include "core/entry.h"
 #include "desktop/output/report_drawing.h"
 #include "desktop/output/report_run.h"
 #include "desktop/output/report_tree.h"
@@ -42,18 +43,34 @@ CataloguePage::CataloguePage(Desk& desk)
 
 QLayout* CataloguePage::make_details()
 {
-    auto* scope = make_value();
-    scope->setText(u"The report is made of all active families. To choose who is on it, use Tagging."_s);
-    dress(*scope, TextSize::secondary);
     auto* column = new QVBoxLayout;
     column->setSpacing(space::margin);
-    for (QLabel* label : {m_leaf, m_description, scope}) {
+    for (QLabel* label : {m_leaf, m_description}) {
         label->setWordWrap(true);
         column->addWidget(label);
     }
+    column->addLayout(make_scope());
     column->addLayout(make_paper());
     column->addWidget(m_drawing, 1);
     return column;
+}
+
+QLayout* CataloguePage::make_scope()
+{
+    auto* scope = make_value();
+    scope->setText(u"Reports from here are made of all active families. "
+                   "A list chosen in Tagging is printed there, in its last step."_s);
+    scope->setWordWrap(true);
+    dress(*scope, TextSize::secondary);
+    auto* tagging = new QPushButton(icon(u"tag"_s), u"Choose people in &Tagging"_s);
+    tagging->setObjectName(u"open_tagging"_s);
+    tagging->setEnabled(core::may_enter(m_desk.office, core::AreaId::tagging));
+    connect(tagging, &QPushButton::clicked, this, [this] { m_desk.navigation.open_area(u"tagging"_s); });
+    auto* row = new QHBoxLayout;
+    row->setSpacing(space::group);
+    row->addWidget(scope, 1);
+    row->addWidget(tagging, 0, Qt::AlignTop);
+    return row;
 }
 
 QLayout* CataloguePage::make_paper()

@@ -30,6 +30,7 @@ public:
 
 private:
     [[nodiscard]] QLayout* make_details();
+    [[nodiscard]] QLayout* make_scope();
     [[nodiscard]] QLayout* make_paper();
     [[nodiscard]] output::RunOptions options() const;
     void show_chosen();

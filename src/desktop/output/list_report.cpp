@@ -1,5 +1,7 @@
 #include "desktop/output/list_report.h"
 
+#include "core/entry.h"
+#include "core/progress_run.h"
 #include "desktop/output/preview_window.h"
 #include "output/decoration.h"
 #include "pages/table.h"
@@ -47,18 +49,20 @@ bool write_rows(pages::Table& table, const std::vector<QStringList>& rows, core:
 
 void print_list(Desk& desk, const QString& title, const QAbstractItemModel& model)
 {
+    if (!core::permitted(desk.office, core::Area::report_outputs))
+        return;
     const auto write = [&office = desk.office, title, columns = columns_of(model),
                         rows = rows_of(model)](core::Progress& progress, pages::PageSpool& spool) {
         pages::Flow flow(spool, {});
         output::decorate(flow, title, {office, people::WorkingList{}});
-        progress.begin(title, int(rows.size()) / rows_per_step, u"Are you sure that you wish to cancel this report?"_s);
+        const core::ProgressRun run(progress, title, int(rows.size()) / rows_per_step,
+                                    u"Are you sure that you wish to cancel this report?"_s);
         {
             pages::Table table(flow, columns);
             if (!write_rows(table, rows, progress))
                 return false;
         }
         flow.finish();
-        progress.end();
         return true;
     };
     open_preview(desk, title, write);

@@ -90,8 +90,6 @@ void BulkPanel::make_details()
     m_state->addItems({u"Active"_s, u"Potential"_s});
     connect(m_state, &QComboBox::currentIndexChanged, this, &BulkPanel::take_details);
     m_date->setObjectName(u"date"_s);
-    m_item.date = core::Date::from(m_desk.office.clock.today());
-    m_date->show_date(m_item.date);
     connect(m_date, &DateField::entered, this, [this](std::optional<core::Date> date) {
         m_item.date = date;
         m_pause->start(0);
@@ -120,7 +118,7 @@ QWidget* BulkPanel::make_buttons()
     rows->setSpacing(space::field);
     rows->setColumnStretch(1, 1);
     add_button(*rows, TagAct::give, u"btn_tag_all"_s, u"&Tag all"_s);
-    add_button(*rows, TagAct::take, u"btn_untag"_s, u"&Untag"_s);
+    add_button(*rows, TagAct::take, u"btn_untag"_s, u"Unta&g"_s);
     return panel;
 }
 
@@ -133,6 +131,7 @@ void BulkPanel::add_button(QGridLayout& rows, TagAct act, const QString& name, c
     count->setObjectName(act == TagAct::give ? u"count_tag_all"_s : u"count_untag"_s);
     count->setWordWrap(true);
     dress(*count, TextSize::secondary);
+    m_buttons[std::size_t(act)] = button;
     m_counts[std::size_t(act)] = count;
     rows.addWidget(button, int(act), 0);
     rows.addWidget(count, int(act), 1);
@@ -223,8 +222,12 @@ void BulkPanel::run(TagAct act)
     } catch (const core::DatabaseError& error) {
         m_desk.office.dialogue.show({u"The people could not be tagged; nothing was changed."_s, error.text()});
     }
+    QWidget* next = m_buttons[std::size_t(act)]; // A line that was typed in would keep Ctrl+Z to itself.
+    if (act == TagAct::give && m_item.lacks_date())
+        next = m_date;
     if (m_item.item == 0)
-        m_filter->setFocus(Qt::OtherFocusReason);
+        next = m_filter;
+    next->setFocus(Qt::OtherFocusReason);
     m_pause->start(0);
     if (change)
         Q_EMIT done(*change);

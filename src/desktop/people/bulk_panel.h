@@ -12,6 +12,7 @@ class QGridLayout;
 class QLabel;
 class QLineEdit;
 class QListWidget;
+class QPushButton;
 class QTimer;
 
 namespace kindrel::desktop {
@@ -61,7 +62,8 @@ private:
     DateField* m_date;
     QLineEdit* m_field;
     QCheckBox* m_mark;
-    std::array<QLabel*, 2> m_counts{}; ///< In the order of people::TagAct.
+    std::array<QPushButton*, 2> m_buttons{}; ///< In the order of people::TagAct.
+    std::array<QLabel*, 2> m_counts{};       ///< Beside them.
     QTimer* m_pause;
 };
 

@@ -1,8 +1,7 @@
 #pragma once
 
+#include "desktop/people/ordered_rows.h"
 #include "people/data_search.h"
-
-#include <QAbstractTableModel>
 
 namespace kindrel::desktop {
 
@@ -10,7 +9,7 @@ namespace kindrel::desktop {
 enum class Unlisted { shown, withheld };
 
 /// The people who have an entry in a part of the record.
-class DataSearchModel : public QAbstractTableModel
+class DataSearchModel : public OrderedRowsModel
 {
     Q_OBJECT
 
@@ -19,12 +18,15 @@ public:
     static constexpr int column_count = 4;
 
     explicit DataSearchModel(Unlisted unlisted, QObject* parent = nullptr)
-        : QAbstractTableModel(parent), m_unlisted(unlisted)
+        : OrderedRowsModel(parent), m_unlisted(unlisted)
     {
     }
 
     void set_entries(std::vector<people::DataEntry> entries);
-    [[nodiscard]] const std::vector<people::DataEntry>& entries() const { return m_entries; }
+    /// In the order of the rows.
+    [[nodiscard]] std::vector<people::DataEntry> entries() const;
+    [[nodiscard]] const people::DataEntry& entry(int row) const;
+    void sort(int column, Qt::SortOrder order) override;
 
     [[nodiscard]] int rowCount(const QModelIndex& parent = {}) const override;
     [[nodiscard]] int columnCount(const QModelIndex& parent = {}) const override;
@@ -33,9 +35,13 @@ public:
 
 private:
     [[nodiscard]] QString text(const people::DataEntry& entry, int column) const;
+    void put_in_order();
 
     Unlisted m_unlisted;
-    std::vector<people::DataEntry> m_entries;
+    std::vector<people::DataEntry> m_entries; ///< As they were read.
+    std::vector<int> m_order;                 ///< Their places, row by row.
+    int m_sort_column = surname;
+    Qt::SortOrder m_sort_order = Qt::AscendingOrder;
 };
 
 } // namespace kindrel::desktop

@@ -76,8 +76,11 @@ void DataSearchTab::set_up_list()
     m_view->setModel(m_model);
     make_row_list(*m_view);
     m_view->horizontalHeader()->setObjectName(u"entries"_s);
+    m_view->horizontalHeader()->setSortIndicator(DataSearchModel::surname, Qt::AscendingOrder);
     follow(m_desk.remembered, *m_view->horizontalHeader(), column_shares);
+    m_view->setSortingEnabled(true);
     m_view->installEventFilter(this);
+    connect(m_model, &DataSearchModel::layoutChanged, this, [this] { m_view->scrollTo(m_view->currentIndex()); });
     connect(m_view, &QTableView::doubleClicked, this, &DataSearchTab::open);
     m_empty->say(u"Choose a part of the record"_s, u"Enter lists everybody who has an entry in it."_s);
     m_stack->addWidget(m_view);
@@ -132,14 +135,13 @@ QString DataSearchTab::count_words() const
 std::vector<int> DataSearchTab::families(int& place) const
 {
     const int row = m_view->currentIndex().row();
-    if (!people::can_open(m_desk.office, m_model->entries().size()) || row < 0)
+    if (!people::can_open(m_desk.office, std::size_t(m_model->rowCount())) || row < 0)
         return {};
-    std::vector<int> keys;
+    people::WorkingList listed;
     for (const auto& entry : m_model->entries())
-        if (keys.empty() || keys.back() != entry.member.surname_id)
-            keys.push_back(entry.member.surname_id);
-    const int chosen = m_model->entries()[std::size_t(row)].member.surname_id;
-    place = int(std::ranges::find(keys, chosen) - keys.begin());
+        listed.members.push_back(entry.member);
+    const auto keys = listed.families();
+    place = int(std::ranges::find(keys, m_model->entry(row).member.surname_id) - keys.begin());
     return keys;
 }
 

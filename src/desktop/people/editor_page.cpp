@@ -168,14 +168,17 @@ bool EditorPage::open_family(int surname_id, std::vector<int> among, const QStri
     return true;
 }
 
-bool EditorPage::new_family()
+bool EditorPage::new_family(const QString& surname)
 {
     const bool started = finish_typing() && m_bench.editor.start_new();
-    if (started)
-        arrive();
-    else
+    if (!started) {
         show_family();
-    return started;
+        return false;
+    }
+    if (!surname.isEmpty())
+        m_bench.editor.change(u"surname"_s, [&](people::FamilyFile& file) { file.family.surname = surname; });
+    arrive();
+    return true;
 }
 
 bool EditorPage::open_draft(int surname_id)

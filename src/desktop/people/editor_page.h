@@ -25,7 +25,8 @@ public:
     /// False, after saying why, when the family before stays or this one cannot be opened. `among` are the families to
     /// turn the pages in, `among_name` what they are called.
     [[nodiscard]] bool open_family(int surname_id, std::vector<int> among, const QString& among_name);
-    [[nodiscard]] bool new_family();
+    /// With the surname, where one is known already.
+    [[nodiscard]] bool new_family(const QString& surname = {});
     [[nodiscard]] bool open_draft(int surname_id);
 
     [[nodiscard]] QString help() const override { return QStringLiteral("editor"); }

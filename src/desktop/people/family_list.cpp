@@ -89,7 +89,7 @@ void FamilyListWidget::set_up_view()
     m_view->setSortingEnabled(true);
     m_view->installEventFilter(this);
     connect(m_view, &QTableView::doubleClicked, this, &FamilyListWidget::open_chosen);
-    connect(m_view->horizontalHeader(), &QHeaderView::sortIndicatorChanged, this, [this] { select(0); });
+    connect(m_model, &FamilyListModel::layoutChanged, this, [this] { m_view->scrollTo(m_view->currentIndex()); });
 }
 
 void FamilyListWidget::choose(people::FamilyList list)
@@ -126,6 +126,7 @@ void FamilyListWidget::narrow_to_group(int family_group_id)
 void FamilyListWidget::replace_filter(QWidget* beside)
 {
     m_filter->hide();
+    m_when_empty = u"Choose another list above."_s;
     m_top->addWidget(beside);
     m_top->addStretch(1);
 }
@@ -197,9 +198,11 @@ void FamilyListWidget::show_outcome()
     else if (none && m_model->total() > 0)
         m_empty->say(u"No family answers to \u201c%1\u201d"_s.arg(m_filter->text()),
                      u"Shorten the words, or choose another list beside them."_s);
+    else if (none && m_family_group != 0)
+        m_empty->say(u"No family of this family group is in this list"_s,
+                     u"Choose another family group or another list above."_s);
     else if (none)
-        m_empty->say(u"There are no families in this list"_s,
-                     u"Choose another list above, or one of the totals at the left."_s);
+        m_empty->say(u"There are no families in this list"_s, m_when_empty);
     m_stack->setCurrentIndex(none ? 1 : 0);
     Q_EMIT shown_changed();
 }

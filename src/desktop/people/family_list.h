@@ -68,6 +68,7 @@ private:
     Desk& m_desk;
     FamilyListModel* m_model;
     int m_family_group = 0;
+    QString m_when_empty = QStringLiteral("Choose another list above, or one of the totals at the left.");
     QHBoxLayout* m_top;
     QComboBox* m_selector;
     QLineEdit* m_filter;

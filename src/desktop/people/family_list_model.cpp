@@ -95,28 +95,22 @@ std::vector<QString> FamilyListModel::order_keys(int column) const
 
 void FamilyListModel::put_in_order()
 {
-    m_order.resize(m_entries.size());
-    std::iota(m_order.begin(), m_order.end(), 0);
-    if (m_sort_column == surname && m_sort_order == Qt::AscendingOrder)
-        return; // As they were read.
-    const std::vector<QString> keys = order_keys(m_sort_column);
-    const auto key = [&keys](int entry) -> const QString& {
-        return keys[std::size_t(entry)];
-    };
-    if (m_sort_order == Qt::AscendingOrder)
-        std::ranges::stable_sort(m_order, std::ranges::less(), key);
-    else
-        std::ranges::stable_sort(m_order, std::ranges::greater(), key);
+    if (m_sort_column == surname && m_sort_order == Qt::AscendingOrder) { // As they were read.
+        m_order.resize(m_entries.size());
+        std::iota(m_order.begin(), m_order.end(), 0);
+    } else {
+        m_order = places_by(order_keys(m_sort_column), m_sort_order);
+    }
 }
 
 void FamilyListModel::sort(int column, Qt::SortOrder order)
 {
-    beginResetModel();
-    m_sort_column = column >= 0 && column < column_count ? column : surname;
-    m_sort_order = order;
-    put_in_order();
-    filter(m_order);
-    endResetModel();
+    reorder(m_shown, [&] {
+        m_sort_column = column >= 0 && column < column_count ? column : surname;
+        m_sort_order = order;
+        put_in_order();
+        filter(m_order);
+    });
 }
 
 const AddressBookEntry& FamilyListModel::entry(int row) const

@@ -1,8 +1,7 @@
 #pragma once
 
+#include "desktop/people/ordered_rows.h"
 #include "people/address_book.h"
-
-#include <QAbstractTableModel>
 
 #include <span>
 
@@ -10,7 +9,7 @@ namespace kindrel::desktop {
 
 /// A family list, narrowed by typed words and ordered by a column. Everything it needs for that is worked out once
 /// per list, so that a keystroke only compares texts that stand ready.
-class FamilyListModel : public QAbstractTableModel
+class FamilyListModel : public OrderedRowsModel
 {
     Q_OBJECT
 
@@ -18,7 +17,7 @@ public:
     enum Column { surname, first_name, suburb, phone, status };
     static constexpr int column_count = 5;
 
-    using QAbstractTableModel::QAbstractTableModel;
+    using OrderedRowsModel::OrderedRowsModel;
 
     void set_entries(std::vector<people::AddressBookEntry> entries);
     /// Keeps the families in which every word begins some word of surname, first name or suburb; accents and case do

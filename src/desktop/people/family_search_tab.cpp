@@ -54,7 +54,7 @@ FamilySearchTab::FamilySearchTab(Desk& desk)
 QWidget* FamilySearchTab::make_question()
 {
     m_text->setObjectName(u"search_text"_s);
-    m_text->setPlaceholderText(u"Any part of a name, phone, e-mail or address"_s);
+    m_text->setPlaceholderText(u"Any part of a name, phone, e-mail, street, state or country"_s);
     m_text->setClearButtonEnabled(true);
     m_text->installEventFilter(this);
     m_names_only->setObjectName(u"names_only"_s);
@@ -136,7 +136,7 @@ void FamilySearchTab::search()
     const auto fields = m_names_only->isChecked() ? SearchFields::names : SearchFields::all;
     const auto match = m_search.next(m_text->text(), fields, m_families->model().surname_ids());
     m_button->setText(people::search_caption(m_search.under_way()));
-    m_found->setText(match ? u"Found in %1"_s.arg(match->field) : QString());
+    m_found->setText(match ? people::found_words(*match) : QString());
     if (match) {
         m_families->choose_family(match->surname_id);
         return;

@@ -129,6 +129,8 @@ bool FilterChoiceList::line_key(const QKeyEvent& key)
         Q_EMIT step_wanted();
         return true;
     }
+    if (m_line->text().isEmpty() && use_key(key))
+        return true;
     if (key.key() != Qt::Key_Down && key.key() != Qt::Key_PageDown)
         return false;
     // The first item stands chosen already: Down goes to it, not past it.
@@ -136,7 +138,7 @@ bool FilterChoiceList::line_key(const QKeyEvent& key)
     return true;
 }
 
-bool FilterChoiceList::list_key(const QKeyEvent& key)
+bool FilterChoiceList::use_key(const QKeyEvent& key)
 {
     if (key.modifiers() & ~(Qt::ShiftModifier | Qt::KeypadModifier))
         return false;
@@ -147,8 +149,15 @@ bool FilterChoiceList::list_key(const QKeyEvent& key)
     else if (key.key() == Qt::Key_Minus)
         Q_EMIT minus_wanted();
     else
-        return back_to_line(key);
+        return false;
     return true;
+}
+
+bool FilterChoiceList::list_key(const QKeyEvent& key)
+{
+    if (key.modifiers() & ~(Qt::ShiftModifier | Qt::KeypadModifier))
+        return false;
+    return use_key(key) || back_to_line(key);
 }
 
 bool FilterChoiceList::back_to_line(const QKeyEvent& key)

@@ -15,7 +15,7 @@ namespace kindrel::desktop {
 class EmptyPanel;
 
 /// Items to use, narrowed as one types. Down leads from the line into the list, letters lead back. Space or Enter asks
-/// for the next use of the chosen item, + and - for one in particular.
+/// for the next use of the chosen item, + and - for one in particular: in the list, and in the line while it is empty.
 class FilterChoiceList : public QWidget
 {
     Q_OBJECT
@@ -49,6 +49,7 @@ private:
     void typed(const QString& text);
     void select(int row);
     [[nodiscard]] bool line_key(const QKeyEvent& key);
+    [[nodiscard]] bool use_key(const QKeyEvent& key);
     [[nodiscard]] bool list_key(const QKeyEvent& key);
     [[nodiscard]] bool back_to_line(const QKeyEvent& key);
 

@@ -7,6 +7,7 @@
 #include <QCompleter>
 #include <QLabel>
 #include <QLineEdit>
+#include <QPushButton>
 #include <QVBoxLayout>
 
 namespace kindrel::desktop {
@@ -43,16 +44,11 @@ FilterItemDetails::FilterItemDetails(const people::FilterKindRow& kind, QWidget*
     fields->setContentsMargins(0, 0, 0, 0);
     fields->setSpacing(space::field / 2);
     if (kind.has_states())
-        m_ministry = add_choice(*fields, u"ministry_state"_s, u"&State in the ministry"_s, ministry_words());
+        m_ministry = add_choice(*fields, u"ministry_state"_s, u"S&tate in the ministry"_s, ministry_words());
     if (kind.has_marks())
         m_marks = add_choice(*fields, u"marks"_s, u"&Mark"_s, mark_words());
-    if (kind.has_value()) {
-        m_value = add_choice(*fields, u"value"_s, u"&Value"_s, {});
-        m_value->setEditable(true);
-        m_value->setInsertPolicy(QComboBox::NoInsert);
-        m_value->completer()->setCaseSensitivity(Qt::CaseSensitive);
-        connect(m_value->lineEdit(), &QLineEdit::textEdited, this, &FilterItemDetails::chosen);
-    }
+    if (kind.has_value())
+        add_value(*fields);
     auto* column = new QVBoxLayout(this);
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(space::field);
@@ -76,6 +72,26 @@ QComboBox* FilterItemDetails::add_choice(QVBoxLayout& column, const QString& nam
     column.addWidget(label);
     column.addWidget(box);
     return box;
+}
+
+void FilterItemDetails::add_value(QVBoxLayout& column)
+{
+    m_value = add_choice(column, u"value"_s, u"&Value"_s, {});
+    m_value->setEditable(true);
+    m_value->setInsertPolicy(QComboBox::NoInsert);
+    m_value->completer()->setCaseSensitivity(Qt::CaseSensitive);
+    connect(m_value->lineEdit(), &QLineEdit::textEdited, this, &FilterItemDetails::chosen);
+    auto* another = new QPushButton(u"Or another value"_s);
+    another->setObjectName(u"another_value"_s);
+    another->setToolTip(u"People with either value are meant"_s);
+    connect(another, &QPushButton::clicked, this, &FilterItemDetails::another_wanted);
+    column.addWidget(another, 0, Qt::AlignLeft);
+}
+
+void FilterItemDetails::ask_for_value()
+{
+    m_value->clearEditText();
+    m_value->setFocus(Qt::OtherFocusReason);
 }
 
 void FilterItemDetails::show_nothing()
@@ -121,15 +137,19 @@ void FilterItemDetails::read_into(FilterItem& item) const
         item.value = value();
 }
 
-QString detail_words(const FilterItem& item)
+QString detail_words(const std::vector<FilterItem>& criteria)
 {
-    QStringList words{QString()};
+    const FilterItem& item = criteria.front();
+    QStringList words{QString()}, values;
     if (item.ministry != MinistryChoice::any)
         words += ministry_words()[int(item.ministry)].toLower();
     if (item.marks != Marks::any)
         words += mark_words()[int(item.marks)].toLower();
-    if (item.value)
-        words += item.value->isEmpty() ? u"without a value"_s : u"= "_s + *item.value;
+    for (const FilterItem& each : criteria)
+        if (each.value)
+            values += each.value->isEmpty() ? u"without a value"_s : u"= "_s + *each.value;
+    if (!values.isEmpty())
+        words += values.join(u" or "_s);
     return words.join(u", "_s);
 }
 

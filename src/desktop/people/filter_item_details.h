@@ -24,14 +24,19 @@ public:
     void show_nothing();
     /// Writes what is chosen into the item.
     void read_into(people::FilterItem& item) const;
+    /// The cursor goes to an empty value.
+    void ask_for_value();
 
 Q_SIGNALS:
     /// Something was chosen by the person at the keyboard.
     void chosen();
+    /// One more value of the same flexi field is to be asked for.
+    void another_wanted();
 
 private:
     [[nodiscard]] QComboBox* add_choice(QVBoxLayout& column, const QString& name, const QString& caption,
                                         const QStringList& words);
+    void add_value(QVBoxLayout& column);
     [[nodiscard]] std::optional<QString> value() const;
 
     QLabel* m_title;
@@ -41,7 +46,8 @@ private:
     QComboBox* m_value = nullptr;
 };
 
-/// The words of an item's further wishes, each after a comma: ", potential", ", marked", ", = Piano".
-[[nodiscard]] QString detail_words(const people::FilterItem& item);
+/// The words of an item's further wishes, each after a comma: ", potential", ", marked", ", = Piano or = Violin". The
+/// criteria are those of one item and differ in the value alone.
+[[nodiscard]] QString detail_words(const std::vector<people::FilterItem>& criteria);
 
 } // namespace kindrel::desktop

@@ -47,12 +47,13 @@ FilterItemsPart::FilterItemsPart(Desk& desk, people::Filter& filter, const peopl
     connect(m_list, &FilterChoiceList::plus_wanted, this, [this] { turn(Use::include); });
     connect(m_list, &FilterChoiceList::minus_wanted, this, [this] { turn(Use::exclude); });
     connect(m_details, &FilterItemDetails::chosen, this, &FilterItemsPart::take_details);
+    connect(m_details, &FilterItemDetails::another_wanted, this, &FilterItemsPart::ask_for_another_value);
     auto* side = new QVBoxLayout;
     side->setContentsMargins(0, 0, 0, 0);
     side->setSpacing(space::group);
     side->addWidget(m_details);
-    side->addWidget(make_hint(u"Space includes the chosen item, then excludes it, then leaves it out of the filter; "
-                              "+ includes and \u2212 excludes at once."_s));
+    side->addWidget(make_hint(u"Enter includes the chosen item, then excludes it, then leaves it out of the filter. "
+                              "While nothing is typed, Space does so too, + includes and \u2212 excludes at once."_s));
     side->addStretch(1);
     auto* row = new QHBoxLayout(this);
     row->setContentsMargins(0, 0, 0, 0);
@@ -66,49 +67,51 @@ int FilterItemsPart::uses() const
     return int(std::ranges::count(filter().items, m_kind.kind, &FilterItem::kind));
 }
 
-FilterItem* FilterItemsPart::criterion(const FilterItem& item) const
+std::vector<FilterItem*> FilterItemsPart::criteria(const FilterItem& item) const
 {
-    const auto found = std::ranges::find_if(filter().items, [&](const FilterItem& used) { return same(used, item); });
-    return found == filter().items.end() ? nullptr : &*found;
+    std::vector<FilterItem*> all;
+    for (FilterItem& used : filter().items)
+        if (same(used, item))
+            all.push_back(&used);
+    return all;
 }
 
 ChoiceUse FilterItemsPart::use_of(const FilterItem& item) const
 {
-    const FilterItem* used = criterion(item);
-    if (!used)
+    std::vector<FilterItem> used;
+    std::ranges::copy_if(filter().items, std::back_inserter(used), [&](const auto& each) { return same(each, item); });
+    if (used.empty())
         return {};
-    if (used->exclude)
-        return {u"exclude"_s + detail_words(*used), State::error, u"list-remove"_s};
-    return {u"include"_s + detail_words(*used), State::contact, u"list-add"_s};
+    if (used.front().exclude)
+        return {u"exclude"_s + detail_words(used), State::error, u"list-remove"_s};
+    return {u"include"_s + detail_words(used), State::contact, u"list-add"_s};
 }
 
 void FilterItemsPart::step()
 {
-    const FilterItem* item = m_list->chosen();
-    if (!item)
-        return;
-    const FilterItem* used = criterion(*item);
-    set_use(*item, !used ? Use::include : used->exclude ? Use::none : Use::exclude);
+    if (const FilterItem* item = m_list->chosen()) {
+        const auto used = criteria(*item);
+        set_use(*item, used.empty() ? Use::include : used.front()->exclude ? Use::none : Use::exclude);
+    }
 }
 
 void FilterItemsPart::turn(Use wanted)
 {
-    const FilterItem* item = m_list->chosen();
-    if (!item)
-        return;
-    const FilterItem* used = criterion(*item);
-    const bool is_so = used && used->exclude == (wanted == Use::exclude);
-    set_use(*item, is_so ? Use::none : wanted);
+    if (const FilterItem* item = m_list->chosen()) {
+        const auto used = criteria(*item);
+        const bool is_so = !used.empty() && used.front()->exclude == (wanted == Use::exclude);
+        set_use(*item, is_so ? Use::none : wanted);
+    }
 }
 
 void FilterItemsPart::set_use(const FilterItem& item, Use use)
 {
-    FilterItem* used = criterion(item);
-    if (use == Use::none)
+    const auto used = criteria(item);
+    for (FilterItem* each : used)
+        each->exclude = use == Use::exclude;
+    if (use == Use::none) {
         std::erase_if(filter().items, [&](const FilterItem& other) { return same(other, item); });
-    else if (used)
-        used->exclude = use == Use::exclude;
-    else {
+    } else if (used.empty()) {
         FilterItem added = item;
         added.exclude = use == Use::exclude;
         m_details->read_into(added);
@@ -122,22 +125,43 @@ void FilterItemsPart::take_details()
     const FilterItem* item = m_list->chosen();
     if (!item)
         return;
-    if (FilterItem* used = criterion(*item)) {
-        m_details->read_into(*used);
-        done();
-    } else {
-        set_use(*item, Use::include);
+    const auto used = criteria(*item);
+    if (used.empty())
+        return set_use(*item, Use::include);
+    FilterItem read = *used.back();
+    m_details->read_into(read);
+    for (FilterItem* each : used)
+        each->marks = read.marks;
+    if (!m_another && (read.value || used.size() == 1)) {
+        *used.back() = read;
+    } else if (m_another && read.value) {
+        filter().items.push_back(read);
+        m_another = false;
+    } else if (!m_another) { // Of several values the last was emptied.
+        filter().items.erase(filter().items.begin() + (used.back() - filter().items.data()));
+        m_another = true;
+    }
+    done();
+}
+
+void FilterItemsPart::ask_for_another_value()
+{
+    if (const FilterItem* item = m_list->chosen()) {
+        const auto used = criteria(*item);
+        m_another = !used.empty() && used.back()->value;
+        m_details->ask_for_value();
     }
 }
 
 void FilterItemsPart::show_details()
 {
+    m_another = false;
     const FilterItem* item = m_list->chosen();
     if (!item)
         return m_details->show_nothing();
-    const FilterItem* used = criterion(*item);
+    const auto used = criteria(*item);
     const auto values = m_kind.has_value() ? people::flexi_values(*desk().office.session, item->item) : QStringList();
-    m_details->show_item(used ? *used : *item, values);
+    m_details->show_item(used.empty() ? *item : *used.back(), values);
 }
 
 void FilterItemsPart::done()
@@ -182,8 +206,9 @@ FilterFusionsPart::FilterFusionsPart(Desk& desk, people::Filter& filter)
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(space::field);
     column->addWidget(m_list, 1);
-    column->addWidget(make_hint(u"Space takes a fusion into the filter and out again. Taking it in turns the switches "
-                                "of the people as the fusion has them."_s));
+    column->addWidget(
+        make_hint(u"Enter takes a fusion into the filter and out again, and so does Space while nothing is "
+                  "typed. Taking it in turns the switches of the people as the fusion has them."_s));
 }
 
 bool FilterFusionsPart::applied(int fusion_id) const
@@ -196,8 +221,7 @@ void FilterFusionsPart::turn(bool on)
     const FilterItem* chosen = m_list->chosen();
     if (!chosen)
         return;
-    const std::array keys{chosen->item};
-    const auto fusions = people::read_fusions(*desk().office.session, keys);
+    const auto fusions = people::read_fusions(*desk().office.session, std::array{chosen->item});
     std::erase(filter().fusions, chosen->item);
     if (on && !fusions.empty())
         people::apply(filter(), fusions.front());

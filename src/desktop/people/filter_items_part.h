@@ -24,19 +24,21 @@ public:
 private:
     enum class Use { none, include, exclude };
 
-    /// The criterion of the item; null while it is not used.
-    [[nodiscard]] people::FilterItem* criterion(const people::FilterItem& item) const;
+    /// The criteria of the item, of which a flexi field may have one for each value; none while it is not used.
+    [[nodiscard]] std::vector<people::FilterItem*> criteria(const people::FilterItem& item) const;
     [[nodiscard]] ChoiceUse use_of(const people::FilterItem& item) const;
     void step();
     void turn(Use wanted);
     void set_use(const people::FilterItem& item, Use use);
     void show_details();
     void take_details();
+    void ask_for_another_value();
     void done();
 
     const people::FilterKindRow& m_kind;
     FilterChoiceList* m_list;
     FilterItemDetails* m_details;
+    bool m_another = false; ///< The value beside is one more, and not in the filter yet.
 };
 
 /// The fusions, each applied or not. A fusion that is applied sets the switches of the people as it has them.

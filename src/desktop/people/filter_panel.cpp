@@ -14,7 +14,6 @@
 #include <QListWidget>
 #include <QLocale>
 #include <QScrollArea>
-#include <QShortcut>
 #include <QStackedWidget>
 #include <QTimer>
 
@@ -27,7 +26,6 @@ using namespace Qt::StringLiterals;
 namespace {
 
 using namespace std::chrono_literals;
-
 constexpr int kinds_width = 184;
 constexpr int sentence_lines = 4;
 /// A pause in typing, after which people are counted.
@@ -61,12 +59,7 @@ FilterPanel::FilterPanel(Desk& desk, QWidget* parent)
     m_pause->setSingleShot(true);
     m_pause->setInterval(typing_pause);
     connect(m_pause, &QTimer::timeout, this, &FilterPanel::count_now);
-    connect(m_saved, &SavedFilterBar::recalled, this, [this](const people::Filter& filter) {
-        m_filter = filter;
-        show_part(m_kinds->currentRow());
-        m_pause->start();
-        Q_EMIT changed();
-    });
+    connect(m_saved, &SavedFilterBar::recalled, this, &FilterPanel::adopt);
     connect(m_saved, &SavedFilterBar::clear_wanted, this, [this] { set_filter(first_filter()); });
     add_parts();
     auto* grid = new QGridLayout(this);
@@ -91,11 +84,7 @@ QListWidget* FilterPanel::make_kinds()
     keep_width(*kinds, kinds_width);
     connect(kinds, &QListWidget::currentRowChanged, this, &FilterPanel::show_part);
     // Enter in the list leads to what it shows.
-    for (const auto key : {Qt::Key_Return, Qt::Key_Enter}) {
-        auto* enter = new QShortcut(key, kinds);
-        enter->setContext(Qt::WidgetShortcut);
-        connect(enter, &QShortcut::activated, this, [this] { part(m_kinds->currentRow()).focus_first(); });
-    }
+    connect(kinds, &QListWidget::itemActivated, this, [this] { part(m_kinds->currentRow()).focus_first(); });
     return kinds;
 }
 
@@ -175,11 +164,20 @@ void FilterPanel::take_change()
     Q_EMIT changed();
 }
 
-void FilterPanel::set_filter(people::Filter filter)
+void FilterPanel::set_filter(const people::Filter& filter)
 {
-    m_filter = std::move(filter);
+    adopt(filter);
+    m_saved->show_changed();
+}
+
+void FilterPanel::adopt(const people::Filter& filter)
+{
+    for (int row = 0; row < m_parts->count(); ++row)
+        part(row).forget_typed();
+    m_filter = filter;
     show_part(m_kinds->currentRow());
-    take_change();
+    m_pause->start();
+    Q_EMIT changed();
 }
 
 void FilterPanel::reload()
@@ -195,10 +193,20 @@ void FilterPanel::focus_kinds()
     m_kinds->setFocus(Qt::OtherFocusReason);
 }
 
-void FilterPanel::ask_for_families()
+bool FilterPanel::finish()
 {
+    for (int row = 0; row < m_parts->count(); ++row) {
+        if (QWidget* lacking = part(row).finish()) {
+            m_kinds->setCurrentRow(row);
+            lacking->setFocus(Qt::OtherFocusReason);
+            return false;
+        }
+    }
+    if (people::complete(m_desk.office.dialogue, m_filter))
+        return true;
     m_kinds->setCurrentRow(0);
     part(0).focus_first();
+    return false;
 }
 
 void FilterPanel::count_now()

@@ -21,12 +21,12 @@ public:
     explicit FilterPanel(Desk& desk, QWidget* parent = nullptr);
 
     [[nodiscard]] const people::Filter& filter() const { return m_filter; }
-    void set_filter(people::Filter filter);
+    void set_filter(const people::Filter& filter);
     /// Reads lists and saved filters again; the filter stays.
     void reload();
     void focus_kinds();
-    /// The cursor goes to the choice of a file status.
-    void ask_for_families();
+    /// Takes what was typed into the filter. False, after saying why, when something is lacking: the cursor is there.
+    [[nodiscard]] bool finish();
     /// Counts at once, without waiting for a pause in typing.
     void count_now();
 
@@ -43,6 +43,7 @@ private:
     [[nodiscard]] QWidget* make_outcome();
     [[nodiscard]] FilterPart& part(int row) const;
     void show_part(int row);
+    void adopt(const people::Filter& filter);
     void show_uses();
     void take_change();
     void colour_faults();

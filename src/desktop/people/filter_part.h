@@ -28,6 +28,10 @@ public:
     /// Reads again what is chosen from, and shows the filter.
     virtual void reload() { show_filter(); }
     virtual void focus_first() = 0;
+    /// Takes what was typed into the filter. The field that lacks something, after saying so; null when none does.
+    [[nodiscard]] virtual QWidget* finish() { return nullptr; }
+    /// Drops what was typed and is not in the filter.
+    virtual void forget_typed() {}
 
 Q_SIGNALS:
     /// The filter was changed here.

@@ -28,7 +28,7 @@ enum GridColumn { caption_column, from_column, word_column, to_column, further_c
 
 FilterRanges::FilterRanges(Desk& desk, people::Filter& filter)
     : FilterPart(desk, filter, u"Surnames, Years, Ages"_s),
-      m_own_surname(new QCheckBox(u"The person's &own surname"_s)), m_on(new DateField(desk.office))
+      m_own_surname(new QCheckBox(u"The person's o&wn surname"_s)), m_on(new DateField(desk.office))
 {
     auto* grid = new QGridLayout(this);
     grid->setContentsMargins(0, 0, 0, 0);
@@ -154,8 +154,8 @@ void FilterRanges::focus_first()
 
 FilterFamilyType::FilterFamilyType(Desk& desk, people::Filter& filter)
     : FilterPart(desk, filter, u"Family Type, Address"_s), m_type(new QComboBox),
-      m_suburb_known(new QCheckBox(u"Only families whose residential &suburb is known"_s)),
-      m_own_postcode(new QCheckBox(u"Only families with a p&ostcode that differs from their suburb's"_s))
+      m_suburb_known(new QCheckBox(u"Only families whose residential su&burb is known"_s)),
+      m_own_postcode(new QCheckBox(u"Only families with a pos&tcode that differs from their suburb's"_s))
 {
     m_type->setObjectName(u"family_type"_s);
     m_type->setAccessibleName(u"Family type"_s);

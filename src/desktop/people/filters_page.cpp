@@ -117,9 +117,10 @@ void FiltersPage::find()
 
 void FiltersPage::show_people()
 {
+    const bool complete = m_panel->finish();
     m_panel->count_now();
-    if (!people::complete(m_desk.office.dialogue, m_panel->filter()))
-        return m_panel->ask_for_families();
+    if (!complete)
+        return;
     const auto list = people::find_people(*m_desk.office.session, m_panel->filter(), filter_day(m_desk.office));
     if (list.members.empty())
         return; // The panel says so, and which criterion it is.

@@ -1,10 +1,11 @@
 #include "desktop/people/found_people_model.h"
 
+#include "core/progress_run.h"
 #include "desktop/people/filter_choice_model.h"
 #include "desktop/people/status_words.h"
 #include "people/disclosed.h"
 #include "people/family_store.h"
-#include "people/names.h"
+#include "people/listed_people.h"
 
 #include <QApplication>
 #include <QHash>
@@ -32,12 +33,12 @@ QString text_of(const FoundPerson& person, int column)
                                                 : person.suburb;
 }
 
-void add_family(QHash<int, FoundPerson>& people, const people::DisclosedFamily& family)
+void add_family(QHash<int, FoundPerson>& people, const people::DisclosedFamily& family, bool preferred)
 {
     const QString suburb = family.residential() ? family.residential()->suburb : QString();
     for (const auto& person : family.people())
         people.insert(person.person_id, {.surname_id = family.family().Surname_ID,
-                                         .name = family.name(person) + people::markers(person, people::Markers::full),
+                                         .name = people::listed_name(person, family.family().surname, preferred),
                                          .family = family.family().surname,
                                          .suburb = suburb,
                                          .state = state_of(person)});
@@ -50,16 +51,17 @@ std::optional<std::vector<FoundPerson>> read_people(Desk& desk, const people::Wo
     const auto disclosure = people::Disclosure::of(desk.office);
     const std::vector<int> families = list.families();
     QHash<int, FoundPerson> known;
-    desk.progress.begin(u"Reading the people found"_s, int(families.size() / families_per_step) + 1,
-                        u"Are you sure that you wish to cancel this report?"_s);
+    const core::ProgressRun run(desk.progress, u"Reading the people found"_s,
+                                int(families.size() / families_per_step) + 1,
+                                u"Are you sure that you wish to cancel this report?"_s);
     bool cancelled = false;
     for (std::size_t first = 0; first < families.size() && !cancelled; first += families_per_step) {
         const auto some = std::span(families).subspan(first, std::min(families_per_step, families.size() - first));
-        for (auto& file : people::load_families(*desk.office.session, some, people::Part::address))
-            add_family(known, people::disclose(std::move(file), disclosure));
+        for (auto& file :
+             people::load_families(*desk.office.session, some, people::Part::address | people::Part::details))
+            add_family(known, people::disclose(std::move(file), disclosure), disclosure.use_preferred_names);
         cancelled = !desk.progress.step();
     }
-    desk.progress.end();
     if (cancelled)
         return std::nullopt;
     std::vector<FoundPerson> found;

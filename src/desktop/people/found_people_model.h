@@ -12,7 +12,7 @@ namespace kindrel::desktop {
 struct FoundPerson
 {
     int surname_id = 0;
-    QString name = {}; ///< With markers.
+    QString name = {}; ///< As of people::listed_name().
     QString family = {};
     QString suburb = {};
     State state = State::plain;

@@ -28,7 +28,7 @@ struct NeedRow
 
 constexpr std::array need_rows{
     NeedRow{&Needs::address, "needs_address", "an &address", std::nullopt},
-    NeedRow{&Needs::phone, "needs_phone", "a phone n&umber", std::nullopt},
+    NeedRow{&Needs::phone, "needs_phone", "a phone numbe&r", std::nullopt},
     NeedRow{&Needs::email, "needs_email", "an e-&mail address", std::nullopt},
     NeedRow{&Needs::birth_date, "needs_birth_date", "a &birth date", core::Area::birth_dates},
 };
@@ -57,14 +57,15 @@ RangePanel::RangePanel(TaggingSheet& sheet) : StepPanel(sheet, u"Range"_s)
     m_first_letter = make_line(u"first_letter"_s, *rows, u"Surna&mes from"_s);
     m_last_letter = make_line(u"last_letter"_s, *rows, u"up &to"_s);
     m_first = make_line(u"first_place"_s, *rows, u"Pl&aces from"_s);
-    m_last = make_line(u"last_place"_s, *rows, u"&up to"_s);
+    m_last = make_line(u"last_place"_s, *rows, u"up to p&lace"_s);
     for (QLineEdit* place : {m_first, m_last})
         place->setValidator(new QIntValidator(1, most_places, place));
     for (QLineEdit* line : {m_first_letter, m_last_letter, m_first, m_last})
         connect(line, &QLineEdit::textChanged, this, &RangePanel::take);
     add_step_words(*column,
-                   u"Letters or beginnings of surnames, both included. Places are counted among the people whose "
-                   "surnames fit, in the order of the list. What is left empty is open."_s);
+                   u"Letters or beginnings of surnames, both included: the family's, or in the order Individual the "
+                   "person's own. Places are counted among the people whose surnames fit, in the order of the list. "
+                   "What is left empty is open."_s);
     column->addStretch(1);
 }
 

@@ -183,8 +183,7 @@ void MainMenu::find()
 
 void MainMenu::print()
 {
-    if (core::permitted(m_desk.office, core::Area::report_outputs))
-        print_list(m_desk, people::family_list_name(m_families->list()), m_families->model());
+    print_list(m_desk, people::family_list_name(m_families->list()), m_families->model());
 }
 
 void MainMenu::open(int row)

@@ -78,6 +78,12 @@ OrderedListEditor* SetupPage::make_list(const people::SetupList& list)
     return editor;
 }
 
+void SetupPage::reread()
+{
+    m_editor->drop(); // The changes go also when the lists cannot be read again.
+    m_editor = std::make_unique<people::SetupEditor>(desk().office);
+}
+
 void SetupPage::add_group_controls(OrderedListEditor& list)
 {
     m_groups = &list;

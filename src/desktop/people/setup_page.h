@@ -24,7 +24,7 @@ public:
 protected:
     [[nodiscard]] bool list_altered() const override { return m_editor->altered(); }
     [[nodiscard]] bool store() override { return m_editor->save(); }
-    void reread() override { m_editor = std::make_unique<people::SetupEditor>(desk().office); }
+    void reread() override;
 
 private:
     SetupPage(Desk& desk, core::AreaEntry entry);

@@ -140,10 +140,10 @@ void SortPanel::focus_first()
     m_orders->setFocus(Qt::OtherFocusReason);
 }
 
-/// Birth dates show in the order they make, and in who answers to a search.
 bool SortPanel::may_sort() const
 {
-    return sheet().plan.sort.by != SortBy::birth_date || core::permitted(m_desk.office, core::Area::birth_dates);
+    const auto right = people::right_for(sheet().plan.sort.by);
+    return !right || core::permitted(m_desk.office, *right);
 }
 
 bool SortPanel::finish()

@@ -19,6 +19,8 @@
 #include <QTableView>
 #include <QVBoxLayout>
 
+#include <algorithm>
+
 namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
@@ -33,6 +35,17 @@ constexpr std::array column_shares{19, 33, 16, 17, 15};
 bool is_enter(int key)
 {
     return key == Qt::Key_Return || key == Qt::Key_Enter;
+}
+
+/// What was typed as it stands in a file: small letters alone begin with a capital. Empty where a number was typed.
+QString surname_of(const QString& typed)
+{
+    QString name = typed.simplified();
+    if (std::ranges::any_of(name, [](QChar letter) { return letter.isDigit(); }))
+        return {};
+    if (!name.isEmpty() && name == name.toLower())
+        name[0] = name[0].toUpper();
+    return name;
 }
 
 } // namespace
@@ -162,7 +175,7 @@ void SpeedFindWindow::open_chosen()
 void SpeedFindWindow::add_family()
 {
     hide();
-    m_desk.navigation.new_family();
+    Q_EMIT family_wanted(surname_of(m_words->text()));
 }
 
 bool SpeedFindWindow::key_in_words(int key)

@@ -29,6 +29,10 @@ public:
     void ask();
     void reject() override;
 
+Q_SIGNALS:
+    /// A new family is to be made with what was typed; empty where that was no name.
+    void family_wanted(const QString& surname);
+
 protected:
     bool eventFilter(QObject* target, QEvent* event) override;
     void changeEvent(QEvent* event) override;

@@ -25,6 +25,7 @@ namespace {
 constexpr int panel_width = 348;
 /// A pause in typing, after which the list is made again.
 constexpr int typing_pause = 150;
+constexpr std::size_t most_undos = 50;
 
 } // namespace
 
@@ -49,7 +50,13 @@ TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
         set_status(m_list->count_words());
     });
     connect(m_list, &WorkingListView::told, this, [this](const QString& words) { note().say(words); });
-    connect(m_list, &WorkingListView::changed_by_hand, this, &TaggingPage::offer_undo);
+    connect(m_list, &WorkingListView::changed_by_hand, this,
+            [this](const QString& words, const std::function<void()>& undo) {
+                offer_undo({words, [undo] {
+                                undo();
+                                return QString();
+                            }});
+            });
     add_panels();
     m_views->addWidget(m_filter);
     m_views->addWidget(make_bench());
@@ -146,12 +153,7 @@ void TaggingPage::print()
 
 bool TaggingPage::finish_step()
 {
-    if (m_bar->open_step() != Step::filter)
-        return panel(m_bar->open_step()).finish();
-    if (people::complete(m_desk.office.dialogue, m_filter->filter()))
-        return true;
-    m_filter->ask_for_families();
-    return false;
+    return m_bar->open_step() == Step::filter ? m_filter->finish() : panel(m_bar->open_step()).finish();
 }
 
 void TaggingPage::go_to(Step step)
@@ -188,37 +190,55 @@ void TaggingPage::make_list()
 
 void TaggingPage::tagged(const people::BulkChange& change)
 {
+    if (change.count.changed == 0)
+        return;
     const bool given = change.act == people::TagAct::give;
     const QString words = given ? u"\u201c%1\u201d was given to %2."_s : u"\u201c%1\u201d was taken from %2."_s;
-    offer_undo(words.arg(change.item.text, people_words(change.count.changed)), [this, change] { untag(change); });
+    offer_undo({words.arg(change.item.text, people_words(change.count.changed)), [this, change] {
+                    return untag(change);
+                }});
 }
 
-void TaggingPage::untag(const people::BulkChange& change)
+std::optional<QString> TaggingPage::untag(const people::BulkChange& change)
 {
-    int stay = 0;
+    std::optional<int> stay;
     try {
         stay = people::undo_tagging(m_desk.office, change);
     } catch (const core::DatabaseError& error) {
         m_desk.office.dialogue.show({u"The change could not be taken back."_s, error.text()});
-        return tagged(change);
     }
+    if (!stay)
+        return std::nullopt;
     m_process->set_list(m_list->list());
-    note().say(stay == 0 ? u"The change was taken back."_s
-                         : u"The change was taken back; %1 changed since stay as they are."_s.arg(people_words(stay)));
+    return stay == 0 ? u"The change was taken back."_s
+                     : u"The change was taken back; %1 changed since stay as they are."_s.arg(people_words(*stay));
 }
 
-void TaggingPage::offer_undo(const QString& words, const std::function<void()>& undo)
+void TaggingPage::offer_undo(Undo undo)
 {
-    m_undo = undo;
-    note().offer(words, u"Undo"_s, [this] { take_back(); });
+    m_undos.push_back(std::move(undo));
+    if (m_undos.size() > most_undos)
+        m_undos.erase(m_undos.begin());
+    show_undo();
+}
+
+void TaggingPage::show_undo(const QString& told)
+{
+    if (m_undos.empty())
+        return note().say(told);
+    const QString& words = m_undos.back().words;
+    note().offer(told.isEmpty() ? words : u"%1 Before that: %2"_s.arg(told, words), u"&Undo"_s,
+                 [this] { take_back(); });
 }
 
 void TaggingPage::take_back()
 {
-    if (!m_undo)
+    if (m_undos.empty())
         return;
-    note().clear();
-    std::exchange(m_undo, {})();
+    const auto told = m_undos.back().act();
+    if (told)
+        m_undos.pop_back();
+    show_undo(told.value_or(QString()));
 }
 
 } // namespace kindrel::desktop

@@ -47,15 +47,22 @@ private:
     void sheet_changed();
     void make_list();
     void tagged(const people::BulkChange& change);
-    void untag(const people::BulkChange& change);
-    /// In the note bar and by Ctrl+Z, until something else is done.
-    void offer_undo(const QString& words, const std::function<void()>& undo);
+    [[nodiscard]] std::optional<QString> untag(const people::BulkChange& change);
+    /// Something that was done, and what takes it back: that tells how it went, or nullopt where it could not.
+    struct Undo
+    {
+        QString words;
+        std::function<std::optional<QString>()> act;
+    };
+    /// In the note bar and by Ctrl+Z, one after the other, the last first.
+    void offer_undo(Undo undo);
+    void show_undo(const QString& told = {});
     void take_back();
 
     Desk& m_desk;
     core::AreaEntry m_entry;
     TaggingSheet m_sheet;
-    std::function<void()> m_undo;
+    std::vector<Undo> m_undos; ///< The latest last.
     StepBar* m_bar;
     FilterPanel* m_filter;
     WorkingListView* m_list;

@@ -64,8 +64,8 @@ void WorkingListView::focus_line()
 bool WorkingListView::can_make() const
 {
     const auto& plan = m_sheet.plan;
-    const bool birth_dates = plan.sort.by != people::SortBy::birth_date || m_desk.office.may(core::Area::birth_dates);
-    return plan.filter.families && birth_dates && !people::sort_refusal(plan.sort);
+    const auto right = people::right_for(plan.sort.by);
+    return plan.filter.families && (!right || m_desk.office.may(*right)) && !people::sort_refusal(plan.sort);
 }
 
 void WorkingListView::make()
@@ -96,8 +96,8 @@ void WorkingListView::add(const people::ListedPerson& person)
 {
     const auto& there = m_made.list.members;
     if (std::ranges::find(there, person.member.person_id, &people::Member::person_id) != there.end())
-        return Q_EMIT told(u"%1 %2 is on the list already."_s.arg(person.name, person.surname));
-    change_by_hand(u"%1 %2 was added to the list."_s.arg(person.name, person.surname),
+        return Q_EMIT told(u"\u201c%1, %2\u201d is on the list already."_s.arg(person.surname, person.name));
+    change_by_hand(u"\u201c%1, %2\u201d was added to the list."_s.arg(person.surname, person.name),
                    [&] { people::add_by_hand(m_sheet.plan, person.member); });
 }
 

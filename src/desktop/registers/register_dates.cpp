@@ -1,9 +1,9 @@
 #include "desktop/registers/register_dates.h"
 
+#include "desktop/registers/new_day.h"
 #include "desktop/shell/date_field.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
-#include "desktop/shell/typed_date.h"
 
 #include <QComboBox>
 #include <QLabel>
@@ -27,6 +27,7 @@ RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, std::f
     m_project->setObjectName(u"project"_s);
     m_project->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     m_new->setObjectName(u"new_date"_s);
+    m_new->require_year(registers::year_missing);
     m_dates->setObjectName(u"dates"_s);
     lay_out();
     connect(m_project, &QComboBox::activated, this, settled(&RegisterDates::choose_project));
@@ -219,16 +220,9 @@ void RegisterDates::change_date()
     if ((!open || open->key != chosen()) && !m_register.open(chosen()))
         return done(false);
     done(false); // The question is about what one sees.
-    const auto typed = m_desk.office.dialogue.ask_text(
-        {.text = u"New date in place of %1"_s.arg(m_register.open_date()->date.shown(m_desk.office.day_order())),
-         .icon = core::Icon::question});
-    if (!typed)
+    const auto date = ask_new_day(m_desk.office, m_register);
+    if (!date)
         return done(true);
-    const auto date = typed_date(m_desk.office, *typed);
-    if (!date) {
-        m_desk.office.dialogue.show(core::bad_date_message(m_desk.office.day_order()));
-        return focus_dates();
-    }
     const auto note = m_register.date_note(*date);
     const bool changed_date = m_register.change_date(*date);
     Q_EMIT remarked(changed_date ? note : QString());

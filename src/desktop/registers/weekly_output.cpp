@@ -2,19 +2,22 @@
 
 #include "desktop/output/preview_window.h"
 #include "desktop/registers/category_ticks.h"
+#include "desktop/registers/chart_choice.h"
 #include "desktop/registers/weekly_period_fields.h"
+#include "desktop/registers/weekly_report_list.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/side_panel.h"
-#include "desktop/shell/value_form.h"
+#include "desktop/shell/table_text.h"
 #include "registers/projects.h"
+#include "registers/weekly_tables.h"
 
 #include <QComboBox>
 #include <QHBoxLayout>
 #include <QLabel>
-#include <QListWidget>
 #include <QPushButton>
 #include <QScrollArea>
+#include <QStandardItemModel>
 
 #include <algorithm>
 
@@ -22,16 +25,13 @@ namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
 using registers::FigureKind;
-using registers::ReportCharts;
+using registers::ReportField;
 
 namespace {
 
 constexpr int choices_width = 308;
 constexpr int caption_width = WeeklyPeriodFields::caption_width;
-constexpr int description_lines = 5;
 constexpr auto kind = registers::Kind::weekly;
-const QString report_key = u"weekly/report"_s;
-const QString chart_key = u"weekly/chart"_s;
 const QString paper_key = u"reports/paper"_s; ///< As for all reports.
 
 QString left_out_key(int project)
@@ -61,9 +61,10 @@ QLayout* with_caption(const QString& caption, QWidget* control)
 
 } // namespace
 
-WeeklyOutput::WeeklyOutput(Desk& desk, QWidget* parent)
-    : QWidget(parent), m_desk(desk), m_project(new QComboBox), m_reports(new QListWidget), m_description(make_value()),
-      m_period(new WeeklyPeriodFields(desk)), m_chart(new QComboBox),
+WeeklyOutput::WeeklyOutput(Desk& desk, std::function<bool(int)> settle, QWidget* parent)
+    : QWidget(parent), m_desk(desk), m_settle(std::move(settle)), m_project(new QComboBox),
+      m_reports(new WeeklyReportList(desk.remembered)), m_period(new WeeklyPeriodFields(desk)),
+      m_chart(new ChartChoice(desk.remembered)),
       m_attendance(new CategoryTicks({u"Atten&dance categories"_s, u"A&ll"_s, u"&None"_s}, u"A_att"_s)),
       m_finance(new CategoryTicks({u"Financial cate&gories"_s, u"&All"_s, u"N&one"_s}, u"A_fin"_s))
 {
@@ -72,14 +73,12 @@ WeeklyOutput::WeeklyOutput(Desk& desk, QWidget* parent)
     row->setSpacing(space::group);
     row->addWidget(make_choices());
     row->addWidget(make_categories(), 1);
-    fill_reports();
     connect(m_project, &QComboBox::activated, this, [this] { choose_project(project()); });
-    connect(m_reports, &QListWidget::currentRowChanged, this, [this] {
-        show_report();
-        if (const auto* chosen = report())
-            m_desk.remembered.keep(report_key, QString::fromLatin1(chosen->name));
+    connect(m_reports, &WeeklyReportList::shown, this, [this] {
+        m_period->fit(m_reports->report().period);
+        m_chart->fit(m_reports->report().charts);
     });
-    connect(m_reports, &QListWidget::itemActivated, this, &WeeklyOutput::run);
+    connect(m_reports, &WeeklyReportList::activated, this, &WeeklyOutput::run);
     connect(m_attendance, &CategoryTicks::changed, this, &WeeklyOutput::keep_ticks);
     connect(m_finance, &CategoryTicks::changed, this, &WeeklyOutput::keep_ticks);
 }
@@ -88,13 +87,7 @@ QWidget* WeeklyOutput::make_choices()
 {
     m_project->setObjectName(u"output_project"_s);
     m_project->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
-    m_reports->setObjectName(u"output_type"_s);
-    m_description->setObjectName(u"description"_s);
-    m_description->setAlignment(Qt::AlignTop);
-    m_description->setMinimumHeight(description_lines * m_description->fontMetrics().lineSpacing());
     m_chart->setObjectName(u"chart"_s);
-    auto* reports = new QLabel(u"&Report"_s);
-    reports->setBuddy(m_reports);
     auto* preview = new QPushButton(icon(u"document-print-preview"_s), u"Pre&view"_s);
     preview->setObjectName(u"btn_up_down"_s);
     preview->setToolTip(u"Enter in the list of reports, Ctrl+P"_s);
@@ -103,9 +96,7 @@ QWidget* WeeklyOutput::make_choices()
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(space::field);
     column->addLayout(with_caption(u"&Project"_s, m_project));
-    column->addWidget(reports);
     column->addWidget(m_reports);
-    column->addWidget(m_description);
     column->addWidget(m_period);
     column->addLayout(with_caption(u"&Chart"_s, m_chart));
     column->addWidget(preview, 0, Qt::AlignLeft);
@@ -124,22 +115,6 @@ QWidget* WeeklyOutput::make_categories()
     return both;
 }
 
-void WeeklyOutput::fill_reports()
-{
-    QString before;
-    for (const auto& each : registers::weekly_reports()) {
-        const QString title = QString::fromUtf8(each.title);
-        m_reports->addItem(title == before ? title + u", across the page"_s : title);
-        before = title;
-    }
-    m_reports->setFixedHeight(m_reports->count() * row_height() + 2 * m_reports->frameWidth());
-    m_chart->addItem(u"No chart"_s);
-    for (const auto& style : pages::chart_styles())
-        m_chart->addItem(QString::fromLatin1(style.name));
-    const int kept = m_chart->findText(m_desk.remembered.value(chart_key).toString());
-    m_chart->setCurrentIndex(std::max(kept, 0));
-}
-
 void WeeklyOutput::reload()
 {
     auto& session = *m_desk.office.session;
@@ -153,18 +128,12 @@ void WeeklyOutput::reload()
             m_project->findData(registers::remembered_project(session, of, registers::Page::output)));
     }
     choose_project(project());
-    choose_report();
+    m_reports->choose(int(m_attendance->ticked().size() + m_finance->ticked().size()));
 }
 
 int WeeklyOutput::project() const
 {
     return m_project->currentData().toInt();
-}
-
-const registers::WeeklyReport* WeeklyOutput::report() const
-{
-    const int row = m_reports->currentRow();
-    return row < 0 ? nullptr : &registers::weekly_reports()[std::size_t(row)];
 }
 
 void WeeklyOutput::choose_project(int key)
@@ -182,34 +151,6 @@ void WeeklyOutput::choose_project(int key)
     m_finance->show_categories({money.begin(), money.end()}, left_out);
 }
 
-void WeeklyOutput::choose_report()
-{
-    const auto reports = registers::weekly_reports();
-    const auto* wanted = registers::find_weekly_report(m_desk.remembered.value(report_key).toString());
-    const auto categories = int(m_attendance->ticked().size() + m_finance->ticked().size());
-    const auto fitting =
-        std::ranges::find_if(reports, [&](const auto& each) { return each.most_categories >= categories; });
-    if (!wanted && fitting != reports.end())
-        wanted = &*fitting;
-    {
-        const QSignalBlocker quiet(m_reports);
-        m_reports->setCurrentRow(wanted ? int(wanted - reports.data()) : 0);
-    }
-    show_report();
-}
-
-void WeeklyOutput::show_report()
-{
-    const auto* chosen = report();
-    if (!chosen)
-        return;
-    m_description->setText(QString::fromUtf8(chosen->description) + u'.');
-    m_period->fit(chosen->period);
-    m_chart->setEnabled(chosen->charts != ReportCharts::none);
-    if (chosen->charts == ReportCharts::required && m_chart->currentIndex() == 0)
-        m_chart->setCurrentIndex(1);
-}
-
 void WeeklyOutput::keep_ticks()
 {
     QVariantList left_out;
@@ -218,27 +159,83 @@ void WeeklyOutput::keep_ticks()
     m_desk.remembered.keep(left_out_key(project()), left_out);
 }
 
-void WeeklyOutput::run()
+registers::WeeklyReportRequest WeeklyOutput::request(const registers::PeriodChoice& period) const
 {
-    const auto* chosen = report();
-    const auto period = m_period->choice();
-    if (!period)
-        return;
     auto categories = m_attendance->ticked();
     std::ranges::copy(m_finance->ticked(), std::back_inserter(categories));
-    registers::WeeklyReportRequest request{.project = project(),
-                                           .report = chosen,
-                                           .categories = std::move(categories),
-                                           .period = *period,
-                                           .chart = pages::find_chart_style(m_chart->currentText())};
-    m_period->remember();
-    m_desk.remembered.keep(chart_key, m_chart->currentText());
+    return {.project = project(),
+            .report = &m_reports->report(),
+            .categories = std::move(categories),
+            .period = period,
+            .chart = m_chart->style()};
+}
+
+std::optional<registers::WeeklyPlan> WeeklyOutput::plan()
+{
+    const auto period = m_period->choice();
+    if (!period || !m_settle(project()))
+        return {};
+    registers::ReportCheck check{m_desk.office.dialogue};
+    auto made = registers::plan_weekly_report(m_desk.office, request(*period), check);
+    if (made) {
+        m_period->remember();
+        m_chart->remember();
+    } else if (check.guilty) {
+        focus_choice(*check.guilty);
+    }
+    return made;
+}
+
+void WeeklyOutput::focus_choice(ReportField choice)
+{
+    switch (choice) {
+    case ReportField::project:
+        return m_project->setFocus();
+    case ReportField::report:
+        return m_reports->setFocus();
+    case ReportField::categories:
+        return m_attendance->focus_list();
+    case ReportField::chart:
+        return m_chart->setFocus();
+    case ReportField::from:
+    case ReportField::to:
+        return m_period->focus_end(choice);
+    }
+}
+
+void WeeklyOutput::run()
+{
+    auto made = plan();
+    if (!made)
+        return;
     const auto paper = static_cast<pages::Paper>(m_desk.remembered.value(paper_key, 0).toInt() == 1);
-    const auto title = chosen ? QString::fromUtf8(chosen->title) : u"Weekly Statistics"_s;
+    const auto title = QString::fromUtf8(made->report->title);
     open_preview(m_desk, title,
-                 [&office = m_desk.office, request, paper](core::Progress& progress, pages::PageSpool& spool) {
-                     return registers::run_weekly_report(office, request, paper, progress, spool);
+                 [&office = m_desk.office, plan = std::make_shared<const registers::WeeklyPlan>(std::move(*made)),
+                  paper](core::Progress& progress, pages::PageSpool& spool) {
+                     return registers::write_weekly_report(office, *plan, paper, progress, spool);
                  });
+}
+
+void WeeklyOutput::save_csv()
+{
+    if (!core::permitted(m_desk.office, core::Area::export_text))
+        return;
+    const auto made = plan();
+    if (!made)
+        return;
+    const auto table = registers::weekly_table(*made);
+    QStandardItemModel model(0, int(table.columns.size()));
+    model.setHorizontalHeaderLabels(table.columns);
+    for (const auto& row : table.rows) {
+        if (row.kind == registers::WeeklyTable::RowKind::section)
+            continue; // Money has its sign.
+        QList<QStandardItem*> items;
+        for (const auto& text : row.texts)
+            items += new QStandardItem(text);
+        model.appendRow(items);
+    }
+    save_as_csv(model, QString::fromUtf8(made->report->title), m_desk.office.dialogue);
 }
 
 void WeeklyOutput::focus_reports()

@@ -6,13 +6,13 @@
 #include <QWidget>
 
 class QComboBox;
-class QLabel;
-class QListWidget;
 
 namespace kindrel::desktop {
 
 class CategoryTicks;
+class ChartChoice;
 class WeeklyPeriodFields;
+class WeeklyReportList;
 
 /// Chooses a report of a weekly project, its categories, period and chart, and opens it in a preview. Every choice is
 /// remembered.
@@ -21,32 +21,34 @@ class WeeklyOutput : public QWidget
     Q_OBJECT
 
 public:
-    explicit WeeklyOutput(Desk& desk, QWidget* parent = nullptr);
+    /// `settle` settles what is not saved of a project before it is reported on; false when nothing is to be reported.
+    WeeklyOutput(Desk& desk, std::function<bool(int project)> settle, QWidget* parent = nullptr);
 
     /// Reads the projects and their categories again.
     void reload();
     void focus_reports();
     void run();
+    /// The table of the report that is chosen.
+    void save_csv();
 
 private:
     [[nodiscard]] QWidget* make_choices();
     [[nodiscard]] QWidget* make_categories();
-    void fill_reports();
     void choose_project(int key);
-    /// The report chosen last; at first the first one that holds all categories.
-    void choose_report();
-    void show_report();
     void keep_ticks();
+    /// What the report is to be written from, its choices remembered. Nullopt when it was refused; the cursor then
+    /// stands in the choice that is in the way.
+    [[nodiscard]] std::optional<registers::WeeklyPlan> plan();
+    [[nodiscard]] registers::WeeklyReportRequest request(const registers::PeriodChoice& period) const;
+    void focus_choice(registers::ReportField choice);
     [[nodiscard]] int project() const;
-    /// Null when there is none.
-    [[nodiscard]] const registers::WeeklyReport* report() const;
 
     Desk& m_desk;
+    std::function<bool(int)> m_settle;
     QComboBox* m_project;
-    QListWidget* m_reports;
-    QLabel* m_description;
+    WeeklyReportList* m_reports;
     WeeklyPeriodFields* m_period;
-    QComboBox* m_chart;
+    ChartChoice* m_chart;
     CategoryTicks *m_attendance, *m_finance;
 };
 

@@ -54,7 +54,7 @@ WeeklyPage* WeeklyPage::open(Desk& desk)
 WeeklyPage::WeeklyPage(Desk& desk, core::AreaEntry entry)
     : Page(u"Weekly Statistics"_s), m_desk(desk), m_entry(std::move(entry)), m_weekly(desk.office),
       m_tabs(new QTabWidget), m_content(new QStackedWidget), m_figures(new WeeklyEntry(desk, m_weekly)),
-      m_output(new WeeklyOutput(desk))
+      m_output(new WeeklyOutput(desk, [this](int project) { return settle_for_report(project); }))
 {
     setObjectName(u"weekly"_s);
     m_tabs->setObjectName(u"weekly_tabs"_s);
@@ -105,8 +105,8 @@ void WeeklyPage::add_actions()
                                      u"Print the figures of the open date, or the chosen report (Ctrl+P)"_s);
     connect(print_figures, &QAction::triggered, this, &WeeklyPage::print);
     auto* csv = add_action(u"Save as CSV"_s, u"document-save"_s,
-                           u"Save the figures of the open date as comma-separated text"_s);
-    connect(csv, &QAction::triggered, m_figures, &WeeklyEntry::save_csv);
+                           u"Save the figures of the open date, or the chosen report, as comma-separated text"_s);
+    connect(csv, &QAction::triggered, this, [this] { at_entry() ? m_figures->save_csv() : m_output->save_csv(); });
     const auto key = [this](const QKeySequence& keys, auto run) {
         auto* made = new QShortcut(keys, this);
         made->setContext(Qt::WidgetWithChildrenShortcut);
@@ -211,6 +211,22 @@ bool WeeklyPage::leave()
     m_figures->show_register();
     m_figures->focus_work();
     return left;
+}
+
+bool WeeklyPage::settle_for_report(int project)
+{
+    note().clear();
+    if (!m_weekly.open_date() || !altered() || project != m_weekly.project())
+        return true;
+    const auto date = m_weekly.open_date()->date.shown(m_desk.office.day_order());
+    const auto answer = m_desk.office.dialogue.confirm_or_cancel(
+        {.text = u"The figures of %1 are not saved, do you wish to save them before the report is made?"_s.arg(date),
+         .icon = core::Icon::question});
+    if (!answer || (*answer && !save()))
+        return false;
+    if (!*answer)
+        note().say(u"The figures of %1 are not saved; this report leaves them out."_s.arg(date));
+    return true;
 }
 
 void WeeklyPage::show_state()

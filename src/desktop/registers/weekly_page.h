@@ -45,6 +45,8 @@ private:
     [[nodiscard]] bool at_entry() const;
     /// Runs what saves; false also when that failed, which is told.
     [[nodiscard]] bool stored(const std::function<bool()>& store);
+    /// Offers to save the open date's figures, without which a report on its project would be made. False: no report.
+    [[nodiscard]] bool settle_for_report(int project);
     void show_state();
 
     Desk& m_desk;

@@ -1,5 +1,6 @@
 #include "desktop/registers/weekly_period_fields.h"
 
+#include "desktop/registers/year_field.h"
 #include "desktop/shell/date_field.h"
 #include "desktop/shell/look.h"
 
@@ -41,6 +42,7 @@ bool fits(PeriodKind kind, ReportPeriod report)
     case ReportPeriod::one_year:
         return year;
     case ReportPeriod::years:
+    case ReportPeriod::two_years:
         return kind == PeriodKind::year_span;
     }
     return false;
@@ -49,15 +51,18 @@ bool fits(PeriodKind kind, ReportPeriod report)
 } // namespace
 
 WeeklyPeriodFields::WeeklyPeriodFields(Desk& desk, QWidget* parent)
-    : QWidget(parent), m_desk(desk), m_kind(new QComboBox), m_first(new QLabel), m_second(new QLabel(u"&To"_s))
+    : QWidget(parent), m_desk(desk), m_kind(new QComboBox), m_today(core::Date::from(desk.office.clock.today())),
+      m_year(make_year(u"year"_s)), m_from_year(make_year(u"from_year"_s)),
+      m_to_year(make_year(u"to_year"_s)), m_years{kept_year(u"from_year"_s, m_today.year - years_proposed + 1),
+                                                  kept_year(u"to_year"_s, m_today.year)},
+      m_two_years{kept_year(u"compared_year"_s, m_today.year - 1), kept_year(u"with_year"_s, m_today.year)},
+      m_first(new QLabel), m_second(new QLabel(u"&To"_s))
 {
-    const QDate today = desk.office.clock.today();
     m_kind->setObjectName(u"period_kind"_s);
-    m_from = make_date(u"from"_s, {today.year(), 1, 1}, m_from_date);
-    m_to = make_date(u"to"_s, core::Date::from(today), m_to_date);
-    m_year = make_year(u"year"_s, today.year());
-    m_from_year = make_year(u"from_year"_s, today.year() - years_proposed + 1);
-    m_to_year = make_year(u"to_year"_s, today.year());
+    m_from = make_date(u"from"_s, {m_today.year, 1, 1}, m_from_date);
+    m_to = make_date(u"to"_s, m_today, m_to_date);
+    m_year->setCurrentText(kept_year(u"year"_s, m_today.year));
+    show_span();
     auto* caption = new QLabel(u"P&eriod"_s);
     caption->setBuddy(m_kind);
     auto* grid = new QGridLayout(this);
@@ -88,28 +93,46 @@ DateField* WeeklyPeriodFields::make_date(const QString& name, const core::Date& 
     date = kept.value_or(proposed);
     auto* field = new DateField(m_desk.office);
     field->setObjectName(name);
+    field->require_year(registers::year_missing);
     field->show_date(date);
     connect(field, &DateField::entered, this, [&date](std::optional<core::Date> typed) { date = typed; });
     return field;
 }
 
-QComboBox* WeeklyPeriodFields::make_year(const QString& name, int proposed)
+YearField* WeeklyPeriodFields::make_year(const QString& name)
 {
-    auto* field = new QComboBox;
+    auto* field = new YearField(registers::offered_years());
     field->setObjectName(name);
-    field->setEditable(true);
-    field->setInsertPolicy(QComboBox::NoInsert);
-    field->setCompleter(nullptr);
-    field->addItems(registers::offered_years());
-    field->lineEdit()->setPlaceholderText(u"YYYY"_s);
-    field->setCurrentText(m_desk.remembered.value(period_key + name, proposed).toString());
     keep_width(*field, year_width);
     return field;
 }
 
+QString WeeklyPeriodFields::kept_year(const QString& name, int proposed) const
+{
+    return m_desk.remembered.value(period_key + name, proposed).toString();
+}
+
+WeeklyPeriodFields::Span& WeeklyPeriodFields::span()
+{
+    return m_report == ReportPeriod::two_years ? m_two_years : m_years;
+}
+
+void WeeklyPeriodFields::show_span()
+{
+    m_from_year->setCurrentText(span().from);
+    m_to_year->setCurrentText(span().to);
+}
+
+void WeeklyPeriodFields::take_span()
+{
+    span() = {m_from_year->currentText(), m_to_year->currentText()};
+}
+
 void WeeklyPeriodFields::fit(ReportPeriod report)
 {
+    take_span();
     m_report = report;
+    show_span();
     {
         const QSignalBlocker quiet(m_kind);
         m_kind->clear();
@@ -165,10 +188,24 @@ void WeeklyPeriodFields::keep_kind()
 
 void WeeklyPeriodFields::remember()
 {
+    take_span();
     keep(u"from"_s, m_from_date ? m_from_date->stored() : QString());
-    keep(u"to"_s, m_to_date ? m_to_date->stored() : QString());
-    for (const QComboBox* year : {m_year, m_from_year, m_to_year})
-        keep(year->objectName(), year->currentText());
+    // Up to today is up to whatever day it is the next time.
+    keep(u"to"_s, m_to_date && *m_to_date != m_today ? m_to_date->stored() : QString());
+    keep(u"year"_s, m_year->currentText());
+    keep(u"from_year"_s, m_years.from);
+    keep(u"to_year"_s, m_years.to);
+    keep(u"compared_year"_s, m_two_years.from);
+    keep(u"with_year"_s, m_two_years.to);
+}
+
+void WeeklyPeriodFields::focus_end(registers::ReportField end)
+{
+    auto* label = end == registers::ReportField::to ? m_second : m_first;
+    auto* field = label->buddy();
+    field->setFocus();
+    auto* year = qobject_cast<QComboBox*>(field);
+    (year ? year->lineEdit() : qobject_cast<QLineEdit*>(field))->selectAll();
 }
 
 } // namespace kindrel::desktop

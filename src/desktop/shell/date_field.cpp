@@ -9,12 +9,24 @@ namespace kindrel::desktop {
 
 using namespace Qt::StringLiterals;
 
+namespace {
+
+const QString shortcuts = u"t for today, +7 for a week from today"_s;
+
+} // namespace
+
 DateField::DateField(core::Office& office, QWidget* parent) : QLineEdit(parent), m_office(office)
 {
     const bool month_first = office.day_order() == core::DayOrder::month_first;
     setPlaceholderText(month_first ? u"MM/DD/YYYY"_s : u"DD/MM/YYYY"_s);
-    setToolTip(u"XXXX for a year that is not known, t for today, +7 for a week from today"_s);
+    setToolTip(u"XXXX for a year that is not known, "_s + shortcuts);
     connect(this, &QLineEdit::editingFinished, this, &DateField::finish);
+}
+
+void DateField::require_year(const QString& refusal)
+{
+    m_year_refusal = refusal;
+    setToolTip(shortcuts);
 }
 
 void DateField::show_date(std::optional<core::Date> date)
@@ -32,16 +44,11 @@ bool DateField::finish()
     const QString typed = text().trimmed();
     const auto date = typed_date(m_office, typed);
     if (!typed.isEmpty() && !date) {
-        const QScopedValueRollback telling(m_telling, true);
-        m_office.dialogue.show(core::bad_date_message(m_office.day_order()));
-        // After the click or key that led out of the field.
-        QMetaObject::invokeMethod(
-            this,
-            [this] {
-                setFocus();
-                selectAll();
-            },
-            Qt::QueuedConnection);
+        refuse(core::bad_date_message(m_office.day_order()));
+        return false;
+    }
+    if (date && !date->year_known() && !m_year_refusal.isEmpty()) {
+        refuse({m_year_refusal});
         return false;
     }
     setModified(false);
@@ -50,6 +57,20 @@ bool DateField::finish()
     if (changed)
         Q_EMIT entered(date);
     return true;
+}
+
+void DateField::refuse(const core::Message& why)
+{
+    const QScopedValueRollback telling(m_telling, true);
+    m_office.dialogue.show(why);
+    // After the click or key that led out of the field.
+    QMetaObject::invokeMethod(
+        this,
+        [this] {
+            setFocus();
+            selectAll();
+        },
+        Qt::QueuedConnection);
 }
 
 void DateField::give_up()

@@ -14,6 +14,8 @@ class DateField : public QLineEdit
 public:
     explicit DateField(core::Office& office, QWidget* parent = nullptr);
 
+    /// From now on a date without its year is no date; `refusal` is said to it.
+    void require_year(const QString& refusal);
     /// What is being typed stays.
     void show_date(std::optional<core::Date> date);
     /// Reads what was typed; false, after saying why, when it is no date. It then stays, with the cursor in it.
@@ -29,8 +31,11 @@ protected:
 
 private:
     void give_up();
+    /// Says why what was typed is not taken.
+    void refuse(const core::Message& why);
 
     core::Office& m_office;
+    QString m_year_refusal; ///< Empty: the year need not be known.
     std::optional<core::Date> m_date;
     bool m_telling = false;
 };

@@ -1,6 +1,7 @@
 #include "desktop/shell/progress.h"
 
 #include "core/office.h"
+#include "desktop/shell/session_end.h"
 
 #include <QApplication>
 #include <QProgressDialog>
@@ -26,6 +27,7 @@ void QtProgress::begin(const QString& what, int steps, const QString& cancel_que
 {
     m_question = cancel_question;
     m_done = 0;
+    m_hold = std::make_unique<SessionHold>();
     m_box = std::make_unique<QProgressDialog>(what, QString(), 0, steps, QApplication::activeWindow());
     m_box->setWindowTitle(core::product.toString());
     m_box->setWindowModality(Qt::ApplicationModal);
@@ -66,6 +68,7 @@ bool QtProgress::cancel_confirmed()
 void QtProgress::end()
 {
     m_box.reset();
+    m_hold.reset();
 }
 
 } // namespace kindrel::desktop

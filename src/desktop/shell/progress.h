@@ -10,7 +10,10 @@ class QProgressDialog;
 
 namespace kindrel::desktop {
 
-/// A box with a bar in front of everything, once a run has lasted long enough to be noticed.
+class SessionHold;
+
+/// A box with a bar in front of everything, once a run has lasted long enough to be noticed. The program stays open
+/// until the run has ended.
 class QtProgress : public core::Progress
 {
 public:
@@ -27,6 +30,7 @@ private:
 
     core::Dialogue& m_dialogue;
     std::unique_ptr<QProgressDialog> m_box;
+    std::unique_ptr<SessionHold> m_hold;
     QString m_question;
     int m_done = 0;
     Stopwatch m_now;

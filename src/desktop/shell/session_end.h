@@ -21,4 +21,17 @@ private:
     bool m_told_to_quit = false;
 };
 
+/// While it lives the program does not end, and no window closes but the boxes in front: work is under way that must
+/// not be cut off.
+class SessionHold : public QObject
+{
+    Q_OBJECT
+
+public:
+    SessionHold();
+
+protected:
+    bool eventFilter(QObject* target, QEvent* event) override;
+};
+
 } // namespace kindrel::desktop

@@ -99,14 +99,16 @@ bool SetupTabsPage::finish_typing()
 
 bool SetupTabsPage::save()
 {
-    if (!finish_typing())
-        return false;
+    bool typed = false;
     bool saved = false;
     try {
-        saved = store();
+        typed = finish_typing();
+        saved = typed && store();
     } catch (const core::DatabaseError& error) {
         m_desk.office.dialogue.show({m_words.unable_to_save, error.text()});
     }
+    if (!typed)
+        return false; // Everything stands as it was typed.
     m_saved = saved;
     show_lists();
     if (!saved)

@@ -10,16 +10,17 @@
 namespace kindrel::desktop {
 
 /// The windows beside the main one: family cards and previews. They go when the office goes.
-class Windows
+class Windows : public QObject
 {
+    Q_OBJECT
+
 public:
-    explicit Windows(Remembered& remembered) : m_remembered(remembered) {}
-    Windows(const Windows&) = delete;
-    Windows& operator=(const Windows&) = delete;
-    ~Windows();
+    explicit Windows(Remembered& remembered);
+    ~Windows() override;
 
     /// Shows the window, a step beside its last sister, and owns it until it closes.
     void open(QWidget* window, QSize first_size);
+    void close_all();
     /// The open windows of one kind, in the order of opening.
     template <class W>
     [[nodiscard]] std::vector<W*> all() const
@@ -31,9 +32,18 @@ public:
         return found;
     }
 
+protected:
+    /// A window that closed stays until no box above it is open any more: the box may be its child.
+    bool eventFilter(QObject* target, QEvent* event) override;
+
 private:
+    [[nodiscard]] bool boxes_gone() const;
+    void let_go();
+
     Remembered& m_remembered;
+    int m_own_loop;
     std::vector<QPointer<QWidget>> m_windows;
+    std::vector<QPointer<QWidget>> m_closed; ///< Those of them that are to be deleted.
 };
 
 /// To the front, with the keyboard.

@@ -203,7 +203,7 @@ FieldValues postcode(const FieldSource& source)
 
 FieldValues suburb_address(const FieldSource& source)
 {
-    return single(suburb_line(*source.family, SuburbType::residential));
+    return single(residential_suburb_line(*source.family));
 }
 
 FieldValues postal_lines(const FieldSource& source)
@@ -259,8 +259,8 @@ FieldValues name(const FieldSource& source)
 
 FieldValues full_name(const FieldSource& source)
 {
-    return single(
-        joined(u" ", {source.person->Title, source.family->name(*source.person), source.family->family().surname}));
+    const ListedMember member{*source.family, *source.person};
+    return single(joined(u" ", {source.person->Title, member.name(), member.surname()}));
 }
 
 FieldValues role(const FieldSource& source)

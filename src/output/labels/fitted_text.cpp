@@ -2,6 +2,8 @@
 
 #include "pages/text_layout.h"
 
+#include <QTextBoundaryFinder>
+
 #include <algorithm>
 #include <cmath>
 
@@ -23,15 +25,11 @@ qreal rounded_down(qreal size)
 /// The style, smaller where the longest word is wider than the room.
 pages::TextStyle word_style(const LabelText& text, qreal room, pages::TextMetrics& metrics)
 {
-    qreal widest = 0;
-    for (const auto& word : text.text.split(u' '))
-        widest = std::max(widest, metrics.width(word, text.style));
     auto style = text.style;
+    auto widest = widest_word(text.text, style, metrics);
     while (widest > room && style.size > text.style.size * smallest) {
         style.size = rounded_down(style.size * std::min(room / widest, 0.99));
-        widest = 0;
-        for (const auto& word : text.text.split(u' '))
-            widest = std::max(widest, metrics.width(word, style));
+        widest = widest_word(text.text, style, metrics);
     }
     return style;
 }
@@ -52,6 +50,15 @@ pages::Drawing laid_out(std::span<const LabelText> texts, qreal width, qreal fac
 }
 
 } // namespace
+
+qreal widest_word(const QString& text, const pages::TextStyle& style, pages::TextMetrics& metrics)
+{
+    QTextBoundaryFinder places(QTextBoundaryFinder::Line, text);
+    qreal widest = 0;
+    for (auto from = places.position(); places.toNextBoundary() > from; from = places.position())
+        widest = std::max(widest, metrics.width(text.sliced(from, places.position() - from).trimmed(), style));
+    return widest;
+}
 
 pages::Drawing fitted(std::span<const LabelText> texts, QSizeF room, pages::Align align, pages::TextMetrics& metrics)
 {

@@ -248,12 +248,26 @@ ReportChoice mailing_labels_on(const LabelSheet& sheet)
                      });
 }
 
-ReportChoice name_tags_on(const TagSheet& sheet)
+ReportChoice name_tags_on(const TagSheet& sheet, TagBars bars)
 {
     return report_on(sheet.grid, reports[1],
-                     [sheet](const ReportInput& input, core::Progress& progress, pages::Flow& flow) {
-                         return write_tags(input, sheet, TagBars::none, progress, flow);
+                     [sheet, bars](const ReportInput& input, core::Progress& progress, pages::Flow& flow) {
+                         return write_tags(input, sheet, bars, progress, flow);
                      });
+}
+
+ReportChoice::Write label_drawing(const ReportDefinition& report)
+{
+    const bool of_tags = report.write == write_name_tags;
+    if (!of_tags && report.write != write_mailing_labels)
+        return {};
+    return
+        [of_tags, layout = report.layout](const ReportInput& input, core::Progress& progress, pages::PageSpool& spool) {
+            const auto setup = load_label_setup(input.office);
+            const auto drawn = of_tags ? name_tags_on(setup.tags, static_cast<const NameTagLayout*>(layout)->bars)
+                                       : mailing_labels_on(setup.labels);
+            return drawn.ready(input.office) && drawn.run(input, progress, spool);
+        };
 }
 
 pages::PageSetup mailing_label_page(const ReportInput& input)

@@ -35,7 +35,10 @@ static_assert(std::is_standard_layout_v<NameTagLayout>);
 /// The reports on sheets that need not be those of the office, nor saved, for their pictures: where there is nobody to
 /// print they leave no page and say nothing. They are not part of the report tree.
 [[nodiscard]] ReportChoice mailing_labels_on(const LabelSheet& sheet);
-[[nodiscard]] ReportChoice name_tags_on(const TagSheet& sheet);
+[[nodiscard]] ReportChoice name_tags_on(const TagSheet& sheet, TagBars bars = TagBars::none);
+
+/// How a report on labels draws itself for its picture, on the sheet of the office; empty for any other report.
+[[nodiscard]] ReportChoice::Write label_drawing(const ReportDefinition& report);
 
 [[nodiscard]] std::span<const ReportDefinition> label_reports();
 

@@ -16,7 +16,7 @@ bool addressed_by_post(const LetterFamily& to)
 {
     if (to.address != LetterAddress::mailing)
         return to.address == LetterAddress::postal;
-    return !address_lines(to.family, people::SuburbType::postal).isEmpty();
+    return has_address(to.family, people::SuburbType::postal);
 }
 
 QString name_of(const people::DisclosedFamily& family, const people::Person* person, Called called = Called::by_name)
@@ -60,11 +60,8 @@ QString second_street_line(const LetterFamily& to)
 
 QString suburb(const LetterFamily& to)
 {
-    const bool post = addressed_by_post(to);
-    const auto& address = to.family.address();
-    const auto* const suburb = post ? to.family.postal() : to.family.residential();
-    const auto& state = post ? address.post_state : address.res_state;
-    return suburb ? joined(u" ", {suburb->suburb, state, suburb->shown_postcode()}) : state;
+    const auto type = addressed_by_post(to) ? people::SuburbType::postal : people::SuburbType::residential;
+    return has_address(to.family, type) ? mailing_suburb_line(to.family, type) : QString();
 }
 
 constexpr people::Extent nothing_more{};

@@ -51,10 +51,11 @@ private:
     pages::TextStyle m_look;
 };
 
-/// What an item's row says: its text, then its date or value.
+/// What an item's row says: its text, then its date or value and whether it is tagged.
 QString item_text(const people::DisclosedFamily& family, const people::LinkRow& row)
 {
-    return joined(u": ", {row.text, row.date ? shown(family, row.date) : row.field});
+    const auto text = joined(u": ", {row.text, row.date ? shown(family, row.date) : row.field});
+    return row.tagged ? text + u" (Tagged)"_s : text;
 }
 
 template <class Chosen>

@@ -3,7 +3,11 @@
 #include "output/reports/directory_entries.h"
 #include "people/sort_key.h"
 
+#include <QSet>
+
 namespace kindrel::output {
+
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -89,14 +93,35 @@ Entry entry_of(EntryShape shape)
     return {write_side_by_side, Part::address};
 }
 
+/// Whether no letter comes back once the list has gone on to another: bands would then tell the reader where to look.
+bool runs_by_letter(const ReportInput& input)
+{
+    auto& session = *input.office.session;
+    people::lend(session, input.list);
+    auto rows = session.select(u"SELECT w.[surname_id],s.[sort_key] FROM [work_people] w "
+                               "INNER JOIN [tbl_surname] s ON s.[Surname_ID]=w.[surname_id] "
+                               "GROUP BY w.[surname_id],s.[sort_key] ORDER BY MIN(w.[place]);"_s);
+    const auto key = rows.column(u"sort_key");
+    QSet<QString> seen;
+    QString letter;
+    for (const core::Row& row : rows) {
+        const auto next = pages::filing_letter(row.text(key));
+        if (next != letter && seen.contains(next))
+            return false;
+        seen.insert(letter = next);
+    }
+    return true;
+}
+
 } // namespace
 
 bool write_directory(const ReportInput& input, const void* layout, core::Progress& progress, pages::Flow& flow)
 {
     const auto& directory = *static_cast<const DirectoryLayout*>(layout);
     const auto entry = entry_of(directory.shape);
+    const bool has_bands = directory.bands == LetterBands::on && runs_by_letter(input);
     const auto write = [&](const ListedFamily& listed) {
-        if (directory.bands == LetterBands::on)
+        if (has_bands)
             flow.separator(people::sort_key(listed.family.family().surname));
         entry.write(flow, listed);
     };

@@ -16,7 +16,7 @@ enum class EntryShape {
     details, ///< The family, beside it its people with all their contacts.
     details_stacked
 };
-/// A band with the letter before the first surname of each letter.
+/// A band with the letter before the first surname of each letter, where the list has the surnames in order.
 enum class LetterBands { off, on };
 
 /// One of the church directories.

@@ -161,7 +161,10 @@ DataRows email_rows(const ListedFamily& listed)
         return present;
     };
     DataRows rows;
-    append(rows, {}, addresses({{listed.family.address().family_email, u"Family Email"_s}}));
+    const auto& address = listed.family.address();
+    const auto& owner = address.family_email_description;
+    append(rows, {},
+           addresses({{address.family_email, u"Family Email"_s + (owner.isEmpty() ? owner : u" (%1)"_s.arg(owner))}}));
     for (const auto* person : listed.people())
         append(rows, listed.family.name(*person),
                addresses({{person->Personal_email, u"Email"_s}, {person->business_email, u"Business Email"_s}}));

@@ -66,7 +66,7 @@ public:
             m_together.reset();
             m_together.emplace(m_flow);
         }
-        const auto name = first ? listed.surname() + u", "_s + listed.name() : QString();
+        const auto name = first ? listed.listed_name() : QString();
         m_table->row({pages::Cell(name, m_flow.type().body.bolder()), entry.group, shown(listed.family, entry.date_in),
                       shown(listed.family, entry.date_out)});
     }

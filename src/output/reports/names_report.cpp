@@ -24,7 +24,8 @@ bool write_names(const ReportInput& input, const void*, core::Progress& progress
     const pages::ParagraphStyle look{.indent = hanging_indent, .first_indent = -hanging_indent, .after = line_distance};
     const auto write = [&](const ListedMember& listed) {
         const pages::Keep together(flow);
-        flow.paragraph({{listed.surname(), body.bolder()}, {u", "_s + listed.name(), body}}, look);
+        const auto given = listed.listed_name().sliced(listed.surname().size());
+        flow.paragraph({{listed.surname(), body.bolder()}, {given, body}}, look);
     };
     return for_each_person(input, progress, write, {});
 }

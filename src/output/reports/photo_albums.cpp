@@ -2,6 +2,7 @@
 
 #include "output/decoration.h"
 #include "output/family_lines.h"
+#include "output/labels/fitted_text.h"
 #include "output/report_layout.h"
 #include "pages/table.h"
 #include "pages/text_metrics.h"
@@ -48,6 +49,11 @@ constexpr qreal text_gap = 12;
 constexpr qreal inset = 2;
 constexpr QSizeF portrait_shape(3, 4);
 constexpr int name_lines = 2;
+// Of a column's width that a photograph takes, at most.
+constexpr qreal alone_share = 0.5;
+constexpr qreal beside_share = 0.4;
+constexpr qreal smaller = 0.95;
+constexpr qreal smallest_text = 5.5;
 constexpr qreal endless = 10000;
 
 /// One person's place in the album.
@@ -91,7 +97,8 @@ Measures measures(const ReportInput& input, const AlbumLayout& layout, pages::Fl
     const auto name_height =
         beneath ? name_lines * flow.metrics().line_height(flow.type().body.bolder()) + row_padding : 0;
     const auto column_width = (flow.width() - (layout.columns - 1) * text_gap) / layout.columns;
-    const QSizeF most(column_width / 2, row_height - 2 * row_padding - name_height);
+    const QSizeF most(column_width * (beneath ? alone_share : beside_share),
+                      row_height - 2 * row_padding - name_height);
     return {row_height, name_height, portrait_shape.scaled(most, Qt::KeepAspectRatio)};
 }
 
@@ -181,6 +188,40 @@ void write_text(pages::Writer& place, const Entry& entry, AlbumText text)
     write_address(place, u"Postal address"_s, entry.postal);
 }
 
+/// Whether the line breaks none of the words.
+bool holds_words(pages::Writer& place, const Entry& entry, AlbumText text)
+{
+    const auto holds = [&](const QString& words, const pages::TextStyle& style) {
+        return widest_word(words, style, place.metrics()) <= place.width();
+    };
+    const auto& type = place.type();
+    bool all = holds(entry.name, type.headings[1]);
+    for (const auto& line : text == AlbumText::both_addresses ? entry.residential + entry.postal : entry.residential)
+        all = all && holds(line, type.body);
+    for (const auto& line : entry.contacts) {
+        for (const auto& pair : line)
+            all = all && holds(pair.caption, type.caption) && holds(pair.value, type.body);
+    }
+    return all;
+}
+
+/// The text in letters so small that it fits without breaking a word, as long as they can be read.
+void write_fitted_text(pages::Writer& cell, const Entry& entry, AlbumText text, qreal height,
+                       const std::shared_ptr<pages::TextMetrics>& metrics)
+{
+    const auto& body = cell.type().body;
+    for (auto size = body.size;; size *= smaller) {
+        pages::Box trial(metrics, pages::TypeScale::around(body.sized(size)), cell.width(), height);
+        write_text(trial, entry, text);
+        const bool fits = pages::height_of(trial.blocks()) <= height && holds_words(trial, entry, text);
+        if (!fits && size * smaller >= smallest_text)
+            continue;
+        for (auto& block : trial.take())
+            cell.write(std::move(block));
+        return;
+    }
+}
+
 /// The photograph with the name beneath it.
 pages::Cell named_photograph(const Entry& entry, const Measures& measures)
 {
@@ -246,13 +287,14 @@ private:
             cell.drawing(framed(entry.portrait, m_measures.frame));
         };
         const auto text = [this, &entry](pages::Writer& cell) {
-            write_text(cell, entry, m_layout.text);
+            write_fitted_text(cell, entry, m_layout.text, m_measures.row_height - 2 * row_padding, m_metrics);
         };
         cells.insert(cells.end(), {pages::Cell::of(photograph), pages::Cell(), pages::Cell::of(text), pages::Cell()});
     }
 
     const AlbumLayout& m_layout;
     const Measures& m_measures;
+    std::shared_ptr<pages::TextMetrics> m_metrics = std::make_shared<pages::TextMetrics>();
     pages::Table m_table;
     std::vector<Entry> m_entries; ///< Of the row begun.
 };

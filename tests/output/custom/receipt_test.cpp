@@ -58,10 +58,10 @@ TEST_F(ReceiptTest, EachGiverGetsAPageWithTheirDetailsAndWhatTheyGave)
     EXPECT_EQ(told(pages[0]), told(QStringList{u"Konrad Zuse"_s, u"Konrad Zuse"_s,
                                                u"Building Fund, 01/07/2023 to 30/06/2024"_s, u"2 gifts, $10.00"_s} +
                                    gave));
-    EXPECT_EQ(told(pages[1]), told(QStringList{u"Mrs & Mr Ann & Ben Naismith"_s, u"Mr Ben Naismith"_s, u"PO Box 1"_s,
-                                               u"Unknown Suburb"_s, u"P.I.N. 77"_s,
-                                               u"Building Fund, 01/07/2023 to 30/06/2024"_s, u"2 gifts, $25.50"_s} +
-                                   gave + QStringList{u"2 receipts"_s}));
+    EXPECT_EQ(told(pages[1]),
+              told(QStringList{u"Mrs & Mr Ann & Ben Naismith"_s, u"Mr Ben Naismith"_s, u"PO Box 1"_s, u"P.I.N. 77"_s,
+                               u"Building Fund, 01/07/2023 to 30/06/2024"_s, u"2 gifts, $25.50"_s} +
+                   gave + QStringList{u"2 receipts"_s}));
 }
 
 TEST_F(ReceiptTest, SeveralReceiptsShareAPageWhereTheLayoutSaysSo)

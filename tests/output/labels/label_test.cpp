@@ -188,20 +188,28 @@ TEST_F(LabelTest, ALabelHoldsTheFamilysNamesAndTheAddressThatPostGoesTo)
     struct Case
     {
         const char* what;
-        QString postal;
-        bool res_hidden, post_hidden;
+        QString home, postal;
+        bool suburb, res_hidden, post_hidden;
         std::string expected;
     };
+    const auto home = u"1 Main St"_s, box = u"PO Box 7"_s;
     const std::vector<Case> cases{
-        {"home", {}, false, false, "Ann & Ben Naismith | 1 Main St | suburb 1 3000"},
-        {"postal", u"PO Box 7"_s, false, false, "Ann & Ben Naismith | PO Box 7 | Unknown Suburb"},
-        {"postal hidden", u"PO Box 7"_s, false, true, "Ann & Ben Naismith | 1 Main St | suburb 1 3000"},
-        {"all hidden", u"PO Box 7"_s, true, true, "Ann & Ben Naismith"},
+        {"home", home, {}, true, false, false, "Ann & Ben Naismith | 1 Main St | suburb 1 SA 3000"},
+        {"home without suburb", home, {}, false, false, false, "Ann & Ben Naismith | 1 Main St | SA"},
+        {"states alone", {}, {}, false, false, false, "Ann & Ben Naismith"},
+        {"postal", home, box, true, false, false, "Ann & Ben Naismith | PO Box 7 | VIC | Australia"},
+        {"postal hidden", home, box, true, false, true, "Ann & Ben Naismith | 1 Main St | suburb 1 SA 3000"},
+        {"all hidden", home, box, true, true, true, "Ann & Ben Naismith"},
     };
     choose(u"k60");
     for (const auto& one : cases) {
         list.members.clear();
-        auto file = at_street(u"1 Main St"_s);
+        auto file = at_street(one.home);
+        if (!one.suburb)
+            file.residential.reset();
+        file.address.res_state = u"SA"_s;
+        file.address.post_state = u"VIC"_s;
+        file.address.post_country = u"Australia"_s;
         file.people = family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s, u"Cid"_s}).people;
         file.people[2].Marital = 5;
         file.address.post_street = one.postal;
@@ -256,6 +264,23 @@ TEST_F(LabelTest, TextThatFitsKeepsTheSizeAndFontThatWereChosen)
     const pages::TextStyle name{u"Liberation Serif"_s, 14, true, true}, address{u"Liberation Mono"_s, 8};
     EXPECT_EQ(texts_reading(page, u"Ann Naismith"_s).front().style, name);
     EXPECT_EQ(texts_reading(page, u"1 Long Street"_s).front().style, address);
+}
+
+TEST_F(LabelTest, ADoubleSurnameIsBrokenBehindItsHyphenBeforeItShrinks)
+{
+    auto setup = output::load_label_setup(office);
+    setup.tags.surname.size = 20;
+    setup.tags.shows_church = false;
+    ASSERT_TRUE(output::save_label_setup(office, setup));
+    add({family(u"Featherstonehaugh-Cholmondeley"_s, {u"Ann"_s})});
+    choose(u"k61");
+
+    const auto page = sheets().front();
+
+    EXPECT_EQ(words_in(page, setup.tags.grid.label(0)).toStdString(), "Ann | Featherstonehaugh- | Cholmondeley");
+    const auto parts = texts_reading(page, u"Featherstonehaugh-"_s);
+    ASSERT_EQ(parts.size(), 1u);
+    EXPECT_EQ(parts[0].style.size, 20);
 }
 
 TEST_F(LabelTest, ATagShowsTheNamesAndWhatTheSetupAsksFor)

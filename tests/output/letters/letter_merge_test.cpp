@@ -298,6 +298,9 @@ TEST(LetterFields, TakeTheAddressThatTheRunChose)
     auto without_box = family_with({});
     without_box.address.post_street.clear();
     without_box.postal.reset();
+    auto state_alone = without_box;
+    state_alone.address.post_state = u"NSW"_s;
+    state_alone.address.post_country = u"Australia"_s;
     auto unknown_suburb = family_with({});
     unknown_suburb.residential.reset();
 
@@ -306,6 +309,8 @@ TEST(LetterFields, TakeTheAddressThatTheRunChose)
     EXPECT_EQ(copy_for(family_with({}), all, LetterAddress::mailing), u"Box 5||Hawthorn 9000"_s);
     EXPECT_EQ(copy_for(without_box, all, LetterAddress::postal), u"||"_s);
     EXPECT_EQ(copy_for(without_box, all, LetterAddress::mailing), u"1 High Street|Rear|Kew VIC 3101"_s);
+    EXPECT_EQ(copy_for(state_alone, all, LetterAddress::postal), u"||"_s);
+    EXPECT_EQ(copy_for(state_alone, all, LetterAddress::mailing), u"1 High Street|Rear|Kew VIC 3101"_s);
     EXPECT_EQ(copy_for(unknown_suburb, all, LetterAddress::residential), u"1 High Street|Rear|VIC"_s);
 }
 

@@ -38,9 +38,11 @@ people::FamilyFile naismith()
     ann.ministries[0].type = static_cast<int>(people::MinistryState::active);
     ann.ministries[1].type = static_cast<int>(people::MinistryState::potential);
     ann.dates = {carried(1)};
+    ann.dates[0].tagged = true;
     ann.dates[0].date = Date{Date::unknown_year, 2, 29};
     ann.flexi = {carried(2)};
     ann.flexi[0].field = u"blue"_s;
+    ann.flexi[0].tagged = true;
     ann.personal_pin = u"4711"_s;
     return one;
 }
@@ -71,7 +73,7 @@ TEST_F(AllInformationTest, EverythingOfAFamilyStandsUnderItsCaption)
     const QStringList expected{u"Naismith"_s,
                                file_state(),
                                u"Residential address | 12 Long Street | Unknown Suburb"_s,
-                               u"Postal address | P.O. Box 7 | Unknown Suburb"_s,
+                               u"Postal address | P.O. Box 7"_s,
                                u"Family Ph: 9555 1234"_s,
                                u"Other contacts | Aunt: 555 2 | Neighbour"_s,
                                u"Family groups | family_group 2, family_group 1"_s,
@@ -86,8 +88,8 @@ TEST_F(AllInformationTest, EverythingOfAFamilyStandsUnderItsCaption)
                                u"Groups | group 3"_s,
                                u"Active ministries | ministry 1"_s,
                                u"Potential ministries | ministry 2"_s,
-                               u"Dates | date_description 1: 29/02/XXXX"_s,
-                               u"Flexi fields | flexi 2: blue"_s,
+                               u"Dates | date_description 1: 29/02/XXXX (Tagged)"_s,
+                               u"Flexi fields | flexi 2: blue (Tagged)"_s,
                                u"P.I.N. | 4711"_s,
                                u"Ben | Married, With Child"_s};
     EXPECT_EQ(printed(), expected.join(u" | "_s).toStdString());
@@ -97,7 +99,9 @@ TEST_F(AllInformationTest, WhatIsNotThereLeavesNoCaption)
 {
     add({family(u"Abel"_s, {u"Niels"_s})});
 
-    EXPECT_EQ(printed(), u"Abel | %1 | Niels | Single Adult"_s.arg(file_state()).toStdString());
+    EXPECT_EQ(
+        printed(),
+        u"Abel | %1 | Residential address | Unknown Suburb | Niels | Single Adult"_s.arg(file_state()).toStdString());
 }
 
 TEST_F(AllInformationTest, APinIsPrintedOnlyToWhoMaySeePins)

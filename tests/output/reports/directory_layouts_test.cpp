@@ -27,6 +27,14 @@ people::FamilyFile naismith()
     return one;
 }
 
+/// Somebody whose address is not to be printed.
+people::FamilyFile unlisted(const QString& surname, const QString& name)
+{
+    auto one = family(surname, {name});
+    one.address.res_hidden = true;
+    return one;
+}
+
 class DirectoryLayoutsTest : public ReportTest
 {
 protected:
@@ -99,9 +107,33 @@ TEST_F(DirectoryLayoutsTest, TheLandscapeOnesLieAndTheOthersStand)
 TEST_F(DirectoryLayoutsTest, ALetterOfAnotherAlphabetIsFiledWhereTheListFilesIt)
 {
     choose(u"k12");
-    add({family(u"Dobson"_s, {u"Di"_s}), family(u"Đorđić"_s, {u"Zdeňka"_s}), family(u"Dunn"_s, {u"Al"_s})});
+    add({unlisted(u"Dobson"_s, u"Di"_s), unlisted(u"Đorđić"_s, u"Zdeňka"_s), unlisted(u"Dunn"_s, u"Al"_s)});
 
     EXPECT_EQ(entries(), "D | Dobson | Di | Đorđić | Zdeňka | Dunn | Al");
+}
+
+TEST_F(DirectoryLayoutsTest, AListInAnotherOrderThanThatOfSurnamesHasNoLetters)
+{
+    choose(u"k12");
+    add({unlisted(u"Abel"_s, u"Ann"_s), unlisted(u"Zuse"_s, u"Ann"_s), unlisted(u"Adams"_s, u"Ann"_s)});
+    EXPECT_EQ(entries(), "Abel | Ann | Zuse | Ann | Adams | Ann");
+
+    list.members.pop_back();
+    EXPECT_EQ(entries(), "A | Abel | Ann | Z | Zuse | Ann");
+}
+
+TEST_F(DirectoryLayoutsTest, TheFootTellsWhichDirectoryItIsWhateverTheTitle)
+{
+    add({naismith()});
+    for (const auto& title : {QString(), u"Camp in May"_s}) {
+        options.title = title;
+        for (const auto& key : {u"k10"_s, u"k13"_s}) {
+            choose(key);
+            const auto all = texts();
+            EXPECT_EQ(all[0], title.isEmpty() ? u"Church Directory"_s : title);
+            EXPECT_EQ(all[1], QString::fromUtf8(report.leaf));
+        }
+    }
 }
 
 TEST_F(DirectoryLayoutsTest, OnlyThePeopleOfTheListStandWithTheirDetails)
@@ -119,7 +151,7 @@ TEST_F(DirectoryLayoutsTest, APersonWithoutDetailsLeavesOnlyTheName)
     for (const auto& key : {u"k15"_s, u"k17"_s, u"k23"_s}) {
         list.members.clear();
         choose(key);
-        add({family(u"Abel"_s, {u"Niels"_s})});
+        add({unlisted(u"Abel"_s, u"Niels"_s)});
         EXPECT_EQ(entries(), "Abel | Niels") << key.toStdString();
     }
 }

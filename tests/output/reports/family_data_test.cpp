@@ -56,7 +56,7 @@ const std::vector<Kind> kinds{
     {"k81", u"Family | People | Date | Visitor | Comments"_s,
      people + u" | 03/02/2020 | A visitor | All well. | Come again."_s, u"There are no visits among these families"_s},
     {"k82", u"Family | Name | Address | Kind"_s,
-     u"addressfamilyemail | Family Email | Zoë | ZoëPersonalemail | Email | Zoëbusinessemail | Business Email | "
+     u"addressfamilyemail | Family Email | (Home) | Zoë | ZoëPersonalemail | Email | Zoëbusinessemail | Business Email | "
      "Stanisław | StanisławPersonalemail | Email | Stanisławbusinessemail | Business Email | "
      "Kid | KidPersonalemail | Email | Kidbusinessemail | Business Email"_s,
      u"There are no e-mail addresses among these people"_s},
@@ -95,6 +95,7 @@ TEST_F(FamilyDataTest, EachReportListsItsOneKindOfDataAndLeavesOutWhoHasNone)
 {
     auto full = full_family(false);
     full.people.push_back(person(u"Xi"_s, child));
+    full.address.family_email_description = u"Home"_s;
     add({family(u"Abel"_s, {u"Niels"_s}), full});
     for (const auto& kind : kinds) {
         auto expected = kind.headings + u" | Żółć-O’Brien | "_s + kind.lines;

@@ -102,6 +102,17 @@ TEST_F(GroupHistoryReportTest, OnlyTheListsPeopleAreToldAndByTheNamesTheyMayBear
                              "group 3 | 01/01/2020 | 03/02/2021");
 }
 
+TEST_F(GroupHistoryReportTest, WithoutASurnameTheNameStandsWithoutAComma)
+{
+    add({family(u"Naismith"_s, {u"Ann"_s, u"Ben"_s})});
+    store(*office.session);
+    office.session->execute(u"UPDATE [tbl_surname] SET [surname]='';"_s);
+    list.members.erase(list.members.begin());
+
+    EXPECT_EQ(lines("k110"), "Name | Group | Date In | Date Out | Ben | Old Choir | 09/09/1999 | "
+                             "group 3 | 01/01/2020 | 03/02/2021");
+}
+
 TEST_F(GroupHistoryReportTest, WithoutHistoryThePageSaysSo)
 {
     add({family(u"Abel"_s, {u"Niels"_s})});

@@ -40,7 +40,7 @@ TEST_F(MiscellaneousTest, TheBriefReportHasALineForEachFamily)
     add({family(u"Zuse"_s, {u"Konrad"_s}), naismith()});
 
     EXPECT_EQ(printed(u"Brief Report (Landscape)"),
-              brief_heading + " | Zuse | Konrad | "
+              brief_heading + " | Zuse | Konrad | Unknown Suburb | "
                               "Naismith | Ann & Ben, Cid | 12 Long Street, Rear, suburb 1 3000 | 9555 1234");
 }
 
@@ -61,6 +61,21 @@ TEST_F(MiscellaneousTest, AnAddressThatIsHiddenLeavesTheOtherStanding)
     EXPECT_EQ(printed(u"k120"), brief_heading + " | Naismith | Ann & Ben, Cid | 9555 1234");
     EXPECT_EQ(printed(u"k121"), addresses_heading + " | Naismith | Ann & Ben, Cid | P.O. Box 7 | suburb 2 3000 | "
                                                     "Family Ph: 9555 1234 | Family Email: n@example.org");
+}
+
+TEST_F(MiscellaneousTest, AStateOrACountryAloneIsNoPostalAddress)
+{
+    auto one = naismith();
+    one.address.post_street.clear();
+    one.postal.reset();
+    one.address.post_state = u"VIC"_s;
+    one.address.post_country = u"Australia"_s;
+    add({one});
+    for (const auto& key : {u"k121"_s, u"k122"_s, u"k137"_s}) {
+        const auto all = printed(key);
+        EXPECT_EQ(all.find("VIC"), std::string::npos) << all;
+        EXPECT_EQ(all.find("Australia"), std::string::npos) << all;
+    }
 }
 
 TEST_F(MiscellaneousTest, TheHeadingsStandOnEveryPage)

@@ -29,11 +29,22 @@ TEST_F(NamesReportTest, PeopleStandInTheOrderOfTheListWhateverTheirFamilies)
 
 TEST_F(NamesReportTest, OnlyNamesArePrintedAndPreferredOnesWhereTheChurchPrefersThem)
 {
-    add({full_family(false)});
+    auto one = full_family(false);
+    for (auto& person : one.people)
+        person.other_surname.clear();
+    add({one});
     EXPECT_EQ(names(), "Żółć-O’Brien, Zoë | Żółć-O’Brien, Stanisław | Żółć-O’Brien, Kid");
 
     office.settings.use_preferred_names = true;
     EXPECT_EQ(names(), "Żółć-O’Brien, Zoëpreferred | Żółć-O’Brien, Stanisławpreferred | Żółć-O’Brien, Kidpreferred");
+}
+
+TEST_F(NamesReportTest, WhoHasOneNameAloneStandsWithoutAComma)
+{
+    add({family(u"Naismith"_s, {u"Prince"_s})});
+    office.session->execute(u"UPDATE [tbl_surname] SET [surname]='';"_s);
+
+    EXPECT_EQ(names(), "Prince");
 }
 
 TEST_F(NamesReportTest, ALongNameIsBrokenNotCut)

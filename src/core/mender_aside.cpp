@@ -1,0 +1,255 @@
+#include "core/backup_files.h"
+#include "core/backup_manifest.h"
+#include "core/church_recovery.h"
+#include "core/locks.h"
+#include "core/marker.h"
+#include "core/mender_checks.h"
+#include "core/mender_hold.h"
+#include "core/mender_obstacle.h"
+#include "core/mender_place.h"
+#include "core/open_church.h"
+#include "core/side_files.h"
+#include "core/sqlite_session.h"
+#include "core/verified_copy.h"
+
+#include <QFile>
+#include <QFileInfo>
+#include <QStorageInfo>
+
+#include <algorithm>
+#include <filesystem>
+
+// A damaged church file that makes way, for a backup or for a recovered file.
+namespace kindrel::core {
+
+using namespace Qt::StringLiterals;
+
+namespace checks = mender_checks;
+
+namespace {
+
+const QString journal = u"-journal"_s;
+
+Marker alone_in(const MenderPlace& place)
+{
+    if (place.paths.exists(Folder::church, connection_file.toString()))
+        throw FileError(u"This church lies on a server: there is no file of it that could be set aside."_s);
+    auto busy = Marker::take(place.paths, side_files::busy);
+    if (!busy)
+        throw FileError(checks::locked_by_marker());
+    return std::move(*busy);
+}
+
+/// Locks that cannot be read are part of the damage.
+void demand_nobody_known_inside(MenderPlace& place)
+{
+    QString others;
+    try {
+        if (place.session)
+            others = checks::others_inside(place);
+    } catch (const DatabaseError&) {
+        return;
+    }
+    if (!others.isEmpty())
+        throw FileError(others);
+}
+
+/// A database that could not be looked at may be sound.
+void demand_damaged(MenderPlace& place)
+{
+    const auto found = examine_church(place, {});
+    for (const auto& finding : found) {
+        if (out_of_sight({finding}))
+            throw FileError(in_one_line(finding));
+    }
+    if (std::ranges::none_of(found, [](const Finding& finding) { return finding.cure == Cure::recover; }))
+        throw FileError(u"The church file is not damaged: start Kindrel to restore a backup."_s);
+    demand_nobody_known_inside(place);
+    place.session.reset();
+}
+
+QString place_aside(const MenderPlace& place)
+{
+    const QString time = place.clock.now().toString(u"yyyy-MM-dd HHmmss");
+    return mended_place(place, u"KR10_records set aside %1.kdl"_s.arg(time));
+}
+
+/// It must never come to stand beside another database.
+void move_journal(const QString& from, const QString& to)
+{
+    if (QFileInfo::exists(from + journal))
+        move_privately(from + journal, to + journal);
+}
+
+/// The file gets a second name where the disk knows such, so that the church is never without a database, else another.
+void name_also(const QString& file, const QString& name)
+{
+    std::error_code unknown;
+    std::filesystem::create_hard_link(QFileInfo(file).filesystemFilePath(), QFileInfo(name).filesystemFilePath(),
+                                      unknown);
+    if (unknown)
+        move_file(file, name);
+}
+
+/// `fresh` takes the place of the database, which is set aside. All or nothing.
+QString exchange(const MenderPlace& place, const QString& fresh)
+{
+    const QString file = place.paths.database();
+    HeldFile taken(fresh);
+    HeldFile damaged(file);
+    const QString aside = place_aside(place);
+    move_journal(file, aside);
+    taken.make_movable();
+    damaged.make_movable();
+    try {
+        name_also(file, aside);
+        move_privately(fresh, file);
+    } catch (const FileError&) {
+        if (QFileInfo::exists(aside)) {
+            move_file(aside, file);
+            QFile::remove(aside); // Its second name, which the system leaves alone.
+        }
+        move_journal(aside, file);
+        throw;
+    }
+    return aside;
+}
+
+/// A missing database leaves at most its journal behind.
+QString fill_gap(const MenderPlace& place, const QString& fresh)
+{
+    const QString file = place.paths.database();
+    if (QFileInfo::exists(file + journal))
+        move_privately(file + journal, place_aside(place) + journal);
+    HeldFile taken(fresh);
+    taken.make_movable();
+    move_privately(fresh, file);
+    return {};
+}
+
+/// Another church would be without it.
+void demand_no_own_file(const MenderPlace& place, const QString& recovered)
+{
+    for (int church = 1; church <= booked_out_church; ++church) {
+        const QFileInfo own(church_paths(place.paths, church).database());
+        if (own.exists() && own == QFileInfo(recovered))
+            throw FileError(u"'%1' is the database of church %2."_s.arg(recovered).arg(church));
+    }
+}
+
+/// Codes tell churches apart; one that was never backed up has none.
+void demand_of_this_church(const MenderPlace& place, Session& recovered)
+{
+    const QString file = place.paths.database();
+    const QString own = QFileInfo::exists(file) ? code_of_damaged(file) : QString();
+    const QString code = summary_of(recovered, {}).church_code;
+    if (!own.isEmpty() && !code.isEmpty() && own != code)
+        throw FileError(u"The recovered file is of another church."_s);
+}
+
+void demand_fit(const MenderPlace& place, const QString& recovered)
+{
+    if (!QFileInfo::exists(recovered))
+        throw FileError(u"'%1' is missing."_s.arg(recovered));
+    demand_no_own_file(place, recovered);
+    check_church_file(recovered);
+    MenderPlace fresh{.paths = place.paths,
+                      .church = place.church,
+                      .workstation = place.workstation,
+                      .clock = place.clock,
+                      .session = open_sqlite(recovered)};
+    auto faults = checks::examine_version(fresh);
+    std::ranges::copy_if(checks::examine_schema(fresh), std::back_inserter(faults),
+                         [](const Finding& finding) { return finding.cure != Cure::mend; });
+    if (!faults.empty())
+        throw FileError(u"'%1' does not fit this edition: %2"_s.arg(recovered, faults.front().words));
+    demand_of_this_church(place, *fresh.session);
+}
+
+/// Names are exchanged on one disk only.
+QString on_disk_of_church(const MenderPlace& place, const QString& recovered)
+{
+    const auto disk_of = [](const QString& file) {
+        return QStorageInfo(QFileInfo(file).absolutePath()).device();
+    };
+    const QString file = place.paths.database();
+    if (disk_of(recovered) == disk_of(file))
+        return recovered;
+    const QString copy = file + u".unfinished"_s;
+    remove_file(copy);
+    copy_file(recovered, copy);
+    flush_to_disk(copy);
+    check_church_file(copy);
+    return copy;
+}
+
+/// The recovered file is in its place: what fails now is told beside that.
+Mending mending_of(MenderPlace& place, std::span<const Check> more)
+{
+    Mending mending;
+    try {
+        open_to_mend(place);
+        return mend_church(place, more);
+    } catch (const DatabaseError& error) {
+        mending.refusal = error.text();
+    } catch (const FileError& error) {
+        mending.refusal = error.text();
+    }
+    return mending;
+}
+
+} // namespace
+
+QString checks::others_inside(MenderPlace& place)
+{
+    QStringList lines;
+    for (const auto& lock : Locks(*place.session, place.workstation, place.clock).all()) {
+        if (!lock.stale)
+            lines += held_line(lock, DayOrder::day_first);
+    }
+    return lines.isEmpty()
+               ? QString()
+               : u"Somebody may be working in the church:\n%1\nWhen nobody is, unlock the church first."_s.arg(
+                     lines.join(u'\n'));
+}
+
+QString checks::locked_by_marker()
+{
+    return u"The church is locked by 'lock.dat': another user is either compacting files, backing them up or restoring "
+           "them. When nobody is, unlock the church first."_s;
+}
+
+QString set_database_aside(MenderPlace& place)
+{
+    const auto busy = alone_in(place);
+    const QString file = place.paths.database();
+    if (!QFileInfo::exists(file))
+        throw FileError(u"There is no church file: start Kindrel and restore a backup."_s);
+    demand_damaged(place);
+    HeldFile held(file);
+    const QString aside = place_aside(place);
+    move_journal(file, aside);
+    held.make_movable();
+    move_privately(file, aside);
+    place.closed = checks::missing(place.paths);
+    return aside;
+}
+
+Placement put_in_place(MenderPlace& place, const QString& recovered, std::span<const Check> more)
+{
+    Placement placement;
+    {
+        const auto busy = alone_in(place);
+        const bool there = QFileInfo::exists(place.paths.database());
+        if (there)
+            demand_damaged(place);
+        demand_fit(place, recovered);
+        const QString fresh = on_disk_of_church(place, recovered);
+        placement.aside = there ? exchange(place, fresh) : fill_gap(place, fresh);
+        flush_to_disk(place.paths.database());
+    }
+    placement.mending = mending_of(place, more);
+    return placement;
+}
+
+} // namespace kindrel::core

@@ -1,0 +1,22 @@
+#pragma once
+
+#include "core/dialogue.h"
+#include "desktop/mender/mender_works.h"
+
+namespace kindrel::desktop {
+
+/// What is asked before a piece of work that needs files. Each returns nullopt when the person turned away.
+
+/// A damaged church file, and the new one for what can be read of it.
+struct RecoveryFiles
+{
+    QString damaged, fresh;
+};
+[[nodiscard]] std::optional<RecoveryFiles> ask_for_recovery(core::Dialogue& dialogue, const Account& account,
+                                                            const QString& data_drive);
+
+/// The recovered church file that takes the place of the church's own.
+[[nodiscard]] std::optional<QString> ask_for_placing(core::Dialogue& dialogue, const Account& account,
+                                                     const MenderJob& job);
+
+} // namespace kindrel::desktop
