@@ -32,7 +32,8 @@ protected:
     [[nodiscard]] int this_year() { return desk().office.clock.today().year(); }
     void run()
     {
-        window().activateWindow();
+        window().activateWindow(); // A preview may stand before it.
+        settle();
         act(Qt::Key_P, Qt::ControlModifier);
     }
     [[nodiscard]] std::vector<desktop::PreviewWindow*> previews()
