@@ -2,7 +2,6 @@
 
 #include "core/files.h"
 #include "desktop/output/preview_window.h"
-#include "desktop/output/report_drawing.h"
 #include "desktop/people/family_card.h"
 #include "desktop/people/group_details_dialog.h"
 #include "desktop/people/quick_add_dialogs.h"
@@ -19,6 +18,7 @@
 #include <QTabWidget>
 #include <QTableWidget>
 #include <QTextStream>
+#include <QTimer>
 
 namespace kindrel::apps {
 
@@ -30,6 +30,16 @@ namespace {
 constexpr QSize smallest_screen{1024, 690};
 constexpr QSize narrow_window{800, 560};
 constexpr QSize least_window{720, 480};
+constexpr int longest_pause = 500; ///< Milliseconds.
+
+/// Counts and drawings wait for a pause in typing; a picture does not.
+void end_pauses(QWidget& window)
+{
+    for (auto* timer : window.findChildren<QTimer*>())
+        if (timer->isActive() && timer->isSingleShot() && timer->interval() <= longest_pause)
+            timer->start(0);
+    QApplication::processEvents();
+}
 
 /// Writes under "name-light.png" and "name-dark.png".
 class Camera
@@ -42,8 +52,7 @@ public:
         for (const auto appearance : {Appearance::light, Appearance::dark}) {
             m_look.apply(appearance, 100);
             QApplication::processEvents();
-            for (auto* drawing : window.findChildren<desktop::ReportDrawing*>())
-                drawing->draw_now();
+            end_pauses(window);
             const QString shade = appearance == Appearance::light ? u"light"_s : u"dark"_s;
             m_failed |= !window.grab().save(u"%1%2-%3.png"_s.arg(m_folder, name, shade));
         }
