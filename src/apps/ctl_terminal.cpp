@@ -17,6 +17,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+constexpr std::size_t read_at_once = 4096;
+
 /// Nullopt for what is neither yes nor no.
 std::optional<bool> yes_or_no(const QString& answer)
 {
@@ -26,7 +28,8 @@ std::optional<bool> yes_or_no(const QString& answer)
     return word == "n"_L1 || word == "no"_L1 ? std::optional(false) : std::nullopt;
 }
 
-/// Waits until something was typed. False when Ctrl+C or a request to end came instead, where those are held back.
+/// Waits until something was typed, or can be read. False when Ctrl+C or a request to end came instead, where those are
+/// held back.
 bool somebody_typed()
 {
     sigset_t held, wanted;
@@ -74,7 +77,7 @@ private:
 } // namespace
 
 TerminalDialogue::TerminalDialogue(QString password_file, Questions questions)
-    : m_in(stdin), m_err(stderr), m_attended(isatty(STDIN_FILENO) != 0), m_password_file(std::move(password_file)),
+    : m_err(stderr), m_attended(isatty(STDIN_FILENO) != 0), m_password_file(std::move(password_file)),
       m_questions(questions)
 {
 }
@@ -88,12 +91,39 @@ void TerminalDialogue::show(const core::Message& message)
 
 std::optional<QString> TerminalDialogue::ask(const QString& prompt)
 {
+    if (m_attended)
+        forget_typed();
     m_err << prompt << Qt::flush;
-    const auto answer = m_attended && somebody_typed() ? m_in.readLine() : QString();
-    if (!answer.isNull())
-        return answer;
-    m_err << Qt::endl;
-    return std::nullopt;
+    auto answer = m_attended ? read_line() : std::nullopt;
+    if (!answer)
+        m_err << Qt::endl;
+    return answer;
+}
+
+std::optional<QString> TerminalDialogue::read_line()
+{
+    std::array<char, read_at_once> piece{};
+    while (!m_read.contains('\n')) {
+        if (!somebody_typed())
+            return std::nullopt;
+        const auto count = read(STDIN_FILENO, piece.data(), piece.size());
+        if (count > 0)
+            m_read.append(piece.data(), count);
+        else if (count == 0 || errno != EINTR)
+            break;
+    }
+    const auto end = m_read.indexOf('\n');
+    if (m_read.isEmpty() || (m_attended && end < 0)) // A line that nobody ended with Enter is no answer.
+        return std::nullopt;
+    const QByteArray line = m_read.left(end);
+    m_read.remove(0, line.size() + 1);
+    return QString::fromUtf8(line.endsWith('\r') ? line.chopped(1) : line);
+}
+
+void TerminalDialogue::forget_typed()
+{
+    tcflush(STDIN_FILENO, TCIFLUSH);
+    m_read.clear();
 }
 
 bool TerminalDialogue::confirm(const core::Message& message, core::Answer safe)
@@ -130,12 +160,14 @@ std::optional<QString> TerminalDialogue::password()
         return QString::fromUtf8(content->split('\n').first()).remove(u'\r');
     }
     const Unseen unseen(m_attended);
-    if (m_attended)
+    if (m_attended) {
+        forget_typed();
         m_err << u"Password: "_s << Qt::flush;
-    const auto typed = m_in.readLine();
+    }
+    const auto typed = read_line();
     if (m_attended)
         m_err << Qt::endl;
-    if (!typed.isNull())
+    if (typed)
         return typed;
     show({u"This church asks for a password: name its file with --password-file, or give it on standard input."_s});
     return std::nullopt;

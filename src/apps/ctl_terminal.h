@@ -2,6 +2,7 @@
 
 #include "core/dialogue.h"
 
+#include <QByteArray>
 #include <QTextStream>
 
 namespace kindrel::apps {
@@ -10,7 +11,8 @@ namespace kindrel::apps {
 enum class Questions { asked, answered_yes };
 
 /// Speaks on standard error and listens on standard input. Where nobody sits at it, every question gets the answer
-/// that loses nothing, but for a password: that is read from the given file, else as a line of standard input.
+/// that loses nothing, but for a password: that is read from the given file, else as a line of standard input. In a
+/// terminal only what is typed after a question answers it.
 class TerminalDialogue final : public core::Dialogue
 {
 public:
@@ -28,8 +30,12 @@ private:
     [[nodiscard]] std::optional<QString> password();
     /// Nullopt at the end of the input and where nobody sits at it.
     [[nodiscard]] std::optional<QString> ask(const QString& prompt);
+    /// Nullopt at the end of the input, and when a request to end came first.
+    [[nodiscard]] std::optional<QString> read_line();
+    /// What was typed before a question was shown is no answer to it.
+    void forget_typed();
 
-    QTextStream m_in;
+    QByteArray m_read; ///< Of standard input, and handed out to nobody yet.
     QTextStream m_err;
     bool m_attended;
     QString m_password_file;

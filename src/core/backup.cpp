@@ -53,7 +53,8 @@ QString target_folder(const Office& office, const BackupRequest& request)
 bool compacted(Office& office)
 {
     try {
-        return compact_held_church(office);
+        compact_held_church(office);
+        return true;
     } catch (const DatabaseError&) {
         return false;
     } catch (const FileError&) {
@@ -91,20 +92,27 @@ void keep_settings(Office& office, const BackupRequest& request)
     office.side.backup = record;
 }
 
-/// What follows a finished backup can fail without harm to it.
-void note(Office& office, const BackupRequest& request, const BackupContents& contents, const QString& folder)
+/// What follows a finished backup can fail without harm to it: in words then why, else empty.
+QString note(Office& office, const BackupRequest& request, const BackupContents& contents, const QString& folder)
 {
     try {
         backup_rules::remember(office, contents);
         if (request.folder.isEmpty())
             remove_older(office, folder, QFileInfo(contents.file).fileName());
         keep_settings(office, request);
+        return {};
     } catch (const FileError& error) {
-        office.dialogue.show(information(not_noted, error.text()));
+        return error.text();
     }
 }
 
-BackupReport back_up(Office& office, const BackupRequest& request, Progress& progress)
+struct MadeBackup
+{
+    BackupReport report;
+    QString not_noted; ///< Why; to be told once nobody is kept out any more.
+};
+
+MadeBackup back_up(Office& office, const BackupRequest& request, Progress& progress)
 {
     settle_interrupted_restore(office.paths, *office.session);
     office.side.backup = stored_settings(office);
@@ -123,8 +131,23 @@ BackupReport back_up(Office& office, const BackupRequest& request, Progress& pro
                                      .choice = request.choice,
                                      .church_code = code},
                                     progress);
-    note(office, request, report.contents, folder);
-    return report;
+    return {report, note(office, request, report.contents, folder)};
+}
+
+/// Table by table: one that is missing or damaged counts nothing.
+ChurchSummary readable_state(Session& session, const QStringList& tables)
+{
+    ChurchSummary church = summary_of(session, {});
+    for (const QString& table : tables) {
+        try {
+            const auto counted = summary_of(session, {table});
+            church.rows.insert(counted.rows);
+            if (counted.last_change)
+                church.last_change = counted.last_change;
+        } catch (const DatabaseError&) {
+        }
+    }
+    return church;
 }
 
 } // namespace
@@ -133,28 +156,28 @@ std::optional<BackupReport> make_backup(Office& office, const BackupRequest& req
 {
     if (!enter(office, AreaId::backup))
         return std::nullopt;
-    std::optional<BackupReport> report;
-    const bool done = backup_rules::attempt(office, failed, [&] {
+    std::optional<MadeBackup> made;
+    (void)backup_rules::attempt(office, failed, [&] {
         if (const auto marker = Marker::take(office.paths, side_files::busy))
-            report = back_up(office, request, progress);
+            made = back_up(office, request, progress);
         else
             office.dialogue.show(backup_rules::busy(failed));
     });
-    return done ? report : std::nullopt;
+    if (!made)
+        return std::nullopt;
+    if (!made->not_noted.isEmpty())
+        office.dialogue.show(information(not_noted, made->not_noted));
+    return made->report;
 }
 
 ChurchSummary present_state(const Office& office)
 {
-    ChurchSummary church = summary_of(*office.session, {});
-    for (const QString& table : tables_of(*office.session)) {
-        try {
-            const auto counted = summary_of(*office.session, {table});
-            church.rows.insert(counted.rows);
-            if (counted.last_change)
-                church.last_change = counted.last_change;
-        } catch (const DatabaseError&) {
-            // A table that is missing or damaged counts nothing.
-        }
+    const QStringList tables = tables_of(*office.session);
+    ChurchSummary church;
+    try {
+        church = summary_of(*office.session, tables);
+    } catch (const DatabaseError&) {
+        church = readable_state(*office.session, tables);
     }
     church.church = office.church;
     church.church_name = office.church_name;

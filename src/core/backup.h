@@ -46,6 +46,8 @@ namespace backup_rules {
 
 /// Notes a compared archive, so that it is known again. Throws FileError.
 void remember(const Office& office, const BackupContents& contents);
+/// Takes an archive that is gone off the list. Throws FileError.
+void forget(const Office& office, const QString& file);
 /// The folder of the backups that are made before a restore.
 [[nodiscard]] QString safety_folder(const Office& office);
 /// Runs `work`; tells a failure under `sentence`, and nothing when the person gave up. True when it went through.

@@ -126,4 +126,11 @@ void backup_rules::remember(const Office& office, const BackupContents& contents
     write_list(office, list);
 }
 
+void backup_rules::forget(const Office& office, const QString& file)
+{
+    auto list = read_list(office);
+    if (std::erase_if(list, [&](const Remembered& each) { return each.file == file; }) > 0)
+        write_list(office, list);
+}
+
 } // namespace kindrel::core

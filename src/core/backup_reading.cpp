@@ -13,6 +13,7 @@
 #include <QSet>
 
 #include <algorithm>
+#include <array>
 
 namespace kindrel::core {
 
@@ -20,10 +21,11 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-/// Locks, counters and logs grow and go without a person's doing.
+/// Locks, counters, logs and the program's own notes grow and go without a person's doing.
 bool keeps_itself(const QString& table)
 {
-    return table.startsWith("tbl_id_"_L1) || table.contains("lock"_L1) || table.endsWith("_archive"_L1);
+    return table.startsWith("tbl_id_"_L1) || table.contains("lock"_L1) || table.endsWith("_archive"_L1) ||
+           table == "tbl_setting"_L1;
 }
 
 BackupError damaged(const QString& what)
@@ -179,23 +181,25 @@ BackupContents contents_of(const OpenBackup& backup, const QString& file)
 std::vector<ComparedKind> compared_kinds(const ChurchSummary& then, const ChurchSummary& now)
 {
     std::vector<ComparedKind> kinds;
-    ComparedKind others{u"Other records"_s};
     QSet<QString> counted;
     for (const CountedKind& kind : counted_kinds()) {
         const QString table = QString::fromUtf16(kind.table).toLower();
         counted.insert(table);
         kinds.push_back({QString::fromUtf16(kind.words), then.rows.value(table), now.rows.value(table)});
     }
+    ComparedKind added{u"Other records added since"_s}, removed{u"Other records removed since"_s};
     QMap<QString, qint64> every = now.rows;
     every.insert(then.rows);
     for (const QString& table : every.keys()) {
         const qint64 before = then.rows.value(table), present = now.rows.value(table);
         if (before == present || counted.contains(table) || keeps_itself(table))
             continue;
+        ComparedKind& others = before < present ? added : removed;
         others.then += before;
         others.now += present;
     }
-    kinds.push_back(others);
+    std::ranges::copy_if(std::array{added, removed}, std::back_inserter(kinds),
+                         [](const ComparedKind& kind) { return kind.then != kind.now; });
     return kinds;
 }
 

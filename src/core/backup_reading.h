@@ -58,8 +58,9 @@ struct ComparedKind
     QString words;
     qint64 then = 0, now = 0;
 };
-/// What a person compares a backup and the church by, in a fixed order; at the end the records of all other kinds of
-/// which there are not as many as before. Changes inside records are not to be seen in it.
+/// What a person compares a backup and the church by, in a fixed order; at the end, where there are such, the records
+/// of all other kinds of which there are more than then, and those of which there are fewer: what would be lost must
+/// not hide behind what would come back. Changes inside records are not to be seen in it.
 [[nodiscard]] std::vector<ComparedKind> compared_kinds(const ChurchSummary& then, const ChurchSummary& now);
 
 } // namespace kindrel::core

@@ -4,7 +4,6 @@
 #include "core/copy_church_tables.h"
 #include "core/files.h"
 #include "core/open_church.h"
-#include "core/schema.h"
 #include "core/sqlite_session.h"
 #include "core/startup.h"
 #include "core/verified_copy.h"
@@ -82,13 +81,9 @@ void copy_from_server(const Office& office, const QString& copy, Progress& progr
 {
     constexpr int works_per_row = 2; // Each is written and compared.
     const auto server = connect_to_read(office.paths);
-    const auto target = create_sqlite(copy);
-    create_schema(*target);
     const Transaction reading(*server);
-    Transaction writing(*target);
     ByteMeter meter(progress, works_per_row * count_rows(*server));
-    copy_tables(*server, *target, [&](int rows) { meter.add(rows); });
-    writing.commit();
+    copy_to_new_file(*server, copy, [&](int rows) { meter.add(rows); });
 }
 
 /// A sound copy of the database that bears the church's code.

@@ -50,7 +50,20 @@ void prune(Session& session, const Log& log)
                         .arg(log_rows_kept - 1));
 }
 
-void compact(Office& office)
+} // namespace
+
+bool compact_church(Office& office)
+{
+    if (!enough_space(office))
+        return false;
+    const auto busy = Marker::take(office.paths, side_files::busy);
+    if (!busy)
+        return false;
+    compact_held_church(office);
+    return true;
+}
+
+void compact_held_church(Office& office)
 {
     Session& session = *office.session;
     if (session.engine() == EngineKind::sqlite) // A server tidies up by itself.
@@ -61,27 +74,6 @@ void compact(Office& office)
         prune(session, log);
     transaction.commit();
     office.settings.compact_count = 0;
-}
-
-} // namespace
-
-bool compact_church(Office& office)
-{
-    if (!enough_space(office))
-        return false;
-    const auto busy = Marker::take(office.paths, side_files::busy);
-    if (!busy)
-        return false;
-    compact(office);
-    return true;
-}
-
-bool compact_held_church(Office& office)
-{
-    if (!enough_space(office))
-        return false;
-    compact(office);
-    return true;
 }
 
 } // namespace kindrel::core

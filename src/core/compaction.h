@@ -9,7 +9,7 @@ namespace kindrel::core {
 /// DatabaseError or FileError with the database unharmed.
 bool compact_church(Office& office);
 
-/// The same for a caller who holds the busy marker already.
-bool compact_held_church(Office& office);
+/// The same for a caller who holds the busy marker already and has seen that there is room.
+void compact_held_church(Office& office);
 
 } // namespace kindrel::core

@@ -110,9 +110,10 @@ public:
     {
     }
     /// The target is inside a transaction.
-    CopyReport fill(Session& target)
+    CopyReport fill(Session& target) { return report_on(copy_tables(m_source.session(), target, m_done)); }
+    CopyReport fill(const QString& new_file)
     {
-        return report_on(copy_tables(m_source.session(), target, [this](int rows) { m_meter.add(rows); }));
+        return report_on(copy_to_new_file(m_source.session(), new_file, m_done));
     }
 
 private:
@@ -129,6 +130,9 @@ private:
     Source m_source;
     ProgressRun m_run;
     ByteMeter m_meter;
+    RowsDone m_done = [this](int rows) {
+        m_meter.add(rows);
+    };
 };
 
 std::optional<CopyReport> copy_to_server(Office& office, const CopyRequest& request, Progress& progress)
@@ -153,17 +157,6 @@ void remove_unfinished(const QString& file)
     remove_file(file + u"-journal"_s);
 }
 
-CopyReport write_file_copy(const Office& office, const QString& file, Progress& progress)
-{
-    Copying copying(office.paths, progress);
-    const auto target = create_sqlite(file);
-    create_schema(*target);
-    Transaction writing(*target);
-    const CopyReport report = copying.fill(*target);
-    writing.commit();
-    return report;
-}
-
 std::optional<CopyReport> copy_to_new_or_old_file(Office& office, const CopyRequest& request, Progress& progress)
 {
     const QString& file = request.to.file;
@@ -178,7 +171,7 @@ std::optional<CopyReport> copy_to_new_or_old_file(Office& office, const CopyRequ
     const QString unfinished = file + u".unfinished"_s;
     remove_unfinished(unfinished);
     try {
-        const CopyReport report = write_file_copy(office, unfinished, progress);
+        const CopyReport report = Copying(office.paths, progress).fill(unfinished);
         check_church_file(unfinished);
         if (there) {
             there->replace_content(unfinished);

@@ -1,6 +1,10 @@
 #include "core/copy_church_tables.h"
 
+#include "core/schema.h"
+#include "core/sqlite_session.h"
+
 #include <QCryptographicHash>
+#include <QFile>
 #include <QtEndian>
 
 #include <algorithm>
@@ -176,6 +180,22 @@ ChurchSums copy_tables(Session& from, Session& to, const RowsDone& done)
 void copy_tables(Session& from, Session& to)
 {
     copy_tables(from, to, [](int) {});
+}
+
+ChurchSums copy_to_new_file(Session& from, const QString& file, const RowsDone& done)
+{
+    auto to = create_sqlite(file);
+    try {
+        create_schema(*to);
+        Transaction writing(*to);
+        const auto sums = copy_tables(from, *to, done);
+        writing.commit();
+        return sums;
+    } catch (...) {
+        to.reset();
+        QFile::remove(file);
+        throw;
+    }
 }
 
 void demand_equal(const ChurchSums& expected, const ChurchSums& found)

@@ -35,6 +35,9 @@ using RowsDone = std::function<void(int rows)>;
 ChurchSums copy_tables(Session& from, Session& to, const RowsDone& done);
 /// The same without a report.
 void copy_tables(Session& from, Session& to);
+/// Makes a church file, which must not be there yet, of every row of `from`, which is inside a transaction, and
+/// compares them in the same way. What throws leaves no file behind.
+ChurchSums copy_to_new_file(Session& from, const QString& file, const RowsDone& done);
 
 /// Throws DatabaseError that names a table in which the two differ.
 void demand_equal(const ChurchSums& expected, const ChurchSums& found);

@@ -81,10 +81,8 @@ bool has(const Findings& findings, QStringView kind)
 /// Why the church must not be mended now; empty when it may.
 QString refusal_for(MenderPlace& place, const Findings& findings)
 {
-    const auto obstacle =
-        std::ranges::find_if(findings, [](const Finding& finding) { return out_of_sight({finding}); });
-    if (obstacle != findings.end())
-        return in_one_line(*obstacle);
+    if (const QString obstacle = obstacle_among(findings); !obstacle.isEmpty())
+        return obstacle;
     if (!place.session || has(findings, u"damaged"))
         return u"The database itself is damaged and cannot be mended in its place. "_s + checks::backup_or_recover();
     if (has(findings, u"version"))

@@ -55,6 +55,8 @@ struct Check
 [[nodiscard]] Findings examine_church(MenderPlace& place, std::span<const Check> more);
 /// True where the findings tell that the database could not be looked at, so that nothing is known of its state.
 [[nodiscard]] bool out_of_sight(const Findings& findings);
+/// True where the file itself is, so that it may be set aside.
+[[nodiscard]] bool file_damaged(const Findings& findings);
 
 /// What mending came to.
 struct Mending
@@ -78,17 +80,22 @@ QStringList unlock_church(MenderPlace& place);
 /// lies on a server, or somebody is at work on it.
 [[nodiscard]] QString set_database_aside(MenderPlace& place);
 
+/// Whether a recovered file may take the place of the church's own: where that is missing, `damaged` as the church's
+/// findings tell, or without any family, as it is after it was set aside and the program started once. Never on a
+/// server.
+[[nodiscard]] bool gives_way(MenderPlace& place, bool damaged);
+
 /// What putting a recovered file in place came to.
 struct Placement
 {
-    QString aside;   ///< Where the damaged file lies now; empty when there was none.
+    QString aside;   ///< Where the former file lies now; empty when there was none.
     Mending mending; ///< Of the church as it is now.
 };
 
-/// Gives a recovered church file the place of the damaged or missing database, then mends the church. The damaged file
+/// Gives a recovered church file the place of a database that gives_way(), then mends the church. The former file
 /// is set aside as set_database_aside() does it; the recovered one is moved, or copied from another disk. Killed at any
 /// moment, both are there, and the church has one of them. Throws DatabaseError or FileError when the recovered file is
-/// not sound or not of this church, or where the damaged one may not be set aside; everything is then as it was.
+/// not sound or not of this church, or where the former one may not be set aside; everything is then as it was.
 [[nodiscard]] Placement put_in_place(MenderPlace& place, const QString& recovered, std::span<const Check> more);
 
 /// A place of its own in the church's folder `mended`, which is made, for a file of this name.

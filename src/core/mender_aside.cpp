@@ -7,6 +7,7 @@
 #include "core/mender_hold.h"
 #include "core/mender_obstacle.h"
 #include "core/mender_place.h"
+#include "core/mender_words.h"
 #include "core/open_church.h"
 #include "core/side_files.h"
 #include "core/sqlite_session.h"
@@ -30,10 +31,15 @@ namespace {
 
 const QString journal = u"-journal"_s;
 
-Marker alone_in(const MenderPlace& place)
+bool on_server(const MenderPlace& place)
 {
-    if (place.paths.exists(Folder::church, connection_file.toString()))
-        throw FileError(u"This church lies on a server: there is no file of it that could be set aside."_s);
+    return place.paths.exists(Folder::church, connection_file.toString());
+}
+
+Marker alone_in(const MenderPlace& place, const QString& without_file)
+{
+    if (on_server(place))
+        throw FileError(without_file);
     auto busy = Marker::take(place.paths, side_files::busy);
     if (!busy)
         throw FileError(checks::locked_by_marker());
@@ -54,18 +60,31 @@ void demand_nobody_known_inside(MenderPlace& place)
         throw FileError(others);
 }
 
-/// A database that could not be looked at may be sound.
-void demand_damaged(MenderPlace& place)
+/// Throws where the database could not be looked at: it may be sound.
+bool is_damaged(MenderPlace& place)
 {
     const auto found = examine_church(place, {});
-    for (const auto& finding : found) {
-        if (out_of_sight({finding}))
-            throw FileError(in_one_line(finding));
-    }
-    if (std::ranges::none_of(found, [](const Finding& finding) { return finding.cure == Cure::recover; }))
-        throw FileError(u"The church file is not damaged: start Kindrel to restore a backup."_s);
+    if (const QString obstacle = obstacle_among(found); !obstacle.isEmpty())
+        throw FileError(obstacle);
+    return file_damaged(found);
+}
+
+/// Lets go of the file, which is to be moved, unless somebody else is at it.
+void leave_file(MenderPlace& place)
+{
     demand_nobody_known_inside(place);
     place.session.reset();
+}
+
+/// A church as it begins. What cannot be counted may be anything.
+bool holds_nobody(MenderPlace& place)
+{
+    try {
+        return place.session && checks::number_from(*place.session, u"SELECT (SELECT COUNT(*) FROM [tbl_surname])+"
+                                                                    "(SELECT COUNT(*) FROM [tbl_people]);"_s) == 0;
+    } catch (const DatabaseError&) {
+        return false;
+    }
 }
 
 QString place_aside(const MenderPlace& place)
@@ -166,22 +185,42 @@ void demand_fit(const MenderPlace& place, const QString& recovered)
     demand_of_this_church(place, *fresh.session);
 }
 
-/// Names are exchanged on one disk only.
-QString on_disk_of_church(const MenderPlace& place, const QString& recovered)
+/// The recovered file on the disk of the church, since names are exchanged on one disk only: a copy where it lies on
+/// another, gone at the end unless it got its place.
+class OnDiskOfChurch
 {
-    const auto disk_of = [](const QString& file) {
-        return QStorageInfo(QFileInfo(file).absolutePath()).device();
-    };
-    const QString file = place.paths.database();
-    if (disk_of(recovered) == disk_of(file))
-        return recovered;
-    const QString copy = file + u".unfinished"_s;
-    remove_file(copy);
-    copy_file(recovered, copy);
-    flush_to_disk(copy);
-    check_church_file(copy);
-    return copy;
-}
+public:
+    OnDiskOfChurch(const MenderPlace& place, const QString& recovered) : m_recovered(recovered)
+    {
+        const auto disk_of = [](const QString& file) {
+            return QStorageInfo(QFileInfo(file).absolutePath()).device();
+        };
+        const QString file = place.paths.database();
+        if (disk_of(recovered) != disk_of(file))
+            m_copy = file + u".unfinished"_s;
+    }
+    OnDiskOfChurch(const OnDiskOfChurch&) = delete;
+    OnDiskOfChurch& operator=(const OnDiskOfChurch&) = delete;
+    ~OnDiskOfChurch()
+    {
+        if (!m_copy.isEmpty())
+            QFile::remove(m_copy);
+    }
+    [[nodiscard]] QString provide() const
+    {
+        if (m_copy.isEmpty())
+            return m_recovered;
+        remove_file(m_copy);
+        copy_file(m_recovered, m_copy);
+        flush_to_disk(m_copy);
+        check_church_file(m_copy);
+        return m_copy;
+    }
+
+private:
+    QString m_recovered;
+    QString m_copy; ///< Empty where none is needed.
+};
 
 /// The recovered file is in its place: what fails now is told beside that.
 Mending mending_of(MenderPlace& place, std::span<const Check> more)
@@ -219,13 +258,26 @@ QString checks::locked_by_marker()
            "them. When nobody is, unlock the church first."_s;
 }
 
+bool file_damaged(const Findings& findings)
+{
+    return std::ranges::find(findings, Cure::recover, &Finding::cure) != findings.end();
+}
+
+bool gives_way(MenderPlace& place, bool damaged)
+{
+    return !on_server(place) && (damaged || !QFileInfo::exists(place.paths.database()) || holds_nobody(place));
+}
+
 QString set_database_aside(MenderPlace& place)
 {
-    const auto busy = alone_in(place);
+    const auto busy =
+        alone_in(place, u"This church lies on a server: there is no file of it that could be set aside."_s);
     const QString file = place.paths.database();
     if (!QFileInfo::exists(file))
         throw FileError(u"There is no church file: start Kindrel and restore a backup."_s);
-    demand_damaged(place);
+    if (!is_damaged(place))
+        throw FileError(u"The church file is not damaged: start Kindrel to restore a backup."_s);
+    leave_file(place);
     HeldFile held(file);
     const QString aside = place_aside(place);
     move_journal(file, aside);
@@ -239,12 +291,15 @@ Placement put_in_place(MenderPlace& place, const QString& recovered, std::span<c
 {
     Placement placement;
     {
-        const auto busy = alone_in(place);
+        const auto busy =
+            alone_in(place, u"This church lies on a server: there a recovered file cannot take its place."_s);
         const bool there = QFileInfo::exists(place.paths.database());
-        if (there)
-            demand_damaged(place);
+        if (there && !gives_way(place, is_damaged(place)))
+            throw FileError(mender_words::no_place_for_recovered());
+        leave_file(place);
         demand_fit(place, recovered);
-        const QString fresh = on_disk_of_church(place, recovered);
+        const OnDiskOfChurch on_disk(place, recovered);
+        const QString fresh = on_disk.provide();
         placement.aside = there ? exchange(place, fresh) : fill_gap(place, fresh);
         flush_to_disk(place.paths.database());
     }

@@ -37,8 +37,11 @@ HeldFile::HeldFile(const QString& file)
     m_database.reset(database);
     if (code == SQLITE_OK)
         code = lock(database);
-    if (code == SQLITE_BUSY)
-        throw FileError(in_one_line(mender_checks::in_use()));
+    if (code == SQLITE_BUSY) {
+        Finding held = mender_checks::in_use();
+        held.words = u"Somebody is reading or writing in the church just now."_s;
+        throw FileError(in_one_line(held));
+    }
     if (code != SQLITE_OK)
         throw FileError(in_one_line(mender_checks::forbidden()));
 }

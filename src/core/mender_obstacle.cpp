@@ -111,10 +111,16 @@ QString backup_or_recover()
 
 bool out_of_sight(const Findings& findings)
 {
-    return std::ranges::any_of(findings, [](const Finding& finding) {
+    return !obstacle_among(findings).isEmpty();
+}
+
+QString obstacle_among(const Findings& findings)
+{
+    const auto first = std::ranges::find_if(findings, [](const Finding& finding) {
         return std::ranges::any_of(mender_checks::obstacles,
                                    [&](const char16_t* kind) { return finding.kind == QStringView(kind); });
     });
+    return first == findings.end() ? QString() : in_one_line(*first);
 }
 
 QString in_one_line(const Finding& finding)

@@ -6,6 +6,8 @@ namespace kindrel::core {
 
 /// The finding with its remedy, for where there is room for a sentence alone.
 [[nodiscard]] QString in_one_line(const Finding& finding);
+/// Why nothing is known of the database's state, in one line; empty where out_of_sight() does not hold.
+[[nodiscard]] QString obstacle_among(const Findings& findings);
 
 } // namespace kindrel::core
 

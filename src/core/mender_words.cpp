@@ -75,11 +75,17 @@ QString after_recovering()
     return u"To work with it, put it in the place of the damaged file (kindrel-mender put-in-place)."_s;
 }
 
+QString no_place_for_recovered()
+{
+    return u"A recovered file takes the place only of a church file that is damaged, missing or without any family. To go "
+           "back to an earlier state of the church, start %1 and restore a backup."_s.arg(product);
+}
+
 QStringList where_put(const Placement& placement, const QString& database)
 {
     QStringList lines{u"The recovered records stand in '%1' now."_s.arg(database)};
     if (!placement.aside.isEmpty())
-        lines += where_set_aside(placement.aside);
+        lines += u"The church's former file lies in '%1' now."_s.arg(placement.aside);
     return lines;
 }
 

@@ -25,6 +25,8 @@ namespace kindrel::core::mender_words {
 [[nodiscard]] QString after_setting_aside();
 /// How to go on with the new church file.
 [[nodiscard]] QString after_recovering();
+/// Why a new church file does not come in the place of the church's own.
+[[nodiscard]] QString no_place_for_recovered();
 /// Where both files lie after the recovered one was put in place.
 [[nodiscard]] QStringList where_put(const Placement& placement, const QString& database);
 

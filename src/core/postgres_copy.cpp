@@ -1,27 +1,14 @@
 #include "core/postgres_copy.h"
 
 #include "core/copy_church_tables.h"
-#include "core/schema.h"
 #include "core/sqlite_session.h"
-
-#include <QFile>
 
 namespace kindrel::core {
 
 void copy_to_file(Session& server, const QString& file)
 {
-    auto target = create_sqlite(file);
-    try {
-        create_schema(*target);
-        const Transaction reading(server);
-        Transaction writing(*target);
-        copy_tables(server, *target);
-        writing.commit();
-    } catch (const DatabaseError&) {
-        target.reset();
-        QFile::remove(file);
-        throw;
-    }
+    const Transaction reading(server);
+    copy_to_new_file(server, file, [](int) {});
 }
 
 void replace_from_file(Session& server, const QString& file)

@@ -4,7 +4,7 @@
 
 namespace kindrel::core {
 
-/// A long run's report. Yields to the event loop: no transaction and no `Rows` may be open at a step.
+/// A long run's report. A step yields to the event loop: nothing of the office's own session may be open then.
 class Progress
 {
 public:

@@ -275,6 +275,19 @@ void keep_present(Office& office, RestoreReport& report, Progress& progress)
     report.before_unchecked = copy_unchecked(office, folder);
 }
 
+/// The person gave up after all: what was kept of the present would only push older states out.
+void drop_kept(const Office& office, const RestoreReport& report)
+{
+    if (!report.before_unchecked.isEmpty())
+        QDir(report.before_unchecked).removeRecursively();
+    if (report.before.isEmpty() || !QFile::remove(report.before))
+        return;
+    try {
+        backup_rules::forget(office, report.before);
+    } catch (const FileError&) { // Of the church's own folders only what is there is listed.
+    }
+}
+
 /// What cannot be removed stays.
 void remove_oldest_safety_backups(const Office& office, const QString& just_restored)
 {
@@ -288,7 +301,8 @@ void remove_oldest_safety_backups(const Office& office, const QString& just_rest
         QDir(folder + name).removeRecursively();
 }
 
-/// From here on nothing is asked and nothing can be stopped.
+/// From here on nothing is asked and nothing can be stopped. What fails once the database has its new content is no
+/// failure of the restore.
 void exchange(Office& office, RestoreWork& work, const std::vector<Swap>& swaps)
 {
     try {
@@ -297,8 +311,9 @@ void exchange(Office& office, RestoreWork& work, const std::vector<Swap>& swaps)
         office.session->replace_content(work.unpacked() + database_entry);
         work.demand_undisturbed();
     } catch (...) {
-        work.settle(*office.session);
-        throw;
+        if (!work.settle(*office.session))
+            throw;
+        return;
     }
     try {
         work.settle(*office.session);
@@ -333,8 +348,10 @@ RestoreReport replace(Office& office, const OpenBackup& backup, const RestoreReq
 
     RestoreReport report{.restored = contents_of(backup, request.file), .before = {}};
     keep_present(office, report, progress);
-    if (!progress.step(exchanging))
+    if (!progress.step(exchanging)) {
+        drop_kept(office, report);
         throw Cancelled();
+    }
     exchange(office, work, swaps);
     remove_oldest_safety_backups(office, request.file);
     return report;

@@ -124,6 +124,9 @@ void write_journal(const Paths& paths, const QString& id, const std::vector<Swap
 /// A database that lacks the table is not the one that was restored, for that was found sound.
 bool bears_mark(Session& session, const QString& id)
 {
+    std::optional<Transaction> turn; // Where the answer to a commit was lost, the server may still be at it.
+    if (session.engine() == EngineKind::postgres)
+        turn.emplace(session);
     if (!tables_of(session).contains(u"tbl_setting"_s, Qt::CaseInsensitive))
         return false;
     auto rows = session.select(u"SELECT [value] FROM [tbl_setting] WHERE [setting]=?;"_s, mark_name);
@@ -151,17 +154,19 @@ void hold(QLockFile& running)
                     "failed and does not come back, remove the file '%2'."_s.arg(workstation, running.fileName()));
 }
 
-/// Nothing of the restore is needed any more, or can be.
-void finish(const Paths& paths, Session& session)
+/// Nothing of the restore is needed any more, or can be. True when it is in place.
+bool finish(const Paths& paths, Session& session)
 {
     const auto journal = read_journal(paths);
-    if (journal && !bears_mark(session, journal->id)) {
+    const bool in_place = journal && bears_mark(session, journal->id);
+    if (journal && !in_place) {
         for (const Move& move : journal->moves | std::views::reverse)
             take_back(move);
     }
     flush_to_disk(work_folder(paths));
     remove_file(journal_file(paths));
     QDir(work_folder(paths)).removeRecursively();
+    return in_place;
 }
 
 FileError moved_to(const QString& place)
@@ -173,10 +178,10 @@ FileError moved_to(const QString& place)
         "restore a backup once more."_s.arg(QDir::toNativeSeparators(place)));
 }
 
-void finish_or_set_aside(const Paths& paths, Session& session)
+bool finish_or_set_aside(const Paths& paths, Session& session)
 {
     try {
-        finish(paths, session);
+        return finish(paths, session);
     } catch (const DamagedJournal&) {
         const QString place = mended_place(paths, u"restore_work"_s);
         move_file(without_end(work_folder(paths)), place);
@@ -233,9 +238,9 @@ void RestoreWork::demand_undisturbed() const
         throw FileError(u"Somebody else ended this restore meanwhile. Restore the backup once more."_s);
 }
 
-void RestoreWork::settle(Session& session)
+bool RestoreWork::settle(Session& session)
 {
-    finish_or_set_aside(m_paths, session);
+    return finish_or_set_aside(m_paths, session);
 }
 
 bool restore_unsettled(const Paths& paths)

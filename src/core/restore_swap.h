@@ -38,8 +38,8 @@ public:
     void swap(const std::vector<Swap>& swaps);
     /// Throws FileError when somebody else settled this restore meanwhile: files and database would not fit together.
     void demand_undisturbed() const;
-    /// settle_interrupted_restore() for this one.
-    void settle(Session& session);
+    /// settle_interrupted_restore() for this one. True when the database bears its mark: the restore is in place.
+    bool settle(Session& session);
 
 private:
     Paths m_paths;

@@ -7,6 +7,7 @@
 #include "desktop/church_choice.h"
 #include "desktop/people/editor_page.h"
 #include "desktop/people/speed_find.h"
+#include "desktop/people/tagging_page.h"
 #include "desktop/shell/main_window.h"
 #include "desktop/shell/page.h"
 
@@ -105,6 +106,18 @@ void Running::open_family(int surname_id, std::vector<int> among, const QString&
 void Running::new_family()
 {
     in_editor([](EditorPage& page) { return page.new_family(); });
+}
+
+void Running::to_tagging(people::WorkingList found)
+{
+    QMetaObject::invokeMethod(
+        m_window.get(),
+        [this, found = std::move(found)] {
+            m_window->open_area(u"tagging"_s);
+            if (auto* page = qobject_cast<TaggingPage*>(m_window->page()))
+                page->take_people(found);
+        },
+        Qt::QueuedConnection);
 }
 
 void Running::open_draft(int surname_id)

@@ -49,6 +49,7 @@ public:
     void open_area(const QString& key) override;
     void open_family(int surname_id, std::vector<int> among, const QString& among_name) override;
     void new_family() override;
+    void to_tagging(people::WorkingList found) override;
     void open_draft(int surname_id) override;
     void load_church(int church) override;
 

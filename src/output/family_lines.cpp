@@ -188,6 +188,13 @@ CaptionLines personal_contacts(const people::DisclosedFamily& family, const peop
     return lines;
 }
 
+CaptionLines personal_contacts(const ListedMember& listed)
+{
+    auto person = listed.person;
+    person.other_surname.clear();
+    return personal_contacts(listed.family, person);
+}
+
 void write_line(pages::Writer& place, const QString& text, const pages::TextStyle& style)
 {
     if (!text.isEmpty())

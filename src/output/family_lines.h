@@ -39,6 +39,8 @@ using CaptionLines = std::vector<std::vector<pages::CaptionValue>>;
 [[nodiscard]] CaptionLines family_contacts(const people::DisclosedFamily& family);
 /// The person's birth date, other names, e-mails, phones and school year.
 [[nodiscard]] CaptionLines personal_contacts(const people::DisclosedFamily& family, const people::Person& person);
+/// The same beneath the person's listed name, which has their own surname already.
+[[nodiscard]] CaptionLines personal_contacts(const ListedMember& listed);
 
 /// A text on lines of its own; nothing when it is empty.
 void write_line(pages::Writer& place, const QString& text, const pages::TextStyle& style);

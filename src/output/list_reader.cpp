@@ -127,7 +127,7 @@ bool for_each_person_of(const ReportInput& input, std::span<const people::Member
     const auto disclosure = disclosure_of(input);
     const auto read = [&](std::span<const people::Member> chunk) {
         const people::WorkingList list{{chunk.begin(), chunk.end()}, {}};
-        return read_families(input, list.families(), disclosure, extent | people::Part::details);
+        return read_families(input, list.families(), disclosure, extent | people::Part::own_surnames);
     };
     return in_chunks(members, progress, read,
                      [&](const Families& families, const people::Member& member, std::size_t place) {

@@ -52,8 +52,8 @@ struct ListedMember
     [[nodiscard]] QString listed_name() const;
 };
 
-/// Reads the working list's people in its order, one by one, whatever their families; their details always, which hold
-/// the names that they are listed under.
+/// Reads the working list's people in its order, one by one, whatever their families; their own surnames always, under
+/// which they are listed.
 [[nodiscard]] bool for_each_person(const ReportInput& input, core::Progress& progress,
                                    const std::function<void(const ListedMember&)>& write, people::Extent extent);
 

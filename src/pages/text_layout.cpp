@@ -1,5 +1,6 @@
 #include "pages/text_layout.h"
 
+#include <QTextBoundaryFinder>
 #include <QTextLayout>
 
 #include <algorithm>
@@ -283,6 +284,15 @@ Blocks lay_out(std::span<const Run> runs, const ParagraphStyle& style, qreal wid
     auto lines = Paragraph(runs, style, metrics).lines(width);
     keep_ends_together(lines);
     return lines;
+}
+
+qreal widest_word(const QString& text, const TextStyle& style, TextMetrics& metrics)
+{
+    QTextBoundaryFinder places(QTextBoundaryFinder::Line, text);
+    qreal widest = 0;
+    for (auto from = places.position(); places.toNextBoundary() > from; from = places.position())
+        widest = std::max(widest, metrics.width(text.sliced(from, places.position() - from).trimmed(), style));
+    return widest;
 }
 
 } // namespace kindrel::pages

@@ -1,7 +1,6 @@
 #include "people/data_search.h"
 
 #include "core/entry.h"
-#include "people/names.h"
 #include "people/pins.h"
 
 #include <QDateTime>
@@ -9,7 +8,9 @@
 #include <QHash>
 #include <QRegularExpression>
 
+#include <algorithm>
 #include <functional>
+#include <stdexcept>
 
 namespace kindrel::people {
 
@@ -28,6 +29,9 @@ enum Fixed {
     given,
     preferred,
     preferred_hidden,
+    own_surname,
+    own_surname_hidden,
+    active,
     deceased,
     archived,
     privacy,
@@ -60,6 +64,7 @@ constexpr Source sources[]{
      u"f.[sort_key],f.[Primary_name],f.[Surname_ID],p.[position],p.[person_id]"},
     {"surname_id", "work_families_with_file",
      u"INNER JOIN [qry_Kindrel_address_book_include_decease] p ON p.[Surname_ID]=v.[surname_id] "
+     "LEFT JOIN [tbl_personal_details] d ON d.[person_id]=p.[person_id] "
      "LEFT JOIN [tbl_address] a ON a.[surname_id]=v.[surname_id]",
      u"p.[sort_key],p.[Primary_name],p.[Surname_ID]"},
 };
@@ -101,6 +106,9 @@ QString statement_of(const DataPart& part, const QString& table)
                             u"p.[Name]"_s,
                             u"p.[preferred_name]"_s,
                             u"p.[Preferred_Name_hidden]"_s,
+                            u"d.[other_surname]"_s,
+                            u"d.[surname_hidden]"_s,
+                            u"p.[Active]"_s,
                             u"p.[Decease]"_s,
                             u"p.[archive]"_s,
                             u"p.[Privacy]"_s,
@@ -161,25 +169,30 @@ Value value_of(const core::Row& row, const DataPart& part, core::DayOrder order)
     return {texts.join(QString::fromUtf8(part.joint)), keys.join(u' ')};
 }
 
+Member member_of(const core::Row& row)
+{
+    return {row.integer(Column{key_of_person}), row.integer(Column{key_of_family})};
+}
+
 DataEntry entry_of(const core::Row& row, bool use_preferred_names)
 {
     Person person;
     person.Name = row.text(Column{given});
     person.preferred_name = row.text(Column{preferred});
     person.Preferred_Name_hidden = row.flag(Column{preferred_hidden});
+    person.other_surname = row.text(Column{own_surname});
+    person.surname_hidden = row.flag(Column{own_surname_hidden});
+    person.Active = row.flag(Column{active});
     person.Decease = row.flag(Column{deceased});
     person.archive = row.flag(Column{archived});
     person.Privacy = row.flag(Column{privacy});
     person.Prospect = row.flag(Column{prospect});
     person.contact = row.flag(Column{contact});
-    return {.member = {row.integer(Column{key_of_person}), row.integer(Column{key_of_family})},
-            .surname = row.text(Column{surname}),
-            .name = display_name(person, use_preferred_names) + markers(person, Markers::full),
-            .deceased = person.Decease,
-            .archived = person.archive,
-            .privacy = person.Privacy,
-            .prospect = person.Prospect,
-            .contact = person.contact,
+    const QString of_family = row.text(Column{surname});
+    return {.member = member_of(row),
+            .surname = of_family,
+            .name = listed_name(person, of_family, use_preferred_names),
+            .states = states_of(person),
             .Condition = FileStatus(row.integer(Column{condition})),
             .hidden = row.flag(Column{hidden})};
 }
@@ -233,12 +246,11 @@ std::vector<DataEntry> read_entries(core::Office& office, const QString& stateme
     std::vector<DataEntry> entries;
     auto rows = office.session->select(statement);
     for (const core::Row& row : rows) {
-        DataEntry entry = entry_of(row, office.settings.use_preferred_names);
         const Value read = value(row);
-        if (entries.empty() || !is_same(entries.back().member, entry.member)) {
+        if (entries.empty() || !is_same(entries.back().member, member_of(row))) {
+            DataEntry& entry = entries.emplace_back(entry_of(row, office.settings.use_preferred_names));
             entry.value = read.shown;
             entry.order = read.order;
-            entries.push_back(std::move(entry));
         } else {
             entries.back().value += u"; "_s + read.shown;
             entries.back().order += u' ' + read.order;
@@ -263,6 +275,23 @@ std::optional<std::vector<DataEntry>> people_with(core::Office& office, const Da
         const core::Date day = days.value(row.integer(key));
         return Value{day.shown(office.day_order()), day.stored()};
     });
+}
+
+QSet<int> families_with(core::Session& session, std::string_view part_name)
+{
+    const auto parts = data_parts();
+    const auto part = std::ranges::find(parts, part_name, &DataPart::name);
+    if (part == parts.end() || !part->table)
+        throw std::logic_error("no such part of the record");
+    const bool of_person = part->owner == DataOwner::person;
+    auto rows = session.select(u"SELECT DISTINCT %1.[surname_id] FROM [%2] v%3%4;"_s.arg(
+        of_person ? u"p"_s : u"v"_s, latin(part->table),
+        of_person ? u" INNER JOIN [tbl_people] p ON p.[person_id]=v.[person_id]"_s : QString(),
+        condition_of(*part, own_columns(*part))));
+    QSet<int> families;
+    for (const core::Row& row : rows)
+        families.insert(row.integer(Column{0}));
+    return families;
 }
 
 QString heading_of(const DataPart& part)

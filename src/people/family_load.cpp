@@ -23,25 +23,25 @@ class Scope
 public:
     explicit Scope(std::span<const int> keys) : m_key(keys.size() == 1 ? keys.front() : 0) {}
 
-    /// `order` is appended as it stands.
-    [[nodiscard]] Rows families(Session& session, const char* from, const char* order = "") const
+    /// `rest`, a further condition or the order, is appended as it stands.
+    [[nodiscard]] Rows families(Session& session, const char* from, const char* rest = "") const
     {
-        return run(session, from, m_key ? u"[surname_id]=?"_s : u"[surname_id] IN (%1)"_s.arg(lent), order);
+        return run(session, from, m_key ? u"[surname_id]=?"_s : u"[surname_id] IN (%1)"_s.arg(lent), rest);
     }
-    [[nodiscard]] Rows people(Session& session, const char* from, const char* order = "") const
+    [[nodiscard]] Rows people(Session& session, const char* from, const char* rest = "") const
     {
         const auto whose = m_key ? u"=?"_s : u" IN (%1)"_s.arg(lent);
         return run(session, from,
-                   u"[person_id] IN (SELECT [person_id] FROM [tbl_people] WHERE [Surname_ID]%1)"_s.arg(whose), order);
+                   u"[person_id] IN (SELECT [person_id] FROM [tbl_people] WHERE [Surname_ID]%1)"_s.arg(whose), rest);
     }
 
 private:
     static constexpr QStringView lent = u"SELECT [surname_id] FROM [work_families]";
 
-    Rows run(Session& session, const char* from, const QString& where, const char* order) const
+    Rows run(Session& session, const char* from, const QString& where, const char* rest) const
     {
         const auto text =
-            u"SELECT * FROM [%1] WHERE %2%3;"_s.arg(QString::fromLatin1(from), where, QString::fromLatin1(order));
+            u"SELECT * FROM [%1] WHERE %2%3;"_s.arg(QString::fromLatin1(from), where, QString::fromLatin1(rest));
         return m_key ? session.select(text, m_key) : session.select(text);
     }
     int m_key;
@@ -180,6 +180,22 @@ void load_details(Session& session, const Scope& scope, const PersonMap& people)
     }
 }
 
+/// Of the few who have one: a list of names needs no more of the details.
+void load_own_surnames(Session& session, const Scope& scope, const PersonMap& people)
+{
+    auto details = scope.people(session, "tbl_personal_details", " AND [other_surname] IS NOT NULL");
+    const auto key = details.column(u"person_id");
+    const auto surname = details.column(u"other_surname");
+    const auto hidden = details.column(u"surname_hidden");
+    for (const Row& row : details) {
+        auto* person = people.value(row.integer(key));
+        if (!person)
+            continue;
+        person->other_surname = row.text(surname);
+        person->surname_hidden = row.flag(hidden);
+    }
+}
+
 void load_pins(Session& session, const Scope& scope, const PersonMap& people)
 {
     auto pins = scope.people(session, "tbl_pin");
@@ -201,6 +217,8 @@ void load_person_rows(Session& session, const Scope& scope, std::vector<FamilyFi
     }
     if (extent & (Part::details | Part::occupations))
         load_details(session, scope, people);
+    else if (extent & Part::own_surnames)
+        load_own_surnames(session, scope, people);
     if (extent & Part::pins)
         load_pins(session, scope, people);
     for (const auto& [table, list] : person_links()) {

@@ -23,7 +23,8 @@ enum class Part : quint32 {
     other_contacts = 1 << 11,
     events = 1 << 12,
     visits = 1 << 13,
-    access = 1 << 14
+    access = 1 << 14,
+    own_surnames = 1 << 15 ///< Of people who differ from their family; the details have them too.
 };
 Q_DECLARE_FLAGS(Extent, Part)
 Q_DECLARE_OPERATORS_FOR_FLAGS(Extent)

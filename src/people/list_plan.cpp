@@ -42,15 +42,19 @@ QString hand_words(const ListPlan& plan)
     return parts.isEmpty() ? QString() : parts.join(u" and "_s) + u" by hand"_s;
 }
 
-/// The people of `members` who are not in the list, in their order.
+/// The people of `members` who are not in the list, in their order, each once.
 WorkingList lacking(const std::vector<Member>& list, const std::vector<Member>& members)
 {
     QSet<int> there;
     for (const auto& member : list)
         there.insert(member.person_id);
     WorkingList found;
-    std::ranges::copy_if(members, std::back_inserter(found.members),
-                         [&](const Member& member) { return !there.contains(member.person_id); });
+    for (const auto& member : members) {
+        if (there.contains(member.person_id))
+            continue;
+        there.insert(member.person_id);
+        found.members.push_back(member);
+    }
     return found;
 }
 
@@ -64,9 +68,9 @@ std::vector<Member> members_of(const std::vector<ListedPerson>& people)
 
 WorkingList in_order(core::Office& office, const ListPlan& plan)
 {
-    auto list = find_people(*office.session, plan.filter, day_of(office));
-    if (plan.added.empty() && plan.sort == SortOrder{})
-        return list; // As it was found.
+    auto list = plan.found ? *plan.found : find_people(*office.session, plan.filter, day_of(office));
+    if (!plan.found && plan.added.empty() && plan.sort == SortOrder{})
+        return list; // The filter finds them in this order.
     const auto more = lacking(list.members, plan.added);
     list.members.insert(list.members.end(), more.members.begin(), more.members.end());
     return sorted(*office.session, list, plan.sort, office.clock.today());
@@ -116,18 +120,20 @@ MadeList make_list(core::Office& office, const ListPlan& plan)
 
 QString sentence_of(core::Office& office, const ListPlan& plan)
 {
-    QStringList parts{sentence(*office.session, plan.filter, day_of(office)),
+    QStringList parts{plan.found ? plan.found->criteria : sentence(*office.session, plan.filter, day_of(office)),
                       sort_sentence(plan.sort, office.day_order()), needs_words(plan.needs), range_words(plan.range),
                       hand_words(plan)};
     parts.removeAll(QString());
     return parts.join(u"; "_s);
 }
 
-void add_by_hand(ListPlan& plan, const Member& member)
+void add_by_hand(ListPlan& plan, const std::vector<Member>& members)
 {
-    std::erase(plan.struck, member.person_id);
-    if (std::ranges::find(plan.added, member.person_id, &Member::person_id) == plan.added.end())
-        plan.added.push_back(member);
+    QSet<int> added;
+    for (const auto& member : members)
+        added.insert(member.person_id);
+    std::erase_if(plan.struck, [&](int person) { return added.contains(person); });
+    std::ranges::copy(lacking(plan.added, members).members, std::back_inserter(plan.added));
 }
 
 void strike_by_hand(ListPlan& plan, int person_id)

@@ -29,8 +29,9 @@ struct ListPlan
     SortOrder sort;
     ListRange range;
     Needs needs;
-    std::vector<Member> added = {}; ///< By hand.
-    std::vector<int> struck = {};   ///< By hand: keys of people.
+    std::optional<WorkingList> found = {}; ///< Elsewhere: in place of those whom the filter finds, with its own words.
+    std::vector<Member> added = {};        ///< By hand.
+    std::vector<int> struck = {};          ///< By hand: keys of people.
 };
 
 struct MadeList
@@ -45,8 +46,8 @@ struct MadeList
 /// The whole plan in plain English.
 [[nodiscard]] QString sentence_of(core::Office& office, const ListPlan& plan);
 
-/// A person is put on the list or off it by hand, whatever was done with them before.
-void add_by_hand(ListPlan& plan, const Member& member);
+/// People are put on the list or off it by hand, whatever was done with them before.
+void add_by_hand(ListPlan& plan, const std::vector<Member>& members);
 void strike_by_hand(ListPlan& plan, int person_id);
 
 } // namespace kindrel::people

@@ -14,7 +14,7 @@ namespace {
 constexpr auto columns =
     u"p.[person_id],p.[Surname_ID],p.[Name],p.[preferred_name],p.[Preferred_Name_hidden],p.[Decease],p.[archive],"
     "p.[Privacy],p.[Prospect],p.[contact],f.[surname],f.[sort_key],f.[booked_out],p.[sort_key],d.[other_surname],"
-    "d.[surname_hidden]";
+    "d.[surname_hidden],p.[Active]";
 constexpr auto around_person = u" JOIN [tbl_surname] f ON f.[Surname_ID]=p.[Surname_ID] "
                                "LEFT JOIN [tbl_personal_details] d ON d.[person_id]=p.[person_id] ";
 
@@ -31,6 +31,7 @@ Person person_of(const core::Row& row)
     person.contact = row.flag(Column{9});
     person.other_surname = row.text(Column{14});
     person.surname_hidden = row.flag(Column{15});
+    person.Active = row.flag(Column{16});
     return person;
 }
 
@@ -44,11 +45,7 @@ std::vector<ListedPerson> read(core::Rows rows, bool use_preferred_names)
                          .surname = row.text(Column{10}),
                          .sort_key = row.text(Column{11}),
                          .own_sort_key = row.text(Column{13}),
-                         .deceased = person.Decease,
-                         .archived = person.archive,
-                         .privacy = person.Privacy,
-                         .prospect = person.Prospect,
-                         .contact = person.contact,
+                         .states = states_of(person),
                          .booked_out = row.flag(Column{12})});
     }
     return found;
@@ -98,6 +95,16 @@ QString condition(bool Needs::*need)
 }
 
 } // namespace
+
+PersonStates states_of(const Person& person)
+{
+    return {.active = person.Active,
+            .privacy = person.Privacy,
+            .prospect = person.Prospect,
+            .archived = person.archive,
+            .contact = person.contact,
+            .deceased = person.Decease};
+}
 
 QString listed_name(const Person& person, const QString& surname, bool use_preferred_names)
 {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "people/filter.h"
 #include "people/records.h"
 #include "people/working_list.h"
 
@@ -13,9 +14,11 @@ struct ListedPerson
     QString surname;      ///< Of the family.
     QString sort_key;     ///< Of that surname.
     QString own_sort_key; ///< Of the surname under which the person sorts: the own one unless it is hidden.
-    bool deceased = false, archived = false, privacy = false, prospect = false, contact = false;
+    PersonStates states;
     bool booked_out = false; ///< The family is away.
 };
+
+[[nodiscard]] PersonStates states_of(const Person& person);
 
 /// The listed name as lists of people show it: with the own surname where it is another than the family's and not
 /// hidden, and with the markers.

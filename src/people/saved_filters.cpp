@@ -129,13 +129,15 @@ std::optional<Filter> load_filter(core::Office& office, int filter_id)
     return std::move(read.filter);
 }
 
-bool replace_filter(core::Office& office, int filter_id, const Filter& filter)
+bool replace_filter(core::Office& office, const SavedFilter& saved, const Filter& filter)
 {
     if (!core::network_guard(office))
         return false;
-    const int touched = office.session->execute(u"UPDATE [tbl_filter_memory] SET [content]=? WHERE [filter_id]=?;"_s,
-                                                QString::fromUtf8(to_json(filter)), filter_id);
-    return touched > 0 || refuse(office, u"Unable to save this filter as another user has removed it"_s);
+    // By its name too: the key of one that was removed may be that of another by now.
+    const int touched = office.session->execute(
+        u"UPDATE [tbl_filter_memory] SET [content]=? WHERE [filter_id]=? AND [filter_name]=?;"_s,
+        QString::fromUtf8(to_json(filter)), saved.filter_id, saved.name);
+    return touched > 0 || refuse(office, u"Unable to save this filter as another user has removed or renamed it"_s);
 }
 
 bool rename_filter(core::Office& office, int filter_id, const QString& name)
@@ -156,7 +158,8 @@ bool remove_filter(core::Office& office, const SavedFilter& filter)
     const core::Message question{u"Are you sure that you wish to delete the filter '%1'?"_s.arg(filter.name)};
     if (!core::network_guard(office) || !office.dialogue.confirm(question, core::Answer::no))
         return false;
-    office.session->execute(u"DELETE FROM [tbl_filter_memory] WHERE [filter_id]=?;"_s, filter.filter_id);
+    office.session->execute(u"DELETE FROM [tbl_filter_memory] WHERE [filter_id]=? AND [filter_name]=?;"_s,
+                            filter.filter_id, filter.name);
     return true;
 }
 

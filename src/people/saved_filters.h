@@ -23,7 +23,7 @@ struct SavedFilter
 /// asks for birth dates or visits that the person may not see.
 [[nodiscard]] std::optional<Filter> load_filter(core::Office& office, int filter_id);
 /// Puts the filter in the place of the saved one, which keeps its name. False after saying why not.
-[[nodiscard]] bool replace_filter(core::Office& office, int filter_id, const Filter& filter);
+[[nodiscard]] bool replace_filter(core::Office& office, const SavedFilter& saved, const Filter& filter);
 [[nodiscard]] bool rename_filter(core::Office& office, int filter_id, const QString& name);
 /// Asks first.
 [[nodiscard]] bool remove_filter(core::Office& office, const SavedFilter& filter);

@@ -3,6 +3,7 @@
 #include "core/open_church.h"
 #include "core/removal.h"
 #include "registers/belongings.h"
+#include "registers/day_refusal.h"
 
 #include <QCoreApplication>
 #include <QLocale>
@@ -271,9 +272,8 @@ bool DatedRegister::usable(const core::Date& date) const
 {
     if (date.qdate().isValid())
         return true;
-    if (date.valid() && !date.year_known())
-        return refuse(year_missing);
-    m_office.dialogue.show(core::bad_date_message(m_office.day_order()));
+    const auto order = m_office.day_order();
+    m_office.dialogue.show(day_refusal(date.shown(order), order));
     return false;
 }
 

@@ -7,9 +7,6 @@
 
 namespace kindrel::registers {
 
-/// What is said to a date whose year is not known, where a register or a report must have it.
-inline const QString year_missing = QStringLiteral("Please enter the year too.");
-
 /// A date of a project.
 struct RegisterDate
 {

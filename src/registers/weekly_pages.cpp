@@ -2,11 +2,9 @@
 
 #include "core/progress_run.h"
 #include "pages/table.h"
-#include "pages/text_metrics.h"
+#include "pages/text_layout.h"
 #include "registers/weekly_charts.h"
 #include "registers/weekly_tables.h"
-
-#include <QRegularExpression>
 
 #include <algorithm>
 #include <cmath>
@@ -158,10 +156,7 @@ std::vector<pages::ChartData> charts_of(const WeeklyPlan& plan)
 /// The widest of a column's figures and of the words that head it, which stand in bold.
 qreal widest(const WeeklyTable& table, qsizetype column, const pages::TextStyle& style, pages::TextMetrics& metrics)
 {
-    static const QRegularExpression blanks(u"\\s+"_s);
-    qreal wide = 0;
-    for (const auto& word : table.columns[column].split(blanks))
-        wide = std::max(wide, metrics.width(word, style.bolder()));
+    auto wide = pages::widest_word(table.columns[column], style.bolder(), metrics);
     for (const auto& row : table.rows) {
         const bool bold = row.kind == RowKind::summary || column >= table.plain;
         wide = std::max(wide, metrics.width(row.texts.value(column), style.bolder(bold)));

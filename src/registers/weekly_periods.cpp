@@ -1,6 +1,6 @@
 #include "registers/weekly_periods.h"
 
-#include "registers/dated_register.h"
+#include "registers/day_refusal.h"
 
 #include <algorithm>
 

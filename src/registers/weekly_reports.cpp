@@ -78,13 +78,16 @@ constexpr std::size_t many_columns = 6;
 constexpr QMarginsF landscape_margins{28, 30, 28, 30};
 constexpr qreal below_period = 6;
 
-/// The project's name; nullopt, after saying why, when none is chosen.
-std::optional<QString> chosen_project(core::Session& session, int key, ReportCheck& check)
+/// A choice that is in the way of a report, and what is said of it.
+using Fault = std::pair<ReportField, QString>;
+
+/// Nullopt, after saying why, when none is chosen.
+std::optional<Project> chosen_project(core::Session& session, int key, ReportCheck& check)
 {
     const auto projects = read_projects(session, register_kind(Kind::weekly));
     const auto found = std::ranges::find(projects, key, &Project::key);
     if (found != projects.end())
-        return found->name;
+        return *found;
     return check.refuse(ReportField::project, projects.empty()
                                                   ? u"Unable to proceed as no Weekly projects have been setup"_s
                                                   : u"Please choose a weekly project"_s);
@@ -107,13 +110,15 @@ QString limit_words(const WeeklyReport& report)
 }
 
 /// What keeps the report from being of so many categories, with the charts that are asked for.
-std::optional<std::pair<ReportField, QString>> too_much(const WeeklyReportRequest& request, std::size_t categories)
+std::optional<Fault> too_much(const WeeklyReportRequest& request, std::size_t categories)
 {
     const auto& report = *request.report;
     if (categories == 0)
         return {{ReportField::categories, u"Please select either a financial or attendance item"_s}};
     if (categories > std::size_t(report.most_categories))
         return {{ReportField::categories, limit_words(report)}};
+    if (request.parts == ReportParts::table)
+        return {};
     if (request.chart && report.charts == by_category && categories > most_graphs)
         return {{ReportField::chart,
                  u"A maximum of six graphs can only be displayed at once for the monthly analysis Report"_s}};
@@ -136,33 +141,18 @@ PeriodChoice fitting(PeriodChoice choice, ReportPeriod wanted)
     return choice;
 }
 
-/// Everything that can be refused before a figure is read.
-std::optional<WeeklyPlan> without_figures(core::Office& office, const WeeklyReportRequest& request, ReportCheck& check)
+/// Nullopt, after saying why, when the report cannot be of the period that is asked for.
+std::optional<Period> chosen_period(const WeeklyReportRequest& request, core::DayOrder order, ReportCheck& check)
 {
-    if (!core::permitted(office, core::Area::weekly_statistics))
-        return {};
-    auto& session = *office.session;
-    const auto project = chosen_project(session, request.project, check);
-    if (!project)
-        return {};
-    if (!request.report)
-        return check.refuse(ReportField::report, u"Please choose a report"_s);
-    auto categories = chosen_categories(session, request);
-    if (const auto fault = too_much(request, categories.size()))
-        return check.refuse(fault->first, fault->second);
-    const auto period = read_period(fitting(request.period, request.report->period), office.day_order(), check);
-    if (!period)
-        return {};
-    return WeeklyPlan{.report = request.report,
-                      .project = *project,
-                      .categories = std::move(categories),
-                      .period = *period,
-                      .chart = request.report->charts == ReportCharts::none ? nullptr : request.chart,
-                      .day_order = office.day_order()};
+    const auto wanted = request.report->period;
+    auto period = read_period(fitting(request.period, wanted), order, check);
+    if (period && wanted == two_years && period->years() == 1)
+        return check.refuse(ReportField::to, u"Please enter two different years to compare"_s);
+    return period;
 }
 
-/// Why a report of changes would stand empty; empty when it has one to show.
-QString no_change(const WeeklyPlan& plan)
+/// Why a report of changes would stand empty; nullopt when it has one to show.
+std::optional<Fault> no_change(const WeeklyPlan& plan)
 {
     const auto table = slot_table(*plan.report->shape, plan.period, plan.figures, plan.categories);
     const auto shows = [](const FigureRow& row) {
@@ -171,14 +161,19 @@ QString no_change(const WeeklyPlan& plan)
     if (std::ranges::any_of(table.rows, shows))
         return {};
     if (plan.report->shape == month_changes)
-        return u"No month of the period and the month before it both have figures of the chosen categories."_s;
+        return {{ReportField::from,
+                 u"No month of the period and the month before it both have figures of the chosen categories."_s}};
     const int first = plan.period.first.year, last = plan.period.last.year;
-    for (const int year : {first, last}) {
-        if (std::ranges::none_of(plan.figures, [&](const auto& figure) { return figure.date.year == year; }))
-            return u"There are no figures of %1 to compare with those of %2."_s.arg(year).arg(year == first ? last
-                                                                                                            : first);
-    }
-    return u"None of the chosen categories has figures of both %1 and %2."_s.arg(first).arg(last);
+    const auto without = u"There are no figures of %1 to compare with those of %2."_s;
+    const auto none_of = [&](int year) {
+        return std::ranges::none_of(plan.figures, [&](const auto& figure) { return figure.date.year == year; });
+    };
+    if (none_of(first))
+        return {{ReportField::from, without.arg(first).arg(last)}};
+    if (none_of(last))
+        return {{ReportField::to, without.arg(last).arg(first)}};
+    return {
+        {ReportField::from, u"None of the chosen categories has figures of both %1 and %2."_s.arg(first).arg(last)}};
 }
 
 pages::PageSetup page_of(const WeeklyReport& report, pages::Paper paper)
@@ -212,7 +207,7 @@ void decorate(core::Office& office, const WeeklyPlan& plan, pages::Flow& flow)
 {
     const people::WorkingList no_people;
     output::OwnBands own;
-    own.header = [words = plan.project + plan.period.title,
+    own.header = [words = plan.project.name + plan.period.title,
                   how = what_is_compared(*plan.report, plan.period)](pages::Writer& band, int) {
         band.line(words, band.type().headings[1]);
         if (!how.isEmpty())
@@ -223,15 +218,15 @@ void decorate(core::Office& office, const WeeklyPlan& plan, pages::Flow& flow)
 }
 
 /// Of the days that the report looks at.
-std::vector<WeeklyFigure> read_figures(core::Session& session, int project, const WeeklyPlan& plan)
+std::vector<WeeklyFigure> read_figures(core::Session& session, const WeeklyPlan& plan)
 {
     const auto& period = plan.period;
     const auto read = [&](const Period& days) {
-        return read_weekly_figures(session, project, days, plan.categories);
+        return read_weekly_figures(session, plan.project.key, days, plan.categories);
     };
     if (plan.report->shape == month_changes)
         return read(period.from_month_before());
-    if (plan.report->shape != year_changes || period.years() == 1)
+    if (plan.report->shape != year_changes)
         return read(period);
     auto figures = read(period.only_year(period.first.year));
     std::ranges::copy(read(period.only_year(period.last.year)), std::back_inserter(figures));
@@ -253,21 +248,48 @@ const WeeklyReport* find_weekly_report(QStringView name)
     return found == reports.end() ? nullptr : &*found;
 }
 
+std::optional<WeeklyPlan> check_weekly_report(core::Office& office, const WeeklyReportRequest& request,
+                                              ReportCheck& check)
+{
+    if (!core::permitted(office, core::Area::weekly_statistics))
+        return {};
+    auto& session = *office.session;
+    const auto project = chosen_project(session, request.project, check);
+    if (!project)
+        return {};
+    if (!request.report)
+        return check.refuse(ReportField::report, u"Please choose a report"_s);
+    auto categories = chosen_categories(session, request);
+    if (const auto fault = too_much(request, categories.size()))
+        return check.refuse(fault->first, fault->second);
+    const auto period = chosen_period(request, office.day_order(), check);
+    if (!period)
+        return {};
+    const bool charts = request.parts == ReportParts::pages && request.report->charts != ReportCharts::none;
+    return WeeklyPlan{.report = request.report,
+                      .project = *project,
+                      .categories = std::move(categories),
+                      .period = *period,
+                      .chart = charts ? request.chart : nullptr,
+                      .day_order = office.day_order()};
+}
+
+std::optional<WeeklyPlan> with_figures(core::Session& session, WeeklyPlan plan, ReportCheck& check)
+{
+    plan.figures = read_figures(session, plan);
+    if (plan.figures.empty())
+        return check.refuse(ReportField::from, u"No figures found for creating a report"_s);
+    const bool changes = plan.report->shape == month_changes || plan.report->shape == year_changes;
+    if (const auto fault = changes ? no_change(plan) : std::nullopt)
+        return check.refuse(fault->first, fault->second);
+    return plan;
+}
+
 std::optional<WeeklyPlan> plan_weekly_report(core::Office& office, const WeeklyReportRequest& request,
                                              ReportCheck& check)
 {
-    auto plan = without_figures(office, request, check);
-    if (!plan)
-        return {};
-    plan->figures = read_figures(*office.session, request.project, *plan);
-    if (plan->figures.empty())
-        return check.refuse(ReportField::from, u"No figures found for creating a report"_s);
-    if (plan->report->shape == month_changes || plan->report->shape == year_changes) {
-        const auto why = no_change(*plan);
-        if (!why.isEmpty())
-            return check.refuse(ReportField::from, why);
-    }
-    return plan;
+    auto plan = check_weekly_report(office, request, check);
+    return plan ? with_figures(*office.session, std::move(*plan), check) : std::nullopt;
 }
 
 bool write_weekly_report(core::Office& office, const WeeklyPlan& plan, pages::Paper paper, core::Progress& progress,

@@ -37,6 +37,9 @@ inline constexpr int most_graphs = 6; ///< Of those by category.
 /// By its name without regard to case; null when there is none.
 [[nodiscard]] const WeeklyReport* find_weekly_report(QStringView name);
 
+/// What becomes of a report: its pages, or its table alone, to which no rule about charts applies.
+enum class ReportParts { pages, table };
+
 /// What the output page asks for.
 struct WeeklyReportRequest
 {
@@ -45,13 +48,14 @@ struct WeeklyReportRequest
     std::vector<int> categories = {}; ///< Keys; printed in the project's order.
     PeriodChoice period = {};
     const pages::ChartStyle* chart = nullptr; ///< Null: without charts.
+    ReportParts parts = ReportParts::pages;
 };
 
 /// All that a report is written from.
 struct WeeklyPlan
 {
     const WeeklyReport* report = nullptr;
-    QString project;
+    Project project;
     std::vector<Category> categories = {};
     Period period = {};
     std::vector<WeeklyFigure> figures = {};   ///< Of the period, for month_changes of the month before it too.
@@ -59,7 +63,14 @@ struct WeeklyPlan
     core::DayOrder day_order = {};
 };
 
-/// Reads the report's figures. Nullopt when it was refused, which the person has been told. Throws core::DatabaseError.
+/// Everything that can be refused before a figure is read; the plan has none yet. Nullopt when the report was refused,
+/// which the person has been told. Throws core::DatabaseError.
+[[nodiscard]] std::optional<WeeklyPlan> check_weekly_report(core::Office& office, const WeeklyReportRequest& request,
+                                                            ReportCheck& check);
+/// The plan with its figures. Nullopt when they make no report, which the person has been told. Throws
+/// core::DatabaseError.
+[[nodiscard]] std::optional<WeeklyPlan> with_figures(core::Session& session, WeeklyPlan plan, ReportCheck& check);
+/// One after the other.
 [[nodiscard]] std::optional<WeeklyPlan> plan_weekly_report(core::Office& office, const WeeklyReportRequest& request,
                                                            ReportCheck& check);
 /// Writes the report into the spool and closes it. False when it was cancelled; the spool then stays open. Throws

@@ -8,9 +8,11 @@
 #include "support/test_church.h"
 
 #include <QDir>
+#include <QDirIterator>
 #include <QMap>
 
 #include <csignal>
+#include <set>
 
 #include <sys/resource.h>
 
@@ -20,7 +22,12 @@ namespace kindrel::test {
 class YesDialogue : public core::Dialogue
 {
 public:
-    void show(const core::Message& message) override { told += message.text + u'\n' + message.more; }
+    void show(const core::Message& message) override
+    {
+        told += message.text + u'\n' + message.more;
+        if (on_show)
+            on_show();
+    }
     bool confirm(const core::Message& message, core::Answer) override
     {
         asked += message.text;
@@ -35,7 +42,7 @@ public:
     void play(const QString&) override {}
 
     QStringList told, asked;
-    std::function<void()> on_confirm;
+    std::function<void()> on_confirm, on_show;
 };
 
 /// Gives up at a certain step; 0: at none.
@@ -53,6 +60,50 @@ public:
 
 private:
     int m_last;
+};
+
+/// Runs through, and notes at which steps files came or went since the one before: work of another kind begins there.
+class PhaseProgress : public core::Progress
+{
+public:
+    explicit PhaseProgress(const QString& folder) : m_folder(folder) {}
+    void begin(const QString&, int steps, const QString&) override { announced = steps; }
+    bool step(const QString&) override
+    {
+        ++taken;
+        QStringList names;
+        for (QDirIterator all(m_folder, QDir::Files, QDirIterator::Subdirectories); all.hasNext();)
+            names += all.next();
+        names.sort();
+        if (names != m_names)
+            m_phases.push_back(taken);
+        m_names = names;
+        return true;
+    }
+    void end() override {}
+    /// Where to give up another such run: around those steps, at the first and the last ones, and here and there.
+    [[nodiscard]] std::set<int> stops() const
+    {
+        constexpr int beside = 2, last_ones = 10, apart = 97;
+        std::set<int> found;
+        for (const int phase : m_phases) {
+            for (int step = phase - beside; step <= phase + beside; ++step)
+                found.insert(std::clamp(step, 1, announced));
+        }
+        for (int step = announced - last_ones; step <= announced; ++step)
+            found.insert(step);
+        for (int step = 1; step <= announced; step += apart)
+            found.insert(step);
+        return found;
+    }
+
+    int announced = 0;
+    int taken = 0;
+
+private:
+    QString m_folder;
+    QStringList m_names;
+    std::vector<int> m_phases;
 };
 
 /// No file of this process may grow beyond `bytes`: like a full disk.
@@ -166,8 +217,10 @@ private:
     static QStringList folders()
     {
         using namespace Qt::StringLiterals;
-        return {u"church1/Portrait/"_s, u"church1/NBook/"_s, u"church1/Roster_history/"_s, u"images/"_s, u"Wardline/"_s,
-                u"letter/"_s,           u"custom/"_s,        u"Directory Setup/"_s};
+        return {u"church1/Portrait/"_s, u"church1/NBook/"_s,  u"church1/Roster_history/"_s,
+                u"images/"_s,           u"Audio/"_s,          u"Wardline/"_s,
+                u"letter/"_s,           u"custom/"_s,         u"plugin letters/"_s,
+                u"plugin reports/"_s,   u"Directory Setup/"_s};
     }
     static QStringList files_of(const QString& word)
     {
@@ -177,9 +230,12 @@ private:
                 u"church1/NBook/F1.fll"_s,
                 u"church1/Roster_history/1.txt"_s,
                 u"images/logo.jpg"_s,
+                u"Audio/chime.wav"_s,
                 u"Wardline/check ö.pdf"_s,
                 u"letter/welcome.ltr"_s,
                 u"custom/own.rpt"_s,
+                u"plugin letters/title.plg"_s,
+                u"plugin reports/title.plg"_s,
                 u"Directory Setup/a.dat"_s};
     }
 };

@@ -87,6 +87,7 @@ INSTANTIATE_TEST_SUITE_P(Engines, MenderAsideTest, testing::Values(EngineKind::s
 namespace {
 
 const QString writing = u"Somebody is writing in the church just now."_s;
+const QString reading_or_writing = u"Somebody is reading or writing in the church just now."_s;
 const QString forbidden = u"This user may not read and write the church's file."_s;
 
 } // namespace
@@ -138,14 +139,14 @@ TEST_P(MenderAsideTest, ADamagedFileIsNotMovedUnderSomebodyWhoReadsOrWritesIt)
     damage();
     {
         const auto writer = somebody_who(u"BEGIN IMMEDIATE;"_s);
-        expect_left_alone(writing);
+        expect_left_alone(reading_or_writing);
     }
     open_to_mend(*place);
     {
         const auto reader = open_sqlite(file());
         auto rows = reader->select(u"SELECT [surname] FROM [tbl_surname];"_s);
         (void)rows.first();
-        expect_left_alone(writing);
+        expect_left_alone(reading_or_writing);
     }
     open_to_mend(*place);
     EXPECT_TRUE(QFile::exists(set_database_aside(*place)));
@@ -213,6 +214,36 @@ TEST_P(MenderAsideTest, ARecoveredFileFillsThePlaceOfAMissingOne)
     EXPECT_EQ(number_of(*place->session, u"SELECT COUNT(*) FROM [tbl_people];"_s), 3);
 }
 
+TEST_P(MenderAsideTest, ARecoveredFileTakesThePlaceOfAnEmptyChurchAndNotOfASoundOne)
+{
+    const auto refusal_of = [&] {
+        try {
+            (void)put_in_place(*place, recovered(), {});
+            return QString();
+        } catch (const FileError& error) {
+            return error.text();
+        }
+    };
+    (void)recover_church(file(), recovered());
+    EXPECT_FALSE(gives_way(*place, false));
+    EXPECT_TRUE(refusal_of().startsWith(u"A recovered file takes the place only of a church file that is damaged"));
+    DataFolder::write(in_church(u"KR10_records.server"_s), "host=127.0.0.1 port=1 dbname=church user=office");
+    EXPECT_FALSE(gives_way(*place, true));
+    EXPECT_EQ(refusal_of(), u"This church lies on a server: there a recovered file cannot take its place."_s);
+    QFile::remove(in_church(u"KR10_records.server"_s));
+
+    place->session.reset();
+    QFile::remove(file());
+    DataFolder::make_church(in_church({})); // As a start does after the damaged file was set aside.
+    const QByteArray empty = DataFolder::read(file());
+    open_to_mend(*place);
+    EXPECT_TRUE(gives_way(*place, false));
+    const auto placement = put_in_place(*place, recovered(), {});
+    EXPECT_EQ(DataFolder::read(placement.aside), empty);
+    EXPECT_TRUE(placement.mending.left.empty()) << told(placement.mending.left);
+    EXPECT_EQ(number_of(*place->session, u"SELECT COUNT(*) FROM [tbl_people];"_s), 3);
+}
+
 TEST_P(MenderAsideTest, ARecoveredFileOnAnotherDiskIsCopied)
 {
     const QTemporaryDir other(u"/var/tmp/kindrel-XXXXXX"_s);
@@ -221,6 +252,12 @@ TEST_P(MenderAsideTest, ARecoveredFileOnAnotherDiskIsCopied)
     damage();
     const QString far = other.filePath(u"recovered.kdl"_s);
     (void)recover_church(file(), far);
+    {
+        const auto writer = somebody_who(u"BEGIN IMMEDIATE;"_s);
+        EXPECT_THROW((void)put_in_place(*place, far, {}), FileError);
+        EXPECT_EQ(QDir(in_church({})).entryList({u"*.unfinished"_s}, QDir::Files), QStringList());
+    }
+    open_to_mend(*place);
     EXPECT_TRUE(put_in_place(*place, far, {}).mending.left.empty());
     EXPECT_EQ(number_of(*place->session, u"SELECT COUNT(*) FROM [tbl_people];"_s), 3);
     EXPECT_TRUE(QFile::exists(far));

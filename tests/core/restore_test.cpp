@@ -89,6 +89,8 @@ TEST_P(RestoreTest, EverythingIsAsItWasAndCanBeTakenBack)
 
     ASSERT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
     EXPECT_EQ(place->state(), old_state);
+    for (const auto& kind : compared_kinds(report->restored.church, present_state(place->office())))
+        EXPECT_EQ(kind.then, kind.now) << kind.words.toStdString();
     EXPECT_EQ(report->restored.file, backup);
     EXPECT_TRUE(place->leftovers().isEmpty()) << place->leftovers().join(u' ').toStdString();
 
@@ -390,17 +392,20 @@ TEST_P(RestoreTest, WithoutTheRightOrOnBookedOutDataNothingIsRestored)
 
 TEST_P(RestoreTest, GivenUpAtAnyStepNothingChanges)
 {
-    for (int last = 1;; last += 41) {
+    PhaseProgress whole(place->church());
+    ASSERT_TRUE(restore_backup(place->office(), {.file = backup}, whole));
+    EXPECT_EQ(whole.taken, whole.announced);
+    place->write_church(u"second"_s);
+    const auto before = place->archives();
+    for (const int last : whole.stops()) {
         StoppingProgress progress(last);
-        const bool restored = restore_backup(place->office(), {.file = backup}, progress).has_value();
+        EXPECT_FALSE(restore_backup(place->office(), {.file = backup}, progress)) << "after step " << last;
         EXPECT_TRUE(progress.ended);
         EXPECT_TRUE(place->leftovers().isEmpty()) << "after step " << last;
-        EXPECT_EQ(place->state(), restored ? old_state : new_state) << "after step " << last;
-        if (restored) {
-            EXPECT_EQ(progress.taken, progress.announced);
-            break;
-        }
+        EXPECT_EQ(place->state(), new_state) << "after step " << last;
+        EXPECT_EQ(place->archives(), before) << "after step " << last;
     }
+    EXPECT_EQ(DataFolder::read(place->church() + u"backups.json"_s).count("\"file\""), before.size());
     EXPECT_TRUE(place->dialogue().told.isEmpty());
 }
 

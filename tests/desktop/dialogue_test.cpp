@@ -180,6 +180,13 @@ TEST_F(DialogueTest, ALongRunIsCancelledOnlyAfterAsking)
         script.expect_confirm(sure, answer, Answer::no);
         EXPECT_EQ(progress.step({}), answer == Answer::no);
     }
+    EXPECT_TRUE(progress.step({})) << "so soon nothing is looked at";
+    now += 1ms;
+    script.expect_confirm(sure, Answer::yes, Answer::no);
+    auto* box = qobject_cast<QProgressDialog*>(QApplication::activeModalWidget());
+    QTest::mouseClick(box->findChild<QPushButton*>(), Qt::LeftButton);
+    EXPECT_FALSE(progress.step(u"What comes now cannot be stopped"_s)) << "a new text lets a wish to stop come first";
+    EXPECT_EQ(box->labelText(), u"What comes now cannot be stopped"_s);
     progress.end();
     EXPECT_EQ(QApplication::activeModalWidget(), nullptr);
 }

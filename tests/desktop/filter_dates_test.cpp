@@ -45,6 +45,26 @@ TEST_F(FilterDatesTest, AnAnniversaryNeedsNoYear)
     type_span(u"1/3"_s, u"31/3"_s);
     press(window(), Qt::Key_Return);
     EXPECT_EQ(dates(), QStringList{march});
+
+    type_span(u"24/12"_s, u"26/12/2020"_s);
+    child<QComboBox>(panel(), u"date_span"_s).setFocus();
+    press(window(), Qt::Key_Home);
+    place.dialogue.expect_box(u"Please enter the year too."_s);
+    press_button(u"add_date"_s);
+    EXPECT_EQ(focus(), u"date_from"_s);
+    choose_kind(u"Groups"_s);
+    EXPECT_EQ(dates(), QStringList{march});
+}
+
+TEST_F(FilterDatesTest, EnterAfterWhatIsNoDateIsAnsweredOnce)
+{
+    choose_kind(u"Birth"_s);
+    child<QLineEdit>(panel(), u"date_from"_s).setFocus();
+    type(window(), u"32/1/1970"_s);
+    place.dialogue.expect_box(u"Incorrect format."_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(focus(), u"date_from"_s);
+    press(window(), Qt::Key_Escape);
 }
 
 TEST_F(FilterDatesTest, ASpanThatIsTypedWholeTakesPartWithoutBeingAdded)
@@ -65,17 +85,27 @@ TEST_F(FilterDatesTest, ASpanThatIsTypedWholeTakesPartWithoutBeingAdded)
     choose_kind(u"Birth"_s);
     choose_kind(u"Groups"_s);
     EXPECT_EQ(dates(), spans) << "It is taken once.";
+
+    press_button(u"clear_filter"_s);
+    choose_kind(u"Birth"_s);
+    type_span(u"1/1/1970"_s, u"31/12/1970"_s);
+    save_as(u"Seventies"_s);
+    EXPECT_EQ(dates(), spans);
+    EXPECT_EQ(kept(u"Seventies"_s), panel().filter());
 }
 
-TEST_F(FilterDatesTest, AHalfTypedSpanIsAskedForBeforeAnybodyIsListed)
+TEST_F(FilterDatesTest, AHalfTypedSpanIsAskedForBeforeAnybodyIsListedOrTheFilterIsKept)
 {
+    save_as(u"Everybody"_s);
     choose_kind(u"Birth"_s);
     child<QLineEdit>(panel(), u"date_from"_s).setFocus();
     type(window(), u"1/1/1970"_s);
-    choose_kind(u"Groups"_s);
-    place.dialogue.expect_box(u"Please enter both dates of the range"_s);
-    press(window(), Qt::Key_Return, Qt::ControlModifier);
-    EXPECT_EQ(focus(), u"date_to"_s);
+    for (const auto& button : {u"show_people"_s, u"save_filter"_s, u"save_filter_as"_s}) {
+        choose_kind(u"Groups"_s);
+        place.dialogue.expect_box(u"Please enter both dates of the range"_s);
+        press_button(button);
+        EXPECT_EQ(focus(), u"date_to"_s);
+    }
     EXPECT_EQ(dates(), QStringList());
 }
 

@@ -3,6 +3,7 @@
 #include "desktop/desktop_fixture.h"
 #include "desktop/people/filter_panel.h"
 #include "people/filter_words.h"
+#include "people/saved_filters.h"
 #include "support/families.h"
 
 #include <QAbstractButton>
@@ -11,6 +12,8 @@
 #include <QListWidget>
 #include <QStackedWidget>
 #include <QTableView>
+
+#include <algorithm>
 
 namespace kindrel::test {
 
@@ -114,6 +117,13 @@ protected:
         for (const auto& criterion : panel().filter().dates)
             texts += people::words_of(criterion, core::DayOrder::day_first);
         return texts;
+    }
+    /// What the church keeps under the name; nothing when that is not there.
+    [[nodiscard]] std::optional<people::Filter> kept(const QString& name)
+    {
+        const auto all = people::saved_filters(*desk().office.session);
+        const auto found = std::ranges::find(all, name, &people::SavedFilter::name);
+        return found == all.end() ? std::nullopt : people::load_filter(desk().office, found->filter_id);
     }
     [[nodiscard]] QComboBox& saved() { return child<QComboBox>(panel(), u"saved_filters"_s); }
 };

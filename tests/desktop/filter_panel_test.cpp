@@ -60,6 +60,10 @@ TEST_F(FilterPanelTest, TheKeysOfTheListWorkInTheLineWhileNothingIsTypedThere)
     type(window(), u"group 2"_s);
     EXPECT_EQ(child<QLineEdit>(*part, u"wanted"_s).text(), u"group 2"_s) << "A blank among letters is a blank.";
     EXPECT_EQ(use(0), QString());
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(use(0), u"include"_s);
+    press(window(), Qt::Key_Enter, Qt::KeypadModifier);
+    EXPECT_EQ(use(0), u"exclude"_s);
 }
 
 TEST_F(FilterPanelTest, TheKindsTellWhereSomethingIsAskedFor)
@@ -117,8 +121,13 @@ TEST_F(FilterPanelTest, SeveralValuesOfAFlexiFieldAreAlternatives)
     press(window(), Qt::Key_Minus);
     EXPECT_EQ(use(1), u"exclude, = Piano or = Violin"_s);
     EXPECT_EQ(text(u"count"_s), u"1 person is found"_s);
+    press_button(u"another_value"_s);
+    child<QTableView>(*part, u"items"_s).setFocus();
     press(window(), Qt::Key_Minus);
     EXPECT_EQ(panel().filter().items, std::vector<FilterItem>());
+    child<QComboBox>(*part, u"value"_s).setFocus();
+    type(window(), u"Drums"_s);
+    EXPECT_EQ(use(1), u"include, = Drums"_s) << "There is none any more to which it could be another.";
 }
 
 TEST_F(FilterPanelTest, TheLastOfSeveralValuesIsEmptiedAndTypedAnew)

@@ -78,8 +78,10 @@ TEST_F(RestorePageTest, WhatWouldBeLostIsMarked)
     (void)back_up();
     open(u"restore"_s);
     EXPECT_EQ(line(u"Families"_s), QStringList({u"2"_s, u"2"_s, QString()}));
+    EXPECT_EQ(line(u"Other records added since"_s), QStringList());
 
     add_a_family();
+    desk().office.session->execute(u"INSERT INTO [tbl_family_date] ([Surname_ID],[family_date_id]) VALUES (900,1);"_s);
     DataFolder::write(portraits + u"2.jpg"_s, "new");
     open(u"main_menu"_s);
     press(window(), Qt::Key_W, Qt::ControlModifier);
@@ -90,6 +92,7 @@ TEST_F(RestorePageTest, WhatWouldBeLostIsMarked)
 
     EXPECT_EQ(line(u"Families"_s), QStringList({u"2"_s, u"3"_s, u"1 fewer"_s}));
     EXPECT_EQ(line(u"Photographs"_s), QStringList({u"1"_s, u"2"_s, u"1 fewer"_s}));
+    EXPECT_EQ(line(u"Other records added since"_s), QStringList({u"0"_s, u"1"_s, u"1 fewer"_s}));
     EXPECT_EQ(line(u"Date"_s),
               QStringList({u"Made 15/05/2024 10:30"_s, u"Changed 20/05/2024"_s, u"Later changes would be lost"_s}));
     EXPECT_EQ(line(u"People"_s), QStringList({u"3"_s, u"3"_s, QString()}));

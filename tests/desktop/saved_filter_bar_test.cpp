@@ -1,10 +1,26 @@
 #include "desktop/filter_panel_fixture.h"
-#include "people/saved_filters.h"
 
 namespace kindrel::test {
 
 class SavedFilterBarTest : public FilterPanelTest
 {
+protected:
+    /// "Choir" is kept for group 1 and stands on the screen; "Zion" asks for ages.
+    void keep_two()
+    {
+        choose_kind(u"Groups"_s);
+        press(window(), Qt::Key_Return);
+        save_as(u"Choir"_s);
+        people::Filter other = panel().filter();
+        other.ages = people::Ages{18, 65};
+        ASSERT_TRUE(people::save_filter(desk().office, u"Zion"_s, other));
+        panel().reload();
+    }
+    void lose(const QString& name)
+    {
+        place.in_database(u"DELETE FROM [tbl_filter_memory] WHERE [filter_name]='%1';"_s.arg(name));
+    }
+    [[nodiscard]] bool naming() { return !child<QLineEdit>(panel(), u"filter_name"_s).isHidden(); }
 };
 
 TEST_F(SavedFilterBarTest, ARecalledFilterStandsInItsFields)
@@ -133,6 +149,98 @@ TEST_F(SavedFilterBarTest, ASavedFilterIsRenamedAndRemoved)
     place.dialogue.expect_confirm(u"Are you sure that you wish to delete the filter 'All'?"_s, core::Answer::yes);
     press_button(u"remove_filter"_s);
     EXPECT_EQ(saved().count(), 1);
+}
+
+TEST_F(SavedFilterBarTest, EitherSaveTakesTheNameThatIsBeingTyped)
+{
+    struct Case
+    {
+        QString asks, takes, name;
+    };
+    for (const auto& [asks, takes, name] : {Case{u"save_filter"_s, u"save_filter"_s, u"Choir"_s},
+                                            Case{u"save_filter_as"_s, u"save_filter"_s, u"Easter"_s},
+                                            Case{u"save_filter_as"_s, u"save_filter_as"_s, u"Lent"_s}}) {
+        choose_kind(u"Groups"_s);
+        press(window(), Qt::Key_Return);
+        press_button(asks);
+        type(window(), name);
+        press_button(takes);
+        EXPECT_EQ(saved().currentText(), name);
+        EXPECT_EQ(kept(name), panel().filter());
+    }
+    EXPECT_NE(kept(u"Choir"_s), kept(u"Easter"_s));
+}
+
+TEST_F(SavedFilterBarTest, WhateverElseIsTurnedToEndsTheNaming)
+{
+    keep_two();
+    const auto type_name = [this] {
+        press_button(u"rename_filter"_s);
+        type(window(), u"Sheep"_s);
+        EXPECT_TRUE(naming());
+    };
+    type_name();
+    place.dialogue.expect_confirm(u"Are you sure that you wish to delete the filter 'Choir'?"_s, core::Answer::no);
+    press_button(u"remove_filter"_s);
+    EXPECT_FALSE(naming());
+    type_name();
+    running->open_area(u"search"_s);
+    settle();
+    open();
+    EXPECT_FALSE(naming());
+    type_name();
+    press_button(u"clear_filter"_s);
+    EXPECT_FALSE(naming());
+    EXPECT_EQ(saved().findText(u"Sheep"_s), -1);
+}
+
+TEST_F(SavedFilterBarTest, AFilterThatCannotBeRecalledLeavesTheOneOfTheScreenInItsPlace)
+{
+    keep_two();
+    const auto shown = panel().filter();
+    const auto fail = [&](const QString& words) {
+        place.dialogue.expect_box(words);
+        saved().setFocus();
+        press(window(), Qt::Key_Down);
+        EXPECT_EQ(saved().currentText(), u"Choir"_s) << words.toStdString();
+        EXPECT_EQ(panel().filter(), shown);
+    };
+    desk().office.rights.set(core::Area::birth_dates, false);
+    fail(u"Your password does not give access to \"Birth Dates Access\""_s);
+    place.in_database(u"ALTER TABLE [tbl_filter_memory] RENAME TO [away];"_s);
+    fail(u"The database could not be read or written."_s);
+    place.in_database(u"ALTER TABLE [away] RENAME TO [tbl_filter_memory];"_s);
+    press_button(u"save_filter"_s);
+    desk().office.rights = core::Rights::all();
+    EXPECT_NE(kept(u"Zion"_s), shown);
+    lose(u"Zion"_s);
+    fail(u"Unable to use this filter as another user has removed it"_s);
+    EXPECT_EQ(saved().findText(u"Zion"_s), -1);
+}
+
+TEST_F(SavedFilterBarTest, AFilterThatAnotherUserRemovedStandsThereUnderNoName)
+{
+    for (const bool saving : {false, true}) {
+        keep_two();
+        saved().setFocus();
+        press(window(), Qt::Key_Down);
+        const auto shown = panel().filter();
+        lose(u"Zion"_s);
+        if (saving) {
+            place.dialogue.expect_box(u"Unable to save this filter as another user has removed or renamed it"_s);
+            press_button(u"save_filter"_s);
+        } else {
+            panel().reload();
+        }
+        EXPECT_EQ(saved().currentText(), u"(not saved)"_s);
+        saved().setFocus();
+        press(window(), Qt::Key_Down);
+        EXPECT_EQ(saved().currentText(), u"Choir"_s);
+        press(window(), Qt::Key_Up);
+        EXPECT_EQ(panel().filter(), shown);
+        lose(u"Choir"_s);
+        press_button(u"clear_filter"_s);
+    }
 }
 
 } // namespace kindrel::test

@@ -2,7 +2,9 @@
 #include "desktop/output/preview_window.h"
 #include "desktop/people/editor_page.h"
 #include "desktop/people/family_card.h"
+#include "desktop/shell/note_bar.h"
 #include "desktop/shell/page.h"
+#include "people/filter.h"
 #include "support/families.h"
 
 #include <QCheckBox>
@@ -69,6 +71,17 @@ protected:
             texts += view.model()->index(row, column).data().toString();
         return texts;
     }
+    /// Whom Tagging lists afterwards.
+    QStringList send_to_tagging(const QString& part)
+    {
+        running->open_area(u"search"_s);
+        settle();
+        choose_part(part);
+        child<QPushButton>(page(), u"to_tagging"_s).click();
+        settle();
+        return tagged();
+    }
+    [[nodiscard]] QStringList tagged() { return shown(child<QTableView>(page(), u"working_people"_s)); }
     void choose_part(const QString& name)
     {
         auto& parts = child<QListWidget>(page(), u"parts"_s);
@@ -258,6 +271,83 @@ TEST_F(SearchPageTest, APartWithoutItsRightIsRefusedAndListsNobody)
     choose_part(u"Birth Date"_s);
     EXPECT_EQ(entries().model()->rowCount(), 0);
     EXPECT_EQ(label(u"data_count"_s), QString());
+}
+
+TEST_F(SearchPageTest, ThoseWhoAreListedBecomeTheListOfTaggingOrJoinTheOneThatIsThere)
+{
+    open_data_search();
+    EXPECT_EQ(send_to_tagging(u"Preferred Given Name"_s), QStringList{u"Zora"_s});
+    EXPECT_EQ(label(u"state"_s), u"1 person: People with an entry in Preferred Given Name"_s);
+
+    EXPECT_EQ(send_to_tagging(u"Title"_s), (QStringList{u"Ann"_s, u"Zora"_s}));
+    EXPECT_EQ(window().page()->note().text(), u"1 person added to the list; on it already: 1."_s);
+    child<QPushButton>(page(), u"offer"_s).click();
+    EXPECT_EQ(tagged(), QStringList{u"Zora"_s});
+    EXPECT_EQ(send_to_tagging(u"Preferred Given Name"_s), QStringList{u"Zora"_s});
+    EXPECT_EQ(window().page()->note().text(), u"All of them are on the list already."_s);
+    child<QPushButton>(page(), u"as_filtered"_s).click();
+    EXPECT_EQ(tagged(), (QStringList{u"Una"_s, u"Ann"_s, u"Ben"_s, u"Zora"_s}));
+}
+
+TEST_F(SearchPageTest, TheDeceasedAreNotSentToTagging)
+{
+    open_data_search();
+    const auto dies = [&](const QString& name) {
+        desk().office.session->execute(u"UPDATE [tbl_people] SET [Decease]=? WHERE [Name]=?;"_s, true, name);
+    };
+    dies(u"Ann"_s);
+    EXPECT_EQ(send_to_tagging(u"Title"_s), QStringList{u"Zora"_s});
+    EXPECT_EQ(label(u"state"_s), u"1 person: People with an entry in Title, without the deceased"_s);
+    dies(u"Zora"_s);
+    place.dialogue.expect_box(u"Nobody who is listed is still alive"_s);
+    running->open_area(u"search"_s);
+    settle();
+    choose_part(u"Title"_s);
+    child<QPushButton>(page(), u"to_tagging"_s).click();
+    settle();
+    EXPECT_EQ(window().page()->objectName(), u"Search"_s);
+}
+
+TEST_F(SearchPageTest, AListFromDataSearchStaysWhileTheFilterOfTaggingDoesAndGivesWayToAChangedOne)
+{
+    open_data_search();
+    (void)send_to_tagging(u"Title"_s);
+    for (const bool changed : {false, true}) {
+        child<QPushButton>(page(), u"filter"_s).click();
+        if (changed)
+            child<QAbstractButton>(page(), u"contact"_s).click();
+        child<QPushButton>(page(), u"sort"_s).click();
+        EXPECT_EQ(tagged().size(), changed ? 4 : 2);
+    }
+}
+
+TEST_F(SearchPageTest, NobodyJoinsTheListOfTaggingWhileItsFilterLacksSomething)
+{
+    open_data_search();
+    running->open_area(u"tagging"_s);
+    settle();
+    auto& status = child<QComboBox>(page(), u"file_status"_s);
+    status.setFocus();
+    press(window(), Qt::Key_Home);
+    place.dialogue.expect_box(people::no_families_chosen.toString());
+    (void)send_to_tagging(u"Title"_s);
+    EXPECT_TRUE(child<QPushButton>(page(), u"filter"_s).isChecked());
+
+    press(window(), Qt::Key_Down);
+    child<QPushButton>(page(), u"sort"_s).click();
+    EXPECT_EQ(tagged().size(), 5) << "All families, as the filter says.";
+}
+
+TEST_F(SearchPageTest, OnlyWhoMayTagSendsPeopleToTaggingAndOnlyOnceSomebodyIsListed)
+{
+    open_data_search();
+    const auto& button = child<QPushButton>(page(), u"to_tagging"_s);
+    EXPECT_FALSE(button.isEnabled());
+    choose_part(u"Title"_s);
+    EXPECT_TRUE(button.isEnabled());
+    desk().office.rights.set(core::Area::tagging, false);
+    choose_part(u"Title"_s);
+    EXPECT_FALSE(button.isEnabled());
 }
 
 TEST_F(SearchPageTest, HiddenEntriesGoNeitherToPaperNorIntoFiles)

@@ -86,6 +86,12 @@ protected:
         type(window(), item);
         settle();
     }
+    void type_half_a_date(const QString& field)
+    {
+        child<QWidget>(bench(), field).setFocus();
+        type(window(), u"1/2"_s);
+        place.dialogue.expect_box(u"Incorrect format."_s); // On the way out of it.
+    }
     [[nodiscard]] int rows(const QString& table)
     {
         auto found = desk().office.session->select(u"SELECT COUNT(*) FROM [%1];"_s.arg(table));
@@ -289,6 +295,21 @@ TEST_F(TaggingPageTest, ADateIsGivenOnlyOnceItIsTypedAndTellsWhoseItReplaces)
     place.dialogue.expect_box(done,
                               u"3 people get it in place of another value or mark, 1 in booked out families skipped"_s);
     push(u"btn_tag_all"_s);
+}
+
+TEST_F(TaggingPageTest, AHalfTypedDateThatIsOutOfSightHoldsNothingUp)
+{
+    push(u"sort"_s);
+    choose(u"orders"_s, birth_date);
+    choose(u"search"_s, 3);
+    type_half_a_date(u"date_from"_s);
+    choose(u"search"_s, 0);
+    choose_second(3, u"2"_s);
+    type_half_a_date(u"date"_s);
+    choose_second(1, u"group 2"_s);
+    place.dialogue.expect_box(done);
+    push(u"btn_tag_all"_s);
+    EXPECT_EQ(rows(u"tbl_group"_s), 3);
 }
 
 TEST_F(TaggingPageTest, SomebodyIsFoundAndListedByTheirOwnSurname)

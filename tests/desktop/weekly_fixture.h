@@ -19,11 +19,7 @@ protected:
         begin();
         place.in_database(QStringLiteral("INSERT INTO [tbl_weekly_project] ([weekly_project_id],[weekly_project],"
                                          "[position]) VALUES (1,'Sunday',1);"));
-        for (int key = 1; key <= attendance + money; ++key)
-            place.in_database(QStringLiteral("INSERT INTO [tbl_weekly_group] ([group_id],[group],[position],"
-                                             "[group_type],[weekly_project_id]) VALUES (%1,'Category %1',%1,%2,1);")
-                                  .arg(key)
-                                  .arg(key <= attendance ? 1 : 2));
+        set_categories(attendance, money);
         for (const auto* row : {"1,'2024-04-28',1", "2,'2024-05-05',1"})
             place.in_database(QStringLiteral("INSERT INTO [tbl_weekly_date] ([weekly_date_id],[weekly_date],"
                                              "[weekly_project_id]) VALUES (%1);")
@@ -33,6 +29,16 @@ protected:
         (void)session().allocate(core::Entity::weekly_project, 1);
         (void)session().allocate(core::Entity::weekly_group, attendance + money);
         (void)session().allocate(core::Entity::weekly_date, 2);
+    }
+    /// In place of those that there are.
+    void set_categories(int attendance, int money)
+    {
+        place.in_database(QStringLiteral("DELETE FROM [tbl_weekly_group];"));
+        for (int key = 1; key <= attendance + money; ++key)
+            place.in_database(QStringLiteral("INSERT INTO [tbl_weekly_group] ([group_id],[group],[position],"
+                                             "[group_type],[weekly_project_id]) VALUES (%1,'Category %1',%1,%2,1);")
+                                  .arg(key)
+                                  .arg(key <= attendance ? 1 : 2));
     }
     [[nodiscard]] core::Session& session() { return *desk().office.session; }
     void open_page()

@@ -128,6 +128,24 @@ TEST_F(WeeklyOutputTest, UnsavedFiguresAreOfferedToBeSavedBeforeAReport)
     }
 }
 
+TEST_F(WeeklyOutputTest, AReportThatIsRefusedAsksNothingAboutUnsavedFiguresBeforeItWouldReadThemAndRemarksOnNone)
+{
+    start();
+    open_newest();
+    enter(u"130"_s);
+    turn_to_output(month_totals);
+    combo(u"year"_s).setCurrentText(u"207"_s);
+    place.dialogue.expect_box(u"Incorrect format for the analysis year, eg. '2007'"_s);
+    run();
+    combo(u"year"_s).setCurrentText(u"2007"_s);
+    place.dialogue.expect_confirm_or_cancel(
+        u"The figures of 05/05/2024 are not saved, do you wish to save them before the report is made?"_s, false);
+    place.dialogue.expect_box(u"No figures found for creating a report"_s);
+    run();
+    EXPECT_TRUE(previews().empty());
+    EXPECT_EQ(window().page()->note().text(), QString());
+}
+
 TEST_F(WeeklyOutputTest, AYearTurnsByOneUnderTheKeysAndUnderTheWheelOnceTheCursorIsInIt)
 {
     start();
@@ -159,6 +177,7 @@ TEST_F(WeeklyOutputTest, ARefusalOpensNoPreviewAndPutsTheCursorIntoWhatIsToBeMen
     open_output(totals);
     for (const auto& [report, field, typed, refusal] :
          {Case{totals, u"from"_s, u"05/03/XXXX"_s, u"Please enter the year too."_s},
+          Case{totals, u"to"_s, u"05/03"_s, u"Please enter the year too."_s},
           Case{totals, u"to"_s, u"01/01/1999"_s,
                u"The date to end the search from is before the date to begin the search from"_s},
           Case{month_totals, u"year"_s, u"207"_s, u"Incorrect format for the analysis year, eg. '2007'"_s},
@@ -195,43 +214,81 @@ TEST_F(WeeklyOutputTest, AComparisonBeginsWithTheLastTwoYearsWhateverTheOtherRep
     EXPECT_EQ(combo(u"from_year"_s).currentText().toInt(), this_year() - 1);
     reports().setCurrentRow(year_totals);
     EXPECT_EQ(combo(u"from_year"_s).currentText().toInt(), this_year() - 4);
-    combo(u"from_year"_s).setCurrentText(u"2020"_s);
+    combo(u"from_year"_s).setCurrentText(u"2019"_s);
     run();
     EXPECT_EQ(previews().size(), 1);
 
+    place.clock.set(desk().office.clock.today().addYears(1));
     begin_again();
     open_output(comparison);
     EXPECT_EQ(combo(u"from_year"_s).currentText().toInt(), this_year() - 1);
+    EXPECT_EQ(combo(u"to_year"_s).currentText().toInt(), this_year());
     reports().setCurrentRow(year_totals);
-    EXPECT_EQ(combo(u"from_year"_s).currentText(), u"2020"_s);
+    EXPECT_EQ(combo(u"from_year"_s).currentText(), u"2019"_s);
+    EXPECT_EQ(combo(u"to_year"_s).currentText().toInt(), this_year());
 }
 
-TEST_F(WeeklyOutputTest, AReportUpToTodayIsOneUpToTodayTheNextTimeToo)
+TEST_F(WeeklyOutputTest, AReportOnTheYearSoFarIsOneOnTheYearSoFarTheNextTimeToo)
 {
     start();
     open_output(totals);
     run();
     EXPECT_EQ(previews().size(), 1);
-    const QDate later = desk().office.clock.today().addDays(7);
+    const QDate later = desk().office.clock.today().addYears(1).addDays(7);
     place.clock.set(later);
     begin_again();
     open_output(totals);
+    EXPECT_EQ(child<QLineEdit>(page(), u"from"_s).text(), core::Date({later.year(), 1, 1}).shown());
     EXPECT_EQ(child<QLineEdit>(page(), u"to"_s).text(), core::Date::from(later).shown());
+    reports().setCurrentRow(month_totals);
+    EXPECT_EQ(combo(u"year"_s).currentText().toInt(), later.year());
+}
+
+TEST_F(WeeklyOutputTest, ARefusalOverCategoriesPutsTheCursorIntoTheListThatCanMendIt)
+{
+    struct Case
+    {
+        int attendance, money;
+        QString cleared, refusal, in_focus;
+    };
+    const auto too_many = u"For the records data report you are only able to select a maximum amount of 9 categories"_s;
+    const auto none = u"Please select either a financial or attendance item"_s;
+    start();
+    open_page();
+    for (const auto& one :
+         {Case{0, 10, u"A_att_none"_s, too_many, u"A_fin"_s}, Case{0, 2, u"A_fin_none"_s, none, u"A_fin"_s},
+          Case{1, 10, u"A_att_none"_s, too_many, u"A_fin"_s}, Case{2, 0, u"A_att_none"_s, none, u"A_att"_s},
+          Case{10, 1, u"A_fin_none"_s, too_many, u"A_att"_s}}) {
+        set_categories(one.attendance, one.money);
+        act(Qt::Key_PageUp, Qt::ControlModifier);
+        turn_to_output(totals);
+        for (const auto& button : {u"A_att_all"_s, u"A_fin_all"_s, one.cleared})
+            child<QAbstractButton>(page(), button).click();
+        place.dialogue.expect_box(one.refusal);
+        run();
+        EXPECT_EQ(in_focus(), one.in_focus) << one.attendance << " and " << one.money;
+    }
 }
 
 TEST_F(WeeklyOutputTest, TheChosenReportIsKeptAsText)
 {
     start(1, 1);
     open_output(month_totals);
-    const QString file = place.data.drive() + u"report.csv"_s;
-    place.dialogue.expect_file(u"Save this list"_s, file);
-    for (QAction* action : window().page()->actions())
-        if (action->text() == u"Save as CSV")
-            action->trigger();
-    EXPECT_EQ(DataFolder::read(file),
+    const auto saved = [this] {
+        const QString file = place.data.drive() + u"report.csv"_s;
+        place.dialogue.expect_file(u"Save this list"_s, file);
+        for (QAction* action : window().page()->actions())
+            if (action->text() == u"Save as CSV")
+                action->trigger();
+        return DataFolder::read(file);
+    };
+    EXPECT_EQ(saved(),
               "\xEF\xBB\xBF"
               "Category,January,February,March,April,May,June,July,August,September,October,November,December,Year\r\n"
               "Category 1,,,,,120,,,,,,,,120\r\nCategory 2 ($),,,,,,,,,,,,,\r\n");
+    reports().setCurrentRow(analysis);
+    combo(u"chart"_s).setCurrentText(u"No chart"_s);
+    EXPECT_TRUE(saved().contains("\r\n05/05/2024,120,\r\n")) << "text needs no chart";
 }
 
 } // namespace kindrel::test

@@ -252,6 +252,7 @@ TEST_F(WeeklyPageTest, ARefusedDateStaysSelectedInItsField)
     for (const auto& [typed, refusal] :
          {std::pair{u"5/5/24"_s, u"This date has already been used. Please enter another date."_s},
           std::pair{u"05/03/XXXX"_s, u"Please enter the year too."_s},
+          std::pair{u"05/03"_s, u"Please enter the year too."_s},
           std::pair{u"31/2/24"_s, core::bad_date_message(core::DayOrder::day_first).text}}) {
         field.clear();
         place.dialogue.expect_box(refusal);
@@ -282,8 +283,10 @@ TEST_F(WeeklyPageTest, AnotherDayForADateIsAskedForUntilItCanBeTaken)
     open_page();
     auto& button = child<QAbstractButton>(page(), u"btn_edit"_s);
     button.setFocus();
-    place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"05/03/XXXX"_s);
-    place.dialogue.expect_box(u"Please enter the year too."_s);
+    for (const auto& without_year : {u"05/03/XXXX"_s, u"5/3"_s}) {
+        place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, without_year);
+        place.dialogue.expect_box(u"Please enter the year too."_s);
+    }
     place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"31/2/24"_s);
     place.dialogue.expect_box(core::bad_date_message(core::DayOrder::day_first).text);
     place.dialogue.expect_text(u"New date in place of 05/05/2024"_s, u"28/04/2024"_s);

@@ -136,8 +136,8 @@ TEST_P(ListPlanTest, WhatIsNeededMayBeTheFamilysOrTheOwnAndHiddenOnesDoNotCount)
 
 TEST_P(ListPlanTest, WhoIsAddedStandsInOrderOrLastWhereAStepLeavesThemOut)
 {
-    people::add_by_hand(plan, member(u"Cy"_s));
-    people::add_by_hand(plan, member(u"Ann"_s));
+    people::add_by_hand(plan, {member(u"Cy"_s)});
+    people::add_by_hand(plan, {member(u"Ann"_s)});
     EXPECT_EQ(made(), u"ABCDE");
     plan.range.first_letter = u"M"_s;
     EXPECT_EQ(made(), u"DECA");
@@ -149,10 +149,23 @@ TEST_P(ListPlanTest, WhoIsStruckStaysOffUntilAddedAgain)
     people::strike_by_hand(plan, ben.person_id);
     plan.range.last = 2;
     EXPECT_EQ(made(), u"AD");
-    people::add_by_hand(plan, ben);
+    people::add_by_hand(plan, {ben});
     EXPECT_EQ(made(), u"AB");
     people::strike_by_hand(plan, ben.person_id);
     EXPECT_EQ(made(), u"AD");
+}
+
+TEST_P(ListPlanTest, PeopleFoundElsewhereStandInPlaceOfTheFiltersAndAreOrderedAndNarrowedLikeThose)
+{
+    plan.found = {{member(u"Eve"_s), member(u"Cy"_s), member(u"Ann"_s)}, u"People with a title"_s};
+    EXPECT_EQ(made(), u"ACE");
+    people::strike_by_hand(plan, member(u"Cy"_s).person_id);
+    people::add_by_hand(plan, {member(u"Di"_s), member(u"Ann"_s), member(u"Di"_s)});
+    EXPECT_EQ(made(), u"ADE");
+    plan.needs.address = true;
+    EXPECT_EQ(made(), u"AD");
+    EXPECT_EQ(people::make_list(office(), plan).list.criteria,
+              u"People with a title; with an address; 2 added and 1 struck by hand");
 }
 
 TEST_P(ListPlanTest, TheCriteriaTellTheWholePlan)
@@ -160,7 +173,7 @@ TEST_P(ListPlanTest, TheCriteriaTellTheWholePlan)
     plan.sort.by = people::SortBy::individual;
     plan.range = {.first_letter = u"A"_s, .last_letter = u"M"_s};
     plan.needs.address = true;
-    people::add_by_hand(plan, member(u"Cy"_s));
+    people::add_by_hand(plan, {member(u"Cy"_s)});
     people::strike_by_hand(plan, member(u"Ann"_s).person_id);
     const QString words = people::make_list(office(), plan).list.criteria;
     EXPECT_TRUE(words.endsWith(u"; by Individual; with an address; surnames from A to M; 1 added and 1 struck by hand"))

@@ -160,13 +160,15 @@ TEST_P(SavedFiltersTest, ASavedFilterIsReplacedUnderItsNameWithoutAQuestion)
 {
     const Filter old{.families = FamilyList::active}, fresh{.families = FamilyList::archive};
     const int key = save_filter(office(), u"Choir"_s, old).value();
-    EXPECT_TRUE(replace_filter(office(), key, fresh));
+    EXPECT_TRUE(replace_filter(office(), {key, u"Choir"_s}, fresh));
     EXPECT_EQ(load_filter(office(), key), fresh);
     EXPECT_EQ(names(), QStringList{u"Choir"_s});
 
     session().execute(u"DELETE FROM [tbl_filter_memory];"_s);
-    dialogue().expect_box(u"Unable to save this filter as another user has removed it"_s);
-    EXPECT_FALSE(replace_filter(office(), key, old));
+    ASSERT_EQ(save_filter(office(), u"Easter"_s, fresh), key); // Another filter under the same key.
+    dialogue().expect_box(u"Unable to save this filter as another user has removed or renamed it"_s);
+    EXPECT_FALSE(replace_filter(office(), {key, u"Choir"_s}, old));
+    EXPECT_EQ(load_filter(office(), key), fresh);
 }
 
 } // namespace kindrel::test

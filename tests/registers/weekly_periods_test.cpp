@@ -1,3 +1,4 @@
+#include "registers/day_refusal.h"
 #include "registers/weekly_periods.h"
 
 #include "support/scripted_dialogue.h"
@@ -102,6 +103,29 @@ TEST(WeeklyPeriodsTest, WhatMakesNoPeriodIsRefusedInWords)
         registers::ReportCheck check{dialogue};
         EXPECT_FALSE(read_period(one.choice, core::DayOrder::day_first, check)) << one.words.toStdString();
         EXPECT_EQ(check.guilty, one.guilty) << one.words.toStdString();
+    }
+}
+
+TEST(WeeklyPeriodsTest, ADayAndMonthAloneAreToldToLackTheirYear)
+{
+    using enum core::DayOrder;
+    struct Case
+    {
+        QString typed;
+        core::DayOrder order;
+        bool lacks_year;
+    };
+    const std::vector<Case> cases{
+        {u"05/03"_s, day_first, true},      {u" 5/3 "_s, day_first, true},    {u"05/03/"_s, day_first, true},
+        {u"29/2"_s, day_first, true},       {u"31/12"_s, day_first, true},    {u"31/12"_s, month_first, false},
+        {u"05/03/xxxx"_s, day_first, true}, {u"31/02"_s, day_first, false},   {u"05/03/24x"_s, day_first, false},
+        {u"March"_s, day_first, false},     {u"31/2/24"_s, day_first, false}, {{}, day_first, false},
+    };
+    for (const auto& [typed, order, lacks_year] : cases) {
+        const auto message = registers::day_refusal(typed, order);
+        EXPECT_EQ(message.text, lacks_year ? u"Please enter the year too."_s : bad_date_message(order).text)
+            << typed.toStdString();
+        EXPECT_EQ(message.more, lacks_year ? QString() : bad_date_message(order).more) << typed.toStdString();
     }
 }
 

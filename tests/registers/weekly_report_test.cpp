@@ -297,6 +297,22 @@ TEST_F(WeeklyReportTest, SixGraphsAreTheMostOfAMonthlyReport)
         EXPECT_EQ(texts().count(u"G%1"_s.arg(key)), 2) << "in the table and above its chart";
 }
 
+TEST_F(WeeklyReportTest, ATableAloneIsNeverRefusedBecauseOfCharts)
+{
+    const auto categories = many_categories(7);
+    for (const auto& [report, style] :
+         {std::pair{u"weekly_table_report"_s, "3D Bar"}, {u"weekly_analysis_report"_s, ""}}) {
+        auto asked = request(report);
+        asked.categories = categories;
+        asked.chart = pages::find_chart_style(QString::fromLatin1(style));
+        asked.parts = registers::ReportParts::table;
+        registers::ReportCheck check{desk.dialogue};
+        const auto plan = plan_weekly_report(desk.office, asked, check);
+        ASSERT_TRUE(plan) << report.toStdString();
+        EXPECT_EQ(plan->chart, nullptr);
+    }
+}
+
 TEST_F(WeeklyReportTest, TheFirstMonthIsComparedWithTheOneBeforeThePeriod)
 {
     figures.add({{{2007, 1, 7}, 1, 33}});
@@ -347,27 +363,31 @@ TEST_F(WeeklyReportTest, AComparisonLooksAtItsTwoYearsAlone)
 TEST_F(WeeklyReportTest, ATableOfChangesWithoutAChangeIsRefusedNamingTheYearWithoutFigures)
 {
     figures.add({{{2009, 1, 4}, 2, 34}, {{2009, 3, 1}, 2, 34}});
+    using registers::ReportField;
     struct Case
     {
         QString report, from, to, words;
-        std::vector<int> categories = {1, 2, 3};
+        ReportField guilty = ReportField::from;
     };
-    for (const auto& [report, from, to, words, categories] :
+    for (const auto& one :
          {Case{u"Yearly_variance_report"_s, u"2003"_s, u"2007"_s,
                u"There are no figures of 2003 to compare with those of 2007."_s},
           Case{u"Yearly_variance_report"_s, u"2007"_s, u"2011"_s,
-               u"There are no figures of 2011 to compare with those of 2007."_s},
+               u"There are no figures of 2011 to compare with those of 2007."_s, ReportField::to},
+          Case{u"Yearly_variance_report"_s, u"2007"_s, u"2007"_s, u"Please enter two different years to compare"_s,
+               ReportField::to},
+          Case{u"Yearly_variance_report"_s, u"2003"_s, u"2003"_s, u"Please enter two different years to compare"_s,
+               ReportField::to},
           Case{u"Yearly_variance_report"_s, u"2007"_s, u"2009"_s,
                u"None of the chosen categories has figures of both 2007 and 2009."_s},
           Case{u"weekly_table_variance_report"_s,
                u"2009"_s,
                {},
                u"No month of the period and the month before it both have figures of the chosen categories."_s}}) {
-        auto asked = request(report);
-        asked.categories = categories;
-        asked.period.year = from;
-        asked.period.to_year = to;
-        refused(asked, words, registers::ReportField::from);
+        auto asked = request(one.report);
+        asked.period.year = one.from;
+        asked.period.to_year = one.to;
+        refused(asked, one.words, one.guilty);
     }
 }
 
@@ -419,6 +439,21 @@ TEST_F(WeeklyReportTest, TheLargestFiguresAndTheWordsOfHeadingsStandWhole)
         EXPECT_GE(all.count(u"$5199948.00"_s), 9) << all.join(u'|').toStdString();
         EXPECT_TRUE(all.contains(u"Thanksgiving"_s) || all.contains(u"Thanksgiving 100 ($)"_s));
     }
+}
+
+TEST_F(WeeklyReportTest, AHyphenatedNameBreaksBehindItsHyphensInsteadOfShrinkingTheTable)
+{
+    const auto height_of_figures = [this](int key, const QString& name) {
+        figures.category(key, name, attendance);
+        figures.add({{{2007, 3, 4}, key, 777}});
+        auto asked = request(u"weekly_total_report"_s);
+        asked.categories = {1, 2, 3, key};
+        EXPECT_TRUE(run(asked));
+        return pages::find(spool->page(1), u"777"_s).at(0).where.height();
+    };
+    const auto usual = height_of_figures(100, u"Mothers and Toddlers Fellowship Afternoon"_s);
+    EXPECT_EQ(height_of_figures(101, u"Mothers-and-Toddlers-Fellowship-Afternoon"_s), usual);
+    EXPECT_LT(height_of_figures(102, u"MothersandToddlersFellowshipAfternoon"_s), usual);
 }
 
 TEST_F(WeeklyReportTest, OfAProjectsCategoriesOnlyTheChosenOnesPrint)

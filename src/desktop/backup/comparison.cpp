@@ -47,15 +47,22 @@ ComparedLine age_line(const core::BackupContents& backup, const core::ChurchSumm
 }
 
 /// Files of a folder that is the church's own go with it; where churches share a folder they are put in one by one.
-ComparedLine part_line(const core::Office& office, const core::BackupPart& part, const core::PartContents* then)
+ComparedLine part_line(const core::BackupPart& part, const core::PartContents* then, qint64 now)
 {
     const QString words = QString::fromUtf16(part.words);
-    const qint64 now = core::files_within(office.paths.folder(part.folder)).size();
     if (!then)
         return {words, u"–"_s, number_words(now), stays};
     if (!part.shared)
         return counts(words, then->files, now);
     return {words, number_words(then->files), number_words(now), then->files > 0 ? one_by_one : QString()};
+}
+
+Present present_of(const core::Office& office)
+{
+    Present present{core::present_state(office), {}};
+    for (const core::BackupPart& part : core::backup_parts())
+        present.files.push_back(core::files_within(office.paths.folder(part.folder)).size());
+    return present;
 }
 
 bool says_something(const ComparedLine& line)
@@ -65,15 +72,24 @@ bool says_something(const ComparedLine& line)
 
 } // namespace
 
-std::vector<ComparedLine> compare(const core::Office& office, const core::BackupContents& backup)
+const Present& PresentState::now()
 {
-    const core::ChurchSummary present = core::present_state(office);
-    std::vector<ComparedLine> lines{church_line(backup.church, present), age_line(backup, present, office.day_order())};
-    for (const auto& kind : core::compared_kinds(backup.church, present))
+    const qint64 mark = m_office.session->change_mark();
+    if (!m_present || m_change_mark != mark)
+        m_present = present_of(m_office);
+    m_change_mark = mark;
+    return *m_present;
+}
+
+std::vector<ComparedLine> compare(const Present& present, const core::BackupContents& backup, core::DayOrder order)
+{
+    std::vector<ComparedLine> lines{church_line(backup.church, present.church),
+                                    age_line(backup, present.church, order)};
+    for (const auto& kind : core::compared_kinds(backup.church, present.church))
         lines.push_back(counts(kind.words, kind.then, kind.now));
-    for (const core::BackupPart& part : core::backup_parts()) {
+    for (auto now = present.files.begin(); const core::BackupPart& part : core::backup_parts()) {
         const auto found = std::ranges::find(backup.parts, QString::fromUtf16(part.words), &core::PartContents::words);
-        lines.push_back(part_line(office, part, found == backup.parts.end() ? nullptr : &*found));
+        lines.push_back(part_line(part, found == backup.parts.end() ? nullptr : &*found, *now++));
     }
     std::erase_if(lines, [](const ComparedLine& line) { return !says_something(line); });
     return lines;

@@ -1,6 +1,5 @@
 #include "desktop/backup/restore_page.h"
 
-#include "core/backup.h"
 #include "desktop/backup/backup_list.h"
 #include "desktop/backup/backup_words.h"
 #include "desktop/backup/comparison_table.h"
@@ -49,7 +48,8 @@ RestorePage* RestorePage::open(Desk& desk)
 RestorePage::RestorePage(Desk& desk, core::AreaEntry entry)
     : Page(u"Restore Data"_s), m_desk(desk), m_entry(std::move(entry)), m_known(new BackupList), m_file(new QLineEdit),
       m_password_row(make_password()), m_verdict(new Chip), m_comparison(new ComparisonTable),
-      m_shared(new QCheckBox(u"&Settings, pictures, letters and documents as well, which all churches share"_s))
+      m_shared(new QCheckBox(u"&Settings, pictures, letters and documents as well, which all churches share"_s)),
+      m_present(desk.office)
 {
     setObjectName(u"Restore"_s);
     auto* content = new QWidget;
@@ -152,6 +152,7 @@ QBoxLayout* RestorePage::make_contents()
 
 void RestorePage::entered()
 {
+    m_present.forget();
     show_known();
     find();
 }
@@ -212,7 +213,7 @@ void RestorePage::look_inside()
     note().clear();
     try {
         const auto contents = core::read_backup(request().file, m_password->text());
-        auto lines = compare(m_desk.office, contents);
+        auto lines = compare(m_present.now(), contents, m_desk.office.day_order());
         const bool loss = std::ranges::any_of(lines, &ComparedLine::loss);
         m_verdict->set(loss ? u"Marked lines would be lost"_s : QString(), State::error);
         m_comparison->show_lines(std::move(lines));

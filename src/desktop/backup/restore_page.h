@@ -2,6 +2,7 @@
 
 #include "core/entry.h"
 #include "core/restore.h"
+#include "desktop/backup/comparison.h"
 #include "desktop/shell/desk.h"
 #include "desktop/shell/page.h"
 
@@ -61,6 +62,7 @@ private:
     Chip* m_verdict;
     ComparisonTable* m_comparison;
     QCheckBox* m_shared;
+    PresentState m_present;
 };
 
 } // namespace kindrel::desktop

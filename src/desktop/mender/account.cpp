@@ -53,6 +53,19 @@ AccountGroup recovered_group(const QString& heading, const std::vector<core::Rec
     return group;
 }
 
+QString how_to_go_on(WayIntoPlace way)
+{
+    switch (way) {
+    case WayIntoPlace::taken:
+        return u"It stands in the church's place: check the church now."_s;
+    case WayIntoPlace::open:
+        return without_commands(words::after_recovering());
+    case WayIntoPlace::closed:
+        break;
+    }
+    return words::no_place_for_recovered();
+}
+
 } // namespace
 
 QString found_for(const Account& account, MenderAct act)
@@ -107,8 +120,7 @@ Account account_of_no_church(const QString& church, const QString& file)
                         "church. Where there is only a damaged church file, 'Recover what can be read' makes a new "
                         "one of it, and 'Put recovered file in place' gives that to the church."_s.arg(core::product))},
         .next = MenderAct::none,
-        .looked = true,
-        .makes_way = true};
+        .looked = true};
 }
 
 Account account_of_failure(const QString& why)
@@ -191,7 +203,7 @@ Account account_of_setting_aside(const QString& aside)
         .next = MenderAct::none};
 }
 
-Account account_of_recovery(const QString& damaged, const QString& fresh,
+Account account_of_recovery(const RecoveryFiles& files, WayIntoPlace way,
                             const std::vector<core::RecoveredTable>& tables)
 {
     const bool whole = std::ranges::all_of(tables, words::came_whole);
@@ -200,13 +212,13 @@ Account account_of_recovery(const QString& damaged, const QString& fresh,
                     .state = whole ? State::contact : State::altered,
                     .title = whole ? u"All of it could be read: %1."_s.arg(count)
                                    : u"%1 could be read; something is lost."_s.arg(count),
-                    .lines = {{.words = words::where_recovered(damaged, fresh),
+                    .lines = {{.words = words::where_recovered(files.damaged, files.fresh),
                                .in_report = u"What could be read stands in a new church file; the damaged one was left "
                                             "as it is."_s},
-                              plain(without_commands(words::after_recovering()))},
-                    .next = MenderAct::put_in_place,
-                    .makes_way = true,
-                    .recovered = fresh};
+                              plain(how_to_go_on(way))},
+                    .next = way == WayIntoPlace::open ? MenderAct::put_in_place : MenderAct::check,
+                    .makes_way = way == WayIntoPlace::open,
+                    .recovered = files.fresh};
     for (auto group : {recovered_group(u"Not whole"_s, tables, false), recovered_group(u"Whole"_s, tables, true)}) {
         if (!group.lines.empty())
             account.groups.push_back(std::move(group));

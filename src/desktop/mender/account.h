@@ -24,6 +24,12 @@ struct AccountGroup
     MenderAct act = MenderAct::none; ///< What takes these away.
 };
 
+/// A damaged church file, and the new one for what can be read of it.
+struct RecoveryFiles
+{
+    QString damaged, fresh;
+};
+
 /// What the window tells of a church: a page in words.
 struct Account
 {
@@ -60,7 +66,9 @@ struct Account
 /// `removed` in words.
 [[nodiscard]] Account account_of_unlocking(const QString& church, const QStringList& removed,
                                            const core::Findings& left);
-[[nodiscard]] Account account_of_recovery(const QString& damaged, const QString& fresh,
+/// What a new church file can be to the church: it was written in the place of the church's own, or may come there.
+enum class WayIntoPlace { taken, open, closed };
+[[nodiscard]] Account account_of_recovery(const RecoveryFiles& files, WayIntoPlace way,
                                           const std::vector<core::RecoveredTable>& tables);
 
 [[nodiscard]] Account account_of_setting_aside(const QString& aside);

@@ -107,7 +107,7 @@ void judge(Account& account, const Findings& findings)
 {
     account.looked = true;
     account.mendable = has(findings, Cure::mend);
-    account.damaged = account.makes_way = has(findings, Cure::recover);
+    account.damaged = core::file_damaged(findings);
     account.next = next_act(findings);
     const bool sound = findings.empty();
     account.state = sound ? State::contact : is_damaged(findings) ? State::error : State::altered;

@@ -30,8 +30,9 @@ constexpr std::array offered{
                u"Lets people in again after a program or workstation failed. Nobody may be at work in the church."},
     OfferedAct{MenderAct::recover, u"recover", u"Rec&over what can be read…", u"document-import",
                u"Writes what can be read of a damaged church file into a new one. The damaged file stays as it is."},
-    OfferedAct{MenderAct::put_in_place, u"put_in_place", u"&Put recovered file in place", u"go-next",
-               u"Gives it to the church and mends that. The damaged file is moved into the church's folder 'mended'."},
+    OfferedAct{
+        MenderAct::put_in_place, u"put_in_place", u"&Put recovered file in place", u"go-next",
+        u"Gives it to the church and mends that. The file that was there is moved into the church's folder 'mended'."},
     OfferedAct{MenderAct::set_aside, u"set_aside", u"Set damaged file &aside", u"edit-undo",
                u"Moves it into the church's folder 'mended', so that Kindrel starts and a backup can be put back."},
 };

@@ -7,11 +7,7 @@ namespace kindrel::desktop {
 
 /// What is asked before a piece of work that needs files. Each returns nullopt when the person turned away.
 
-/// A damaged church file, and the new one for what can be read of it.
-struct RecoveryFiles
-{
-    QString damaged, fresh;
-};
+/// The files of a recovery.
 [[nodiscard]] std::optional<RecoveryFiles> ask_for_recovery(core::Dialogue& dialogue, const Account& account,
                                                             const QString& data_drive);
 

@@ -54,6 +54,8 @@ Account with_place(const MenderJob& job, core::Workstation& workstation,
         return account_of_no_place(error.text());
     }
     auto account = act(*place);
+    if (account.looked)
+        account.makes_way = core::gives_way(*place, account.damaged);
     account.data_root = place->paths.folder(Folder::data_root);
     if (const QString file = place->paths.database(); QFileInfo::exists(file))
         account.database = file;
@@ -112,20 +114,18 @@ Account unlock_church(const MenderJob& job)
     });
 }
 
-Account recover_church(const MenderJob& job, const QString& damaged, const QString& fresh)
+Account recover_church(const MenderJob& job, const RecoveryFiles& files)
 {
     return at_the_church(job, [&](MenderPlace& place) {
         if (const auto refusal = refusal_while_running(job, place))
             return *refusal;
+        const bool gives_way = core::gives_way(place, core::file_damaged(examine(place)));
         place.session.reset();
-        const QString from = damaged.isEmpty() ? place.paths.database() : damaged;
-        auto account = account_of_recovery(from, fresh, core::recover_church(from, fresh));
-        if (const QFileInfo own(place.paths.database());
-            own.exists() && own == QFileInfo(fresh)) { // It is in place already.
-            account.makes_way = false;
-            account.next = MenderAct::check;
-        }
-        return account;
+        const auto tables = core::recover_church(files.damaged, files.fresh);
+        const QFileInfo own(place.paths.database());
+        const bool taken = own.exists() && own == QFileInfo(files.fresh);
+        const auto way = gives_way ? WayIntoPlace::open : WayIntoPlace::closed;
+        return account_of_recovery(files, taken ? WayIntoPlace::taken : way, tables);
     });
 }
 

@@ -22,8 +22,7 @@ struct MenderJob
 [[nodiscard]] Account check_church(const MenderJob& job);
 [[nodiscard]] Account mend_church(const MenderJob& job);
 [[nodiscard]] Account unlock_church(const MenderJob& job);
-/// `damaged` may be empty: the church's own file.
-[[nodiscard]] Account recover_church(const MenderJob& job, const QString& damaged, const QString& fresh);
+[[nodiscard]] Account recover_church(const MenderJob& job, const RecoveryFiles& files);
 [[nodiscard]] Account set_church_aside(const MenderJob& job);
 [[nodiscard]] Account put_church_in_place(const MenderJob& job, const QString& recovered);
 

@@ -11,11 +11,12 @@ class QLayout;
 
 namespace kindrel::desktop {
 
+struct ChosenPeople;
 class ReportDrawing;
 class ReportTree;
 
 /// The reports that there are, in their families, each with what it prints and how it looks. Enter shows the chosen one
-/// over the families of active people.
+/// over everybody in the active families, or over the people chosen in Tagging, with what is set there.
 class CataloguePage : public Page
 {
     Q_OBJECT
@@ -31,8 +32,13 @@ public:
 private:
     [[nodiscard]] QLayout* make_details();
     [[nodiscard]] QLayout* make_scope();
+    [[nodiscard]] QLayout* make_people();
     [[nodiscard]] QLayout* make_paper();
+    /// Nothing: the report is about everybody.
+    [[nodiscard]] const ChosenPeople* chosen_people() const;
     [[nodiscard]] output::RunOptions options() const;
+    /// Reads again who there is to choose from; the choice stays.
+    void show_people();
     void show_chosen();
     void open_chosen();
 
@@ -40,9 +46,12 @@ private:
     ReportTree* m_tree;
     QLabel* m_leaf;
     QLabel* m_description;
-    QComboBox* m_paper;
+    QLabel* m_scope;
+    QComboBox *m_people, *m_paper;
     ReportDrawing* m_drawing;
-    people::WorkingList m_list; ///< As it was when the page was last entered: enough for the drawing.
+    bool m_tagging_wanted = false;                ///< Its people are, once there are any.
+    std::shared_ptr<const ChosenPeople> m_chosen; ///< As it was when the page was last entered; null: there is no list.
+    people::WorkingList m_everybody;              ///< The same, which is enough for the drawing.
 };
 
 } // namespace kindrel::desktop

@@ -214,7 +214,7 @@ void BulkPanel::count()
 
 void BulkPanel::run(TagAct act)
 {
-    if (!m_date->finish())
+    if (act == TagAct::give && m_item.kind == TagKind::date && !m_date->finish())
         return;
     std::optional<people::BulkChange> change;
     try {

@@ -16,17 +16,6 @@ namespace {
 constexpr std::array headings{"Name", "First name", "Entry", "Status"};
 static_assert(headings.size() == DataSearchModel::column_count);
 
-State state_of_person(const people::DataEntry& entry)
-{
-    people::Person person;
-    person.Decease = entry.deceased;
-    person.archive = entry.archived;
-    person.Privacy = entry.privacy;
-    person.Prospect = entry.prospect;
-    person.contact = entry.contact;
-    return state_of(person);
-}
-
 } // namespace
 
 void DataSearchModel::set_entries(std::vector<people::DataEntry> entries)
@@ -107,8 +96,8 @@ QVariant DataSearchModel::data(const QModelIndex& index, int role) const
     if (role == Qt::ForegroundRole && index.column() == status)
         return state_colour(state_of(found.Condition), shade_of(QApplication::palette()));
     if (role == Qt::ForegroundRole && index.column() == first_name)
-        return state_colour(state_of_person(found), shade_of(QApplication::palette()));
-    if (role == Qt::FontRole && index.column() == first_name && found.deceased) {
+        return state_colour(state_of(found.states), shade_of(QApplication::palette()));
+    if (role == Qt::FontRole && index.column() == first_name && found.states.deceased) {
         QFont font = QApplication::font();
         font.setItalic(true);
         return font;

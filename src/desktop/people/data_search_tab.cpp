@@ -1,7 +1,9 @@
 #include "desktop/people/data_search_tab.h"
 
+#include "core/entry.h"
 #include "desktop/people/family_card.h"
 #include "desktop/shell/empty_panel.h"
+#include "desktop/shell/icons.h"
 #include "desktop/shell/list_view.h"
 #include "desktop/shell/look.h"
 #include "people/text_search.h"
@@ -11,6 +13,7 @@
 #include <QLabel>
 #include <QListWidget>
 #include <QLocale>
+#include <QPushButton>
 #include <QSplitter>
 #include <QStackedWidget>
 #include <QTableView>
@@ -31,24 +34,18 @@ constexpr int parts_width = 216;
 
 DataSearchTab::DataSearchTab(Desk& desk)
     : m_desk(desk), m_parts(new QListWidget), m_model(new DataSearchModel(Unlisted::shown, this)),
-      m_view(new QTableView), m_empty(new EmptyPanel), m_stack(new QStackedWidget), m_count(new QLabel)
+      m_view(new QTableView), m_empty(new EmptyPanel), m_stack(new QStackedWidget), m_count(new QLabel),
+      m_to_tagging(new QPushButton(icon(u"tag"_s), u"To &Tagging"_s))
 {
     setObjectName(u"data_search"_s);
     set_up_parts();
     set_up_list();
-    m_count->setObjectName(u"data_count"_s);
-    auto* right = new QWidget;
-    auto* column = new QVBoxLayout(right);
-    column->setContentsMargins(0, 0, 0, 0);
-    column->setSpacing(space::field);
-    column->addWidget(m_stack, 1);
-    column->addWidget(m_count);
     auto* splitter = new QSplitter;
     splitter->setObjectName(u"data_search_parts"_s);
     splitter->setChildrenCollapsible(false);
     splitter->setHandleWidth(space::margin);
     splitter->addWidget(m_parts);
-    splitter->addWidget(right);
+    splitter->addWidget(make_list_side());
     splitter->setStretchFactor(1, 1);
     splitter->setSizes({parts_width, 3 * parts_width});
     follow(desk.remembered, *splitter);
@@ -88,6 +85,25 @@ void DataSearchTab::set_up_list()
     m_stack->setCurrentWidget(m_empty);
 }
 
+QWidget* DataSearchTab::make_list_side()
+{
+    m_count->setObjectName(u"data_count"_s);
+    m_to_tagging->setObjectName(u"to_tagging"_s);
+    m_to_tagging->setToolTip(u"Puts those who are listed on the list of Tagging"_s);
+    m_to_tagging->setEnabled(false);
+    connect(m_to_tagging, &QPushButton::clicked, this, &DataSearchTab::to_tagging);
+    auto* foot = new QHBoxLayout;
+    foot->addWidget(m_count, 1);
+    foot->addWidget(m_to_tagging);
+    auto* side = new QWidget;
+    auto* column = new QVBoxLayout(side);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(space::field);
+    column->addWidget(m_stack, 1);
+    column->addLayout(foot);
+    return side;
+}
+
 void DataSearchTab::entered()
 {
     if (m_part && m_change_mark != m_desk.office.session->change_mark())
@@ -116,6 +132,7 @@ void DataSearchTab::show_entries(std::vector<people::DataEntry> entries)
     else
         m_view->setCurrentIndex(m_model->index(0, 0));
     m_stack->setCurrentIndex(none ? 1 : 0);
+    m_to_tagging->setEnabled(!none && core::may_enter(m_desk.office, core::AreaId::tagging));
     m_count->setText(m_part ? u"%1 with an entry in %2"_s.arg(count_words(), QString::fromLatin1(m_part->name))
                             : QString());
     Q_EMIT counted();
@@ -159,6 +176,20 @@ void DataSearchTab::look()
     const auto keys = families(place);
     if (!keys.empty())
         open_family_card(m_desk, keys, place);
+}
+
+void DataSearchTab::to_tagging()
+{
+    people::WorkingList listed{{}, people::heading_of(*m_part)};
+    auto entries = m_model->entries();
+    std::erase_if(entries, [](const auto& entry) { return entry.member.person_id == 0; }); // A family without people.
+    // No letter is to go to those who have died.
+    if (std::erase_if(entries, [](const auto& entry) { return entry.states.deceased; }) > 0)
+        listed.criteria += u", without the deceased"_s;
+    if (entries.empty())
+        return m_desk.office.dialogue.show({u"Nobody who is listed is still alive"_s});
+    std::ranges::transform(entries, std::back_inserter(listed.members), &people::DataEntry::member);
+    m_desk.navigation.to_tagging(std::move(listed));
 }
 
 void DataSearchTab::lend_list(const std::function<void(const QString& title, const QAbstractItemModel&)>& use) const

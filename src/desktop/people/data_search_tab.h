@@ -6,6 +6,7 @@
 
 class QLabel;
 class QListWidget;
+class QPushButton;
 class QStackedWidget;
 class QTableView;
 
@@ -37,10 +38,12 @@ protected:
 private:
     void set_up_parts();
     void set_up_list();
+    [[nodiscard]] QWidget* make_list_side();
     /// Lists those who have an entry in the chosen part.
     void list_part();
     void show_entries(std::vector<people::DataEntry> entries);
     [[nodiscard]] bool key_pressed(const QObject* target, int key);
+    void to_tagging();
     /// The families of the list, and in `place` that of the chosen row; empty when no row is chosen.
     [[nodiscard]] std::vector<int> families(int& place) const;
 
@@ -52,6 +55,7 @@ private:
     EmptyPanel* m_empty;
     QStackedWidget* m_stack;
     QLabel* m_count;
+    QPushButton* m_to_tagging;
     std::optional<qint64> m_change_mark;
 };
 

@@ -114,7 +114,8 @@ void DateSearchFields::take(people::SortOrder& order) const
 
 bool DateSearchFields::finish()
 {
-    return m_from->finish() && m_to->finish();
+    const bool by_dates = m_values->currentIndex() == int(DateSearch::dates);
+    return !by_dates || (m_from->finish() && m_to->finish());
 }
 
 void DateSearchFields::focus_lacking()

@@ -25,7 +25,7 @@ public:
     void allow(bool by_date);
     /// Gives the order the search and, as far as it is entered, its value.
     void take(people::SortOrder& order) const;
-    /// Reads what is being typed; false, after saying why, when it is no date.
+    /// Reads what is being typed into the dates of the search; false, after saying why, when it is no date.
     [[nodiscard]] bool finish();
     /// The cursor goes to what the search lacks.
     void focus_lacking();

@@ -34,7 +34,7 @@ constexpr std::array postal_rest{Line{"post_state", "State", &Address::post_stat
 constexpr std::array contacts{Line{"phone", "P&hone", &Address::phone, &Address::phone_hidden},
                               Line{"family_email", "E-mai&l", &Address::family_email, &Address::family_email_hidden},
                               Line{"family_email_description", "E-mail is of", &Address::family_email_description},
-                              Line{"family_mobile", "Mo&bile", &Address::family_mobile, &Address::family_mobile_hidden},
+                              Line{"family_mobile", "&Mobile", &Address::family_mobile, &Address::family_mobile_hidden},
                               Line{"family_fax", "Fa&x", &Address::family_fax, &Address::family_fax_hidden}};
 
 } // namespace

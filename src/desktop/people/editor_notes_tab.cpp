@@ -81,7 +81,7 @@ QWidget* NotesTab::make_closed_panel()
 {
     auto* panel = new QWidget;
     m_closed = new EmptyPanel;
-    m_open = new QPushButton(u"&Open the notebook"_s);
+    m_open = new QPushButton(u"Open the note&book"_s);
     m_open->setObjectName(u"open_notebook"_s);
     connect(m_open, &QPushButton::clicked, this, &NotesTab::ask_to_open);
     auto* column = new QVBoxLayout(panel);

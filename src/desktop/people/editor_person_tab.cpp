@@ -33,11 +33,11 @@ constexpr int least_type_length = 10;
 constexpr int greatest_school_year = 99;
 
 constexpr std::array further_names{
-    Line{"preferred_name", "Pre&ferred name", &Person::preferred_name, &Person::Preferred_Name_hidden},
+    Line{"preferred_name", "Preferred name", &Person::preferred_name, &Person::Preferred_Name_hidden},
     Line{"middle_name", "Middle name", &Person::middle_name, &Person::middle_hidden},
     Line{"other_surname", "Other surname", &Person::other_surname, &Person::surname_hidden}};
 constexpr std::array reach{
-    Line{"mobile_phone", "Mo&bile", &Person::mobile_phone, &Person::mobile_hidden},
+    Line{"mobile_phone", "&Mobile", &Person::mobile_phone, &Person::mobile_hidden},
     Line{"Personal_email", "E-mai&l", &Person::Personal_email, &Person::email_hidden},
     Line{"business_phone", "Business phone", &Person::business_phone, &Person::bussiness_phone_hidden},
     Line{"business_fax", "Business fax", &Person::business_fax, &Person::Bussiness_fax_hidden},
@@ -166,7 +166,7 @@ void EditorPersonTab::add_school_year(EditorForm& form)
         if (!m_school_year->isModified())
             m_school_year->setText(shown && shown->school_year ? QString::number(*shown->school_year) : QString());
     });
-    form.add_row(u"Schoo&l year"_s, m_school_year);
+    form.add_row(u"School yea&r"_s, m_school_year);
 }
 
 bool EditorPersonTab::finish_school_year()

@@ -60,7 +60,7 @@ QByteArray jpeg_of(const QImage& picture)
 
 EditorPortrait::EditorPortrait(EditorBench& bench, QWidget* parent)
     : QWidget(parent), m_bench(bench), m_portrait(new Portrait),
-      m_add(new QPushButton(icon(u"insert-image"_s), u"Add photo&graph\u2026"_s)),
+      m_add(new QPushButton(icon(u"insert-image"_s), u"Add p&hotograph\u2026"_s)),
       m_remove(new QPushButton(icon(u"edit-delete"_s), u"Remove"_s))
 {
     m_add->setObjectName(u"add_photograph"_s);
@@ -92,7 +92,7 @@ void EditorPortrait::show_file()
     m_portrait->show_file(m_bench.desk.office.paths.file(photograph.folder, photograph.name));
     const bool may_edit = m_bench.editor.may_edit();
     m_add->setVisible(may_edit);
-    m_add->setText(m_portrait->empty() ? u"Add photo&graph\u2026"_s : u"Change photo&graph\u2026"_s);
+    m_add->setText(m_portrait->empty() ? u"Add p&hotograph\u2026"_s : u"Change p&hotograph\u2026"_s);
     m_remove->setVisible(may_edit && !m_portrait->empty());
 }
 

@@ -196,7 +196,7 @@ void FamilyCard::colour_people()
         QFont font = m_people->font();
         font.setItalic(person.Decease);
         m_people->item(row)->setFont(font);
-        m_people->item(row)->setForeground(state_colour(state_of(person), shade_of(palette())));
+        m_people->item(row)->setForeground(state_colour(state_of(states_of(person)), shade_of(palette())));
     }
 }
 

@@ -124,7 +124,7 @@ void FilterChoiceList::select(int row)
 
 bool FilterChoiceList::line_key(const QKeyEvent& key)
 {
-    if (is_enter(key) && key.modifiers() == Qt::NoModifier) {
+    if (is_enter(key) && !(key.modifiers() & ~Qt::KeypadModifier)) {
         m_line->selectAll();
         Q_EMIT step_wanted();
         return true;

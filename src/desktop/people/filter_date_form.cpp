@@ -5,6 +5,7 @@
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
 #include "people/setup_lists.h"
+#include "registers/day_refusal.h"
 
 #include <QComboBox>
 #include <QFormLayout>
@@ -65,7 +66,13 @@ FilterDateForm::FilterDateForm(const Desk& desk)
     connect(m_span, &QComboBox::currentIndexChanged, this, &FilterDateForm::show_span);
     for (End& end : m_ends) {
         connect(end.field, &DateField::entered, this, [&end](std::optional<core::Date> day) { end.day = day; });
-        connect(end.field, &QLineEdit::returnPressed, this, &FilterDateForm::add_wanted);
+        connect(
+            end.field, &QLineEdit::returnPressed, this,
+            [this, &end] {
+                if (!end.field->isModified()) // Otherwise the field has refused what was typed.
+                    Q_EMIT add_wanted();
+            },
+            Qt::QueuedConnection);
     }
     auto* button = new QPushButton(icon(u"list-add"_s), u"&Add"_s);
     button->setObjectName(u"add_date"_s);
@@ -155,8 +162,14 @@ bool FilterDateForm::typed() const
 
 bool FilterDateForm::whole() const
 {
-    return span() != DateSpan::month &&
-           std::ranges::all_of(m_ends, [](const End& end) { return end.day && !end.field->isModified(); });
+    return span() != DateSpan::month && std::ranges::all_of(m_ends, [this](const End& end) {
+               return end.day && !end.field->isModified() && !lacks_year(end);
+           });
+}
+
+bool FilterDateForm::lacks_year(const End& end) const
+{
+    return end.day && !end.day->year_known() && span() != DateSpan::anniversaries;
 }
 
 QWidget* FilterDateForm::lacking()
@@ -166,11 +179,11 @@ QWidget* FilterDateForm::lacking()
     for (const End& end : m_ends)
         if (!end.field->finish_end())
             return end.field;
-    const auto open = std::ranges::find_if(m_ends, [](const End& end) { return !end.day; });
-    if (open == m_ends.end())
+    const auto unfit = std::ranges::find_if(m_ends, [this](const End& end) { return !end.day || lacks_year(end); });
+    if (unfit == m_ends.end())
         return nullptr;
-    m_office.dialogue.show({u"Please enter both dates of the range"_s});
-    return open->field;
+    m_office.dialogue.show({unfit->day ? registers::year_missing : u"Please enter both dates of the range"_s});
+    return unfit->field;
 }
 
 DateCriterion FilterDateForm::take()

@@ -27,9 +27,9 @@ public:
     void focus_first();
     /// Whether an end was typed, be it one that makes no date yet.
     [[nodiscard]] bool typed() const;
-    /// Whether both ends were typed.
+    /// Whether both ends were typed as they can be taken.
     [[nodiscard]] bool whole() const;
-    /// The end that is missing, after saying so; null for a span that can be taken.
+    /// The end that is missing, or lacks its year, after saying so; null for a span that can be taken.
     [[nodiscard]] QWidget* lacking();
     /// The span; its ends are empty afterwards.
     [[nodiscard]] people::DateCriterion take();
@@ -50,6 +50,8 @@ private:
     void add_row(QFormLayout& form, const QString& caption, QWidget* field, const QString& name);
     void fill_items();
     void show_span();
+    /// An anniversary alone can do without.
+    [[nodiscard]] bool lacks_year(const End& end) const;
     [[nodiscard]] people::DateSource source() const;
     [[nodiscard]] people::DateSpan span() const;
 

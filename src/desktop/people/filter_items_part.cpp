@@ -110,12 +110,12 @@ void FilterItemsPart::set_use(const FilterItem& item, Use use)
     for (FilterItem* each : used)
         each->exclude = use == Use::exclude;
     if (use == Use::none) {
+        m_another = false;
         std::erase_if(filter().items, [&](const FilterItem& other) { return same(other, item); });
     } else if (used.empty()) {
-        FilterItem added = item;
+        FilterItem& added = filter().items.emplace_back(item);
         added.exclude = use == Use::exclude;
         m_details->read_into(added);
-        filter().items.push_back(std::move(added));
     }
     done();
 }

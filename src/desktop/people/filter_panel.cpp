@@ -7,6 +7,7 @@
 #include "desktop/people/saved_filter_bar.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/side_panel.h"
+#include "desktop/shell/value_form.h"
 
 #include <QEvent>
 #include <QGridLayout>
@@ -38,22 +39,13 @@ people::Filter first_filter()
     return filter;
 }
 
-QLabel* make_text(const QString& name)
-{
-    auto* label = new QLabel;
-    label->setObjectName(name);
-    label->setTextFormat(Qt::PlainText);
-    label->setWordWrap(true);
-    label->setTextInteractionFlags(Qt::TextSelectableByMouse);
-    return label;
-}
-
 } // namespace
 
 FilterPanel::FilterPanel(Desk& desk, QWidget* parent)
-    : QWidget(parent), m_desk(desk), m_filter(first_filter()), m_saved(new SavedFilterBar(desk, m_filter)),
-      m_kinds(make_kinds()), m_parts(new QStackedWidget), m_count(make_text(u"count"_s)),
-      m_sentence(make_text(u"sentence"_s)), m_faults(make_text(u"faults"_s)), m_pause(new QTimer(this))
+    : QWidget(parent), m_desk(desk), m_filter(first_filter()),
+      m_saved(new SavedFilterBar(desk, m_filter, [this] { return finish_parts(); })), m_kinds(make_kinds()),
+      m_parts(new QStackedWidget), m_count(make_value()), m_sentence(make_value()), m_faults(make_value()),
+      m_pause(new QTimer(this))
 {
     setObjectName(u"filter_panel"_s);
     m_pause->setSingleShot(true);
@@ -96,8 +88,11 @@ QWidget* FilterPanel::make_outcome()
     auto* column = new QVBoxLayout;
     column->setContentsMargins(0, 0, 0, 0);
     column->setSpacing(space::field / 2);
-    for (QLabel* text : {m_count, m_faults, m_sentence})
+    for (const auto& [text, name] :
+         {std::pair(m_count, u"count"_s), std::pair(m_faults, u"faults"_s), std::pair(m_sentence, u"sentence"_s)}) {
+        text->setObjectName(name);
         column->addWidget(text);
+    }
     column->addStretch(1);
     auto* scroll = new QScrollArea;
     auto* texts = new QWidget;
@@ -161,7 +156,6 @@ void FilterPanel::take_change()
     m_saved->show_changed();
     show_uses();
     m_pause->start();
-    Q_EMIT changed();
 }
 
 void FilterPanel::set_filter(const people::Filter& filter)
@@ -177,7 +171,6 @@ void FilterPanel::adopt(const people::Filter& filter)
     m_filter = filter;
     show_part(m_kinds->currentRow());
     m_pause->start();
-    Q_EMIT changed();
 }
 
 void FilterPanel::reload()
@@ -193,7 +186,7 @@ void FilterPanel::focus_kinds()
     m_kinds->setFocus(Qt::OtherFocusReason);
 }
 
-bool FilterPanel::finish()
+bool FilterPanel::finish_parts()
 {
     for (int row = 0; row < m_parts->count(); ++row) {
         if (QWidget* lacking = part(row).finish()) {
@@ -202,6 +195,13 @@ bool FilterPanel::finish()
             return false;
         }
     }
+    return true;
+}
+
+bool FilterPanel::finish()
+{
+    if (!finish_parts())
+        return false;
     if (people::complete(m_desk.office.dialogue, m_filter))
         return true;
     m_kinds->setCurrentRow(0);

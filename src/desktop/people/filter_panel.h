@@ -30,9 +30,6 @@ public:
     /// Counts at once, without waiting for a pause in typing.
     void count_now();
 
-Q_SIGNALS:
-    void changed();
-
 protected:
     void changeEvent(QEvent* event) override;
 
@@ -43,6 +40,8 @@ private:
     [[nodiscard]] QWidget* make_outcome();
     [[nodiscard]] FilterPart& part(int row) const;
     void show_part(int row);
+    /// As finish(), but for what the filter as a whole may lack.
+    [[nodiscard]] bool finish_parts();
     void adopt(const people::Filter& filter);
     void show_uses();
     void take_change();

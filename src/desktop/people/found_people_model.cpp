@@ -41,7 +41,7 @@ void add_family(QHash<int, FoundPerson>& people, const people::DisclosedFamily& 
                                          .name = people::listed_name(person, family.family().surname, preferred),
                                          .family = family.family().surname,
                                          .suburb = suburb,
-                                         .state = state_of(person)});
+                                         .state = state_of(states_of(person))});
 }
 
 } // namespace

@@ -168,17 +168,18 @@ bool FusionPage::altered() const
 
 bool FusionPage::save()
 {
-    if (!m_names->finish_typing())
-        return false;
-    const int fusion = m_names->chosen();
+    bool typed = false;
     bool saved = false;
     try {
-        saved = m_setup->save();
+        typed = m_names->finish_typing();
+        saved = typed && m_setup->save();
     } catch (const core::DatabaseError& error) {
         m_desk.office.dialogue.show({u"Unable to save the fusions"_s, error.text()});
     }
+    if (!typed)
+        return false; // Everything stands as it was typed.
     m_saved = saved;
-    m_names->show_names(fusion);
+    m_names->show_names(m_names->chosen());
     return saved;
 }
 

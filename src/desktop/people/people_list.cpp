@@ -107,7 +107,7 @@ void PeopleList::show_row(int row, const people::FamilyFile& file, int person)
     QFont font = this->font();
     font.setItalic(shown.Decease);
     line->setFont(font);
-    line->setForeground(state_colour(state_of(shown), shade_of(palette())));
+    line->setForeground(state_colour(state_of(states_of(shown)), shade_of(palette())));
 }
 
 int PeopleList::person_at(int rows_further) const

@@ -25,17 +25,19 @@ constexpr std::array status_looks{
     StatusLook{FileStatus::archive, "Archive", State::archive},
 };
 
-struct FlagState
+struct PersonLook
 {
-    bool people::Person::*flag;
+    bool people::PersonStates::*is_so;
     State state;
 };
 
 /// The gravest first.
-constexpr std::array flag_states{
-    FlagState{&people::Person::Decease, State::deceased}, FlagState{&people::Person::archive, State::archive},
-    FlagState{&people::Person::Privacy, State::privacy},  FlagState{&people::Person::Prospect, State::prospect},
-    FlagState{&people::Person::contact, State::contact},
+constexpr std::array person_looks{
+    PersonLook{&people::PersonStates::deceased, State::deceased},
+    PersonLook{&people::PersonStates::archived, State::archive},
+    PersonLook{&people::PersonStates::privacy, State::privacy},
+    PersonLook{&people::PersonStates::prospect, State::prospect},
+    PersonLook{&people::PersonStates::contact, State::contact},
 };
 
 const StatusLook& look_of(FileStatus status)
@@ -70,11 +72,11 @@ State state_of(const AddressBookEntry& entry)
     return entry.booked_out ? State::booked_out : state_of(entry.Condition);
 }
 
-State state_of(const people::Person& person)
+State state_of(const people::PersonStates& states)
 {
-    const auto* found = std::find_if(flag_states.begin(), flag_states.end(),
-                                     [&person](const FlagState& flag) { return person.*flag.flag; });
-    return found == flag_states.end() ? State::plain : found->state;
+    const auto* found = std::find_if(person_looks.begin(), person_looks.end(),
+                                     [&states](const PersonLook& look) { return states.*look.is_so; });
+    return found == person_looks.end() ? State::plain : found->state;
 }
 
 } // namespace kindrel::desktop

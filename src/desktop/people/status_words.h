@@ -2,6 +2,7 @@
 
 #include "desktop/shell/palette.h"
 #include "people/address_book.h"
+#include "people/listed_people.h"
 
 namespace kindrel::desktop {
 
@@ -10,7 +11,7 @@ namespace kindrel::desktop {
 /// What stands in a list's status column, and in which colour: booked out goes before the file's own status.
 [[nodiscard]] QString status_words(const people::AddressBookEntry& entry);
 [[nodiscard]] State state_of(const people::AddressBookEntry& entry);
-/// The gravest of a person's flags.
-[[nodiscard]] State state_of(const people::Person& person);
+/// The gravest of a person's states.
+[[nodiscard]] State state_of(const people::PersonStates& states);
 
 } // namespace kindrel::desktop

@@ -1,5 +1,6 @@
 #include "desktop/people/tagging_page.h"
 
+#include "desktop/output/chosen_people.h"
 #include "desktop/people/filter_panel.h"
 #include "desktop/people/layout_steps.h"
 #include "desktop/people/list_steps.h"
@@ -25,7 +26,6 @@ namespace {
 constexpr int panel_width = 348;
 /// A pause in typing, after which the list is made again.
 constexpr int typing_pause = 150;
-constexpr std::size_t most_undos = 50;
 
 } // namespace
 
@@ -36,9 +36,9 @@ TaggingPage* TaggingPage::open(Desk& desk)
 }
 
 TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
-    : Page(u"Tagging"_s), m_desk(desk), m_entry(std::move(entry)), m_bar(new StepBar), m_filter(new FilterPanel(desk)),
-      m_list(new WorkingListView(desk, m_sheet)), m_views(new QStackedWidget), m_panels(new QStackedWidget),
-      m_pause(new QTimer(this))
+    : Page(u"Tagging"_s), m_desk(desk), m_entry(std::move(entry)), m_undo(note()), m_bar(new StepBar),
+      m_filter(new FilterPanel(desk)), m_list(new WorkingListView(desk, m_sheet)), m_views(new QStackedWidget),
+      m_panels(new QStackedWidget), m_pause(new QTimer(this))
 {
     setObjectName(u"Tagging"_s);
     m_pause->setSingleShot(true);
@@ -48,15 +48,11 @@ TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
     connect(m_list, &WorkingListView::made, this, [this] {
         m_process->set_list(m_list->list());
         set_status(m_list->count_words());
+        share_list();
     });
     connect(m_list, &WorkingListView::told, this, [this](const QString& words) { note().say(words); });
     connect(m_list, &WorkingListView::changed_by_hand, this,
-            [this](const QString& words, const std::function<void()>& undo) {
-                offer_undo({words, [undo] {
-                                undo();
-                                return QString();
-                            }});
-            });
+            [this](const QString& words, const std::function<void()>& undo) { m_undo.offer(words, undo); });
     add_panels();
     m_views->addWidget(m_filter);
     m_views->addWidget(make_bench());
@@ -70,6 +66,11 @@ TaggingPage::TaggingPage(Desk& desk, core::AreaEntry entry)
     add_keys();
     add_actions();
     sheet_changed();
+}
+
+TaggingPage::~TaggingPage()
+{
+    m_desk.chosen.reset();
 }
 
 void TaggingPage::add_panels()
@@ -115,7 +116,7 @@ void TaggingPage::add_keys()
     key(Qt::CTRL | Qt::Key_PageUp, [turn] { turn(-1); });
     key(Qt::CTRL | Qt::Key_PageDown, [turn] { turn(1); });
     key(Qt::CTRL | Qt::Key_Return, [this] { go_to(Step::process); });
-    key(QKeySequence::Undo, [this] { take_back(); });
+    key(QKeySequence::Undo, [this] { m_undo.take_back(); });
 }
 
 void TaggingPage::add_actions()
@@ -162,7 +163,7 @@ void TaggingPage::go_to(Step step)
     if (step == from || !finish_step())
         return;
     if (from == Step::filter)
-        m_sheet.plan.filter = m_filter->filter();
+        take_filter();
     m_bar->open(step);
     m_views->setCurrentIndex(step == Step::filter ? 0 : 1);
     if (step == Step::filter)
@@ -174,12 +175,42 @@ void TaggingPage::go_to(Step step)
     panel(step).focus_first();
 }
 
+void TaggingPage::take_filter()
+{
+    auto& plan = m_sheet.plan;
+    auto filter = m_filter->filter();
+    if (m_list->is_made() && filter != plan.filter)
+        plan.found.reset(); // A filter that was changed chooses the people anew.
+    plan.filter = std::move(filter);
+}
+
+void TaggingPage::take_people(const people::WorkingList& found)
+{
+    const bool first = !m_list->is_made();
+    if (first)
+        m_sheet.plan.found = found;
+    if (m_bar->open_step() == Step::filter)
+        go_to(Step::process);
+    const bool refused = m_bar->open_step() == Step::filter; // It lacks something, which was said.
+    if (refused && first)
+        m_sheet.plan.found.reset();
+    else if (!refused && !first)
+        m_list->add_people(found.members);
+}
+
 void TaggingPage::sheet_changed()
 {
     for (int step = Step::sort; step < Step::process; ++step)
         m_bar->mark(Step(step), panel(Step(step)).is_set());
     if (m_views->currentIndex() > 0)
         m_pause->start();
+    share_list(); // What reports leave out must not wait for the list.
+}
+
+void TaggingPage::share_list()
+{
+    if (m_list->is_made())
+        m_desk.chosen = std::make_shared<const ChosenPeople>(ChosenPeople{m_list->list(), m_sheet.options});
 }
 
 void TaggingPage::make_list()
@@ -194,9 +225,9 @@ void TaggingPage::tagged(const people::BulkChange& change)
         return;
     const bool given = change.act == people::TagAct::give;
     const QString words = given ? u"\u201c%1\u201d was given to %2."_s : u"\u201c%1\u201d was taken from %2."_s;
-    offer_undo({words.arg(change.item.text, people_words(change.count.changed)), [this, change] {
-                    return untag(change);
-                }});
+    m_undo.offer({words.arg(change.item.text, people_words(change.count.changed)), [this, change] {
+                      return untag(change);
+                  }});
 }
 
 std::optional<QString> TaggingPage::untag(const people::BulkChange& change)
@@ -212,33 +243,6 @@ std::optional<QString> TaggingPage::untag(const people::BulkChange& change)
     m_process->set_list(m_list->list());
     return stay == 0 ? u"The change was taken back."_s
                      : u"The change was taken back; %1 changed since stay as they are."_s.arg(people_words(*stay));
-}
-
-void TaggingPage::offer_undo(Undo undo)
-{
-    m_undos.push_back(std::move(undo));
-    if (m_undos.size() > most_undos)
-        m_undos.erase(m_undos.begin());
-    show_undo();
-}
-
-void TaggingPage::show_undo(const QString& told)
-{
-    if (m_undos.empty())
-        return note().say(told);
-    const QString& words = m_undos.back().words;
-    note().offer(told.isEmpty() ? words : u"%1 Before that: %2"_s.arg(told, words), u"&Undo"_s,
-                 [this] { take_back(); });
-}
-
-void TaggingPage::take_back()
-{
-    if (m_undos.empty())
-        return;
-    const auto told = m_undos.back().act();
-    if (told)
-        m_undos.pop_back();
-    show_undo(told.value_or(QString()));
 }
 
 } // namespace kindrel::desktop

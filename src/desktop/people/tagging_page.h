@@ -3,11 +3,10 @@
 #include "core/entry.h"
 #include "desktop/people/step_bar.h"
 #include "desktop/people/step_panel.h"
+#include "desktop/people/undo_offers.h"
 #include "desktop/shell/desk.h"
 #include "desktop/shell/page.h"
 #include "people/tagging.h"
-
-#include <functional>
 
 class QStackedWidget;
 class QTimer;
@@ -27,7 +26,11 @@ class TaggingPage : public Page
 public:
     /// Null, after saying why, when the area cannot be entered.
     [[nodiscard]] static TaggingPage* open(Desk& desk);
+    ~TaggingPage() override;
 
+    /// Brings people who were found elsewhere: they become the list, or join the one that is there. The page goes on to
+    /// its last step with them.
+    void take_people(const people::WorkingList& found);
     [[nodiscard]] QString help() const override { return QStringLiteral("tagging"); }
     void entered() override;
     void find() override;
@@ -44,25 +47,18 @@ private:
     /// Goes to the step unless the open one lacks something.
     void go_to(StepBar::Step step);
     [[nodiscard]] bool finish_step();
+    void take_filter();
     void sheet_changed();
     void make_list();
+    /// With the pages that make reports.
+    void share_list();
     void tagged(const people::BulkChange& change);
     [[nodiscard]] std::optional<QString> untag(const people::BulkChange& change);
-    /// Something that was done, and what takes it back: that tells how it went, or nullopt where it could not.
-    struct Undo
-    {
-        QString words;
-        std::function<std::optional<QString>()> act;
-    };
-    /// In the note bar and by Ctrl+Z, one after the other, the last first.
-    void offer_undo(Undo undo);
-    void show_undo(const QString& told = {});
-    void take_back();
 
     Desk& m_desk;
     core::AreaEntry m_entry;
     TaggingSheet m_sheet;
-    std::vector<Undo> m_undos; ///< The latest last.
+    UndoOffers m_undo;
     StepBar* m_bar;
     FilterPanel* m_filter;
     WorkingListView* m_list;

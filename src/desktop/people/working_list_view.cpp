@@ -10,6 +10,9 @@
 #include <QLabel>
 #include <QLocale>
 #include <QPushButton>
+#include <QSet>
+
+#include <algorithm>
 
 namespace kindrel::desktop {
 
@@ -30,7 +33,7 @@ WorkingListView::WorkingListView(Desk& desk, TaggingSheet& sheet)
     m_state->setWordWrap(true);
     m_state->setTextInteractionFlags(Qt::TextSelectableByMouse);
     m_as_filtered->setObjectName(u"as_filtered"_s);
-    m_as_filtered->setToolTip(u"Forget who was added and struck by hand"_s);
+    m_as_filtered->setToolTip(u"Forget who was added, struck or brought from Data Search"_s);
     connect(m_as_filtered, &QPushButton::clicked, this, &WorkingListView::drop_changes_by_hand);
     connect(m_people, &WorkingPeople::added, this, &WorkingListView::add);
     connect(m_people, &WorkingPeople::struck, this, &WorkingListView::strike);
@@ -74,9 +77,10 @@ void WorkingListView::make()
         return;
     const auto& plan = m_sheet.plan;
     m_made = people::make_list(m_desk.office, plan);
+    m_is_made = true;
     m_people->show_people(m_made.people);
     m_state->setText(u"%1: %2"_s.arg(count_words(), m_made.list.criteria));
-    m_as_filtered->setVisible(!plan.added.empty() || !plan.struck.empty());
+    m_as_filtered->setVisible(plan.found || !plan.added.empty() || !plan.struck.empty());
     Q_EMIT made();
 }
 
@@ -85,9 +89,10 @@ void WorkingListView::change_by_hand(const QString& words, const std::function<v
     const auto before = m_sheet.plan;
     change();
     make();
-    Q_EMIT changed_by_hand(words, [this, added = before.added, struck = before.struck] {
-        m_sheet.plan.added = added;
-        m_sheet.plan.struck = struck;
+    Q_EMIT changed_by_hand(words, [this, before] {
+        m_sheet.plan.found = before.found;
+        m_sheet.plan.added = before.added;
+        m_sheet.plan.struck = before.struck;
         make();
     });
 }
@@ -98,7 +103,24 @@ void WorkingListView::add(const people::ListedPerson& person)
     if (std::ranges::find(there, person.member.person_id, &people::Member::person_id) != there.end())
         return Q_EMIT told(u"\u201c%1, %2\u201d is on the list already."_s.arg(person.surname, person.name));
     change_by_hand(u"\u201c%1, %2\u201d was added to the list."_s.arg(person.surname, person.name),
-                   [&] { people::add_by_hand(m_sheet.plan, person.member); });
+                   [&] { people::add_by_hand(m_sheet.plan, {person.member}); });
+}
+
+void WorkingListView::add_people(const std::vector<people::Member>& members)
+{
+    QSet<int> there;
+    for (const auto& member : m_made.list.members)
+        there.insert(member.person_id);
+    std::vector<people::Member> more;
+    std::ranges::copy_if(members, std::back_inserter(more),
+                         [&](const people::Member& member) { return !there.contains(member.person_id); });
+    if (more.empty())
+        return Q_EMIT told(u"All of them are on the list already."_s);
+    const auto already = std::ssize(members) - std::ssize(more);
+    QString words = u"%1 added to the list"_s.arg(people_words(std::ssize(more)));
+    if (already > 0)
+        words += u"; on it already: %1"_s.arg(QLocale().toString(already));
+    change_by_hand(words + u'.', [&] { people::add_by_hand(m_sheet.plan, more); });
 }
 
 void WorkingListView::strike(const std::vector<int>& people)
@@ -112,6 +134,7 @@ void WorkingListView::strike(const std::vector<int>& people)
 void WorkingListView::drop_changes_by_hand()
 {
     change_by_hand(u"The list is as it was filtered."_s, [this] {
+        m_sheet.plan.found.reset();
         m_sheet.plan.added.clear();
         m_sheet.plan.struck.clear();
     });

@@ -21,11 +21,14 @@ public:
     WorkingListView(Desk& desk, TaggingSheet& sheet);
 
     [[nodiscard]] const people::WorkingList& list() const { return m_made.list; }
+    [[nodiscard]] bool is_made() const { return m_is_made; }
     /// "84 people".
     [[nodiscard]] QString count_words() const;
     /// Makes the list of what the sheet says now. An order that lacks something yet, or that is not granted, leaves it
     /// as it is.
     void make();
+    /// Those who are not on the list yet join it, as if by hand.
+    void add_people(const std::vector<people::Member>& members);
     void focus_line();
     void print();
     void save();
@@ -47,6 +50,7 @@ private:
     Desk& m_desk;
     TaggingSheet& m_sheet;
     people::MadeList m_made;
+    bool m_is_made = false;
     QLabel* m_state;
     QPushButton* m_as_filtered;
     WorkingPeople* m_people;

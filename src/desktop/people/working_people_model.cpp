@@ -1,6 +1,6 @@
 #include "desktop/people/working_people_model.h"
 
-#include "desktop/shell/palette.h"
+#include "desktop/people/status_words.h"
 
 #include <QApplication>
 #include <QFont>
@@ -15,28 +15,6 @@ using people::ListedPerson;
 namespace {
 
 constexpr std::array headings{"Name", "Family", "File"};
-
-struct FlagState
-{
-    bool ListedPerson::*flag;
-    State state;
-};
-
-/// The gravest first.
-constexpr std::array flag_states{
-    FlagState{&ListedPerson::deceased, State::deceased}, FlagState{&ListedPerson::archived, State::archive},
-    FlagState{&ListedPerson::privacy, State::privacy},   FlagState{&ListedPerson::prospect, State::prospect},
-    FlagState{&ListedPerson::contact, State::contact},
-};
-
-State state_of(const ListedPerson& person)
-{
-    for (const auto& [flag, state] : flag_states) {
-        if (person.*flag)
-            return state;
-    }
-    return State::plain;
-}
 
 QString text_of(const ListedPerson& person, int column)
 {
@@ -74,10 +52,10 @@ QVariant WorkingPeopleModel::data(const QModelIndex& index, int role) const
     if (role == Qt::DisplayRole)
         return text_of(shown, index.column());
     if (role == Qt::ForegroundRole && index.column() != family) {
-        const State state = index.column() == file ? State::booked_out : state_of(shown);
+        const State state = index.column() == file ? State::booked_out : state_of(shown.states);
         return state_colour(state, shade_of(QApplication::palette()));
     }
-    if (role == Qt::FontRole && index.column() == name && shown.deceased) {
+    if (role == Qt::FontRole && index.column() == name && shown.states.deceased) {
         QFont font = QApplication::font();
         font.setItalic(true);
         return font;

@@ -1,6 +1,7 @@
 #include "desktop/registers/new_day.h"
 
 #include "desktop/shell/typed_date.h"
+#include "registers/day_refusal.h"
 
 #include <algorithm>
 
@@ -9,15 +10,6 @@ namespace kindrel::desktop {
 using namespace Qt::StringLiterals;
 
 namespace {
-
-/// Says so when what was typed is no day.
-bool readable(core::Office& office, const std::optional<core::Date>& day)
-{
-    if (day && day->year_known())
-        return true;
-    office.dialogue.show(day ? core::Message{registers::year_missing} : core::bad_date_message(office.day_order()));
-    return false;
-}
 
 bool used_by_another(const registers::DatedRegister& dated, const core::Date& day)
 {
@@ -33,8 +25,9 @@ std::optional<core::Date> ask_new_day(core::Office& office, registers::DatedRegi
                            .icon = core::Icon::question};
     while (const auto typed = office.dialogue.ask_text(question)) {
         const auto day = typed_date(office, *typed);
-        // The register tells what it refuses.
-        if (readable(office, day) && (!used_by_another(dated, *day) || dated.change_date(*day)))
+        if (!day || !day->year_known())
+            office.dialogue.show(registers::day_refusal(*typed, office.day_order()));
+        else if (!used_by_another(dated, *day) || dated.change_date(*day)) // The register tells what it refuses.
             return day;
         question.more = u"You typed \"%1\"."_s.arg(*typed);
     }

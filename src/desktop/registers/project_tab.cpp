@@ -177,6 +177,7 @@ OrderedListEditor* WeeklyProjectTab::make_categories(FigureKind kind, const QStr
     auto* categories =
         new OrderedListEditor(std::make_unique<CategoryOperations>(setup(), kind, project()), name + u"_list"_s);
     categories->setObjectName(name);
+    categories->drop_letters();
     connect(categories, &OrderedListEditor::changed, this, &ProjectTab::changed);
     m_categories.push_back(categories);
     return categories;

@@ -14,7 +14,6 @@
 
 #include <QComboBox>
 #include <QHBoxLayout>
-#include <QLabel>
 #include <QPushButton>
 #include <QScrollArea>
 #include <QStandardItemModel>
@@ -26,11 +25,11 @@ namespace kindrel::desktop {
 using namespace Qt::StringLiterals;
 using registers::FigureKind;
 using registers::ReportField;
+using registers::ReportParts;
 
 namespace {
 
 constexpr int choices_width = 308;
-constexpr int caption_width = WeeklyPeriodFields::caption_width;
 constexpr auto kind = registers::Kind::weekly;
 const QString paper_key = u"reports/paper"_s; ///< As for all reports.
 
@@ -47,21 +46,9 @@ QList<int> numbers(const QVariantList& values)
     return found;
 }
 
-QLayout* with_caption(const QString& caption, QWidget* control)
-{
-    auto* words = new QLabel(caption);
-    words->setBuddy(control);
-    keep_width(*words, caption_width);
-    auto* row = new QHBoxLayout;
-    row->setSpacing(space::field);
-    row->addWidget(words);
-    row->addWidget(control, 1);
-    return row;
-}
-
 } // namespace
 
-WeeklyOutput::WeeklyOutput(Desk& desk, std::function<bool(int)> settle, QWidget* parent)
+WeeklyOutput::WeeklyOutput(Desk& desk, Settle settle, QWidget* parent)
     : QWidget(parent), m_desk(desk), m_settle(std::move(settle)), m_project(new QComboBox),
       m_reports(new WeeklyReportList(desk.remembered)), m_period(new WeeklyPeriodFields(desk)),
       m_chart(new ChartChoice(desk.remembered)),
@@ -159,7 +146,7 @@ void WeeklyOutput::keep_ticks()
     m_desk.remembered.keep(left_out_key(project()), left_out);
 }
 
-registers::WeeklyReportRequest WeeklyOutput::request(const registers::PeriodChoice& period) const
+registers::WeeklyReportRequest WeeklyOutput::request(const registers::PeriodChoice& period, ReportParts parts) const
 {
     auto categories = m_attendance->ticked();
     std::ranges::copy(m_finance->ticked(), std::back_inserter(categories));
@@ -167,23 +154,36 @@ registers::WeeklyReportRequest WeeklyOutput::request(const registers::PeriodChoi
             .report = &m_reports->report(),
             .categories = std::move(categories),
             .period = period,
-            .chart = m_chart->style()};
+            .chart = m_chart->style(),
+            .parts = parts};
 }
 
-std::optional<registers::WeeklyPlan> WeeklyOutput::plan()
+std::optional<registers::WeeklyPlan> WeeklyOutput::plan(ReportParts parts)
 {
+    Q_EMIT remarked({});
     const auto period = m_period->choice();
-    if (!period || !m_settle(project()))
+    if (!period)
         return {};
-    registers::ReportCheck check{m_desk.office.dialogue};
-    auto made = registers::plan_weekly_report(m_desk.office, request(*period), check);
+    auto& office = m_desk.office;
+    registers::ReportCheck check{office.dialogue};
+    auto made = registers::check_weekly_report(office, request(*period, parts), check);
+    const auto remark = made ? m_settle(project()) : std::nullopt;
+    made = remark ? registers::with_figures(*office.session, std::move(*made), check) : std::nullopt;
     if (made) {
         m_period->remember();
         m_chart->remember();
+        Q_EMIT remarked(*remark);
     } else if (check.guilty) {
         focus_choice(*check.guilty);
     }
     return made;
+}
+
+CategoryTicks& WeeklyOutput::guilty_ticks() const
+{
+    const bool any_ticked = !m_attendance->ticked().empty();
+    const bool any_to_tick = !m_attendance->left_out().isEmpty() && m_finance->ticked().empty();
+    return any_ticked || any_to_tick ? *m_attendance : *m_finance;
 }
 
 void WeeklyOutput::focus_choice(ReportField choice)
@@ -194,7 +194,7 @@ void WeeklyOutput::focus_choice(ReportField choice)
     case ReportField::report:
         return m_reports->setFocus();
     case ReportField::categories:
-        return m_attendance->focus_list();
+        return guilty_ticks().focus_list();
     case ReportField::chart:
         return m_chart->setFocus();
     case ReportField::from:
@@ -205,7 +205,7 @@ void WeeklyOutput::focus_choice(ReportField choice)
 
 void WeeklyOutput::run()
 {
-    auto made = plan();
+    auto made = plan(ReportParts::pages);
     if (!made)
         return;
     const auto paper = static_cast<pages::Paper>(m_desk.remembered.value(paper_key, 0).toInt() == 1);
@@ -221,7 +221,7 @@ void WeeklyOutput::save_csv()
 {
     if (!core::permitted(m_desk.office, core::Area::export_text))
         return;
-    const auto made = plan();
+    const auto made = plan(ReportParts::table);
     if (!made)
         return;
     const auto table = registers::weekly_table(*made);

@@ -67,12 +67,8 @@ WeeklyPage::WeeklyPage(Desk& desk, core::AreaEntry entry)
     set_content(m_content);
     add_actions();
     connect(m_figures, &WeeklyEntry::changed, this, &WeeklyPage::show_state);
-    connect(m_figures, &WeeklyEntry::remarked, this, [this](const QString& words) {
-        if (words.isEmpty())
-            note().clear();
-        else
-            note().say(words);
-    });
+    connect(m_figures, &WeeklyEntry::remarked, this, &WeeklyPage::remark);
+    connect(m_output, &WeeklyOutput::remarked, this, &WeeklyPage::remark);
     connect(m_tabs, &QTabWidget::currentChanged, this, &WeeklyPage::turn_to);
 }
 
@@ -213,20 +209,25 @@ bool WeeklyPage::leave()
     return left;
 }
 
-bool WeeklyPage::settle_for_report(int project)
+void WeeklyPage::remark(const QString& words)
 {
-    note().clear();
+    if (words.isEmpty())
+        note().clear();
+    else
+        note().say(words);
+}
+
+std::optional<QString> WeeklyPage::settle_for_report(int project)
+{
     if (!m_weekly.open_date() || !altered() || project != m_weekly.project())
-        return true;
+        return QString();
     const auto date = m_weekly.open_date()->date.shown(m_desk.office.day_order());
     const auto answer = m_desk.office.dialogue.confirm_or_cancel(
         {.text = u"The figures of %1 are not saved, do you wish to save them before the report is made?"_s.arg(date),
          .icon = core::Icon::question});
     if (!answer || (*answer && !save()))
-        return false;
-    if (!*answer)
-        note().say(u"The figures of %1 are not saved; this report leaves them out."_s.arg(date));
-    return true;
+        return {};
+    return *answer ? QString() : u"The figures of %1 are not saved; this report leaves them out."_s.arg(date);
 }
 
 void WeeklyPage::show_state()

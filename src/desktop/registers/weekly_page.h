@@ -45,8 +45,10 @@ private:
     [[nodiscard]] bool at_entry() const;
     /// Runs what saves; false also when that failed, which is told.
     [[nodiscard]] bool stored(const std::function<bool()>& store);
-    /// Offers to save the open date's figures, without which a report on its project would be made. False: no report.
-    [[nodiscard]] bool settle_for_report(int project);
+    /// Offers to save the open date's figures, without which a report on its project would be made; returns what is
+    /// then to be remarked on it. Nullopt: no report.
+    [[nodiscard]] std::optional<QString> settle_for_report(int project);
+    void remark(const QString& words);
     void show_state();
 
     Desk& m_desk;

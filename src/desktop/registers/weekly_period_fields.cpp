@@ -3,9 +3,11 @@
 #include "desktop/registers/year_field.h"
 #include "desktop/shell/date_field.h"
 #include "desktop/shell/look.h"
+#include "registers/day_refusal.h"
 
 #include <QComboBox>
 #include <QGridLayout>
+#include <QHBoxLayout>
 #include <QLabel>
 #include <QLineEdit>
 
@@ -20,6 +22,7 @@ namespace {
 const QString period_key = u"weekly/period_"_s;
 constexpr int years_proposed = 5;
 constexpr int year_width = 96;
+constexpr int caption_width = 52;
 
 struct KindName
 {
@@ -32,6 +35,11 @@ constexpr std::array all_kinds{
     KindName{PeriodKind::financial_year, "Financial year"},
     KindName{PeriodKind::year_span, "Several years"},
 };
+
+QString kind_key(ReportPeriod report)
+{
+    return period_key + u"kind_%1"_s.arg(int(report));
+}
 
 bool fits(PeriodKind kind, ReportPeriod report)
 {
@@ -48,20 +56,43 @@ bool fits(PeriodKind kind, ReportPeriod report)
     return false;
 }
 
+/// The year so far, this year, the last five years and the last two.
+QHash<QString, QString> proposals(const core::Date& today)
+{
+    const auto year = QString::number(today.year);
+    return {{u"from"_s, core::Date{today.year, 1, 1}.stored()},
+            {u"to"_s, today.stored()},
+            {u"year"_s, year},
+            {u"from_year"_s, QString::number(today.year - years_proposed + 1)},
+            {u"to_year"_s, year},
+            {u"compared_year"_s, QString::number(today.year - 1)},
+            {u"with_year"_s, year}};
+}
+
 } // namespace
 
+QLayout* with_caption(const QString& caption, QWidget* control)
+{
+    auto* words = new QLabel(caption);
+    words->setBuddy(control);
+    keep_width(*words, caption_width);
+    auto* row = new QHBoxLayout;
+    row->setSpacing(space::field);
+    row->addWidget(words);
+    row->addWidget(control, 1);
+    return row;
+}
+
 WeeklyPeriodFields::WeeklyPeriodFields(Desk& desk, QWidget* parent)
-    : QWidget(parent), m_desk(desk), m_kind(new QComboBox), m_today(core::Date::from(desk.office.clock.today())),
-      m_year(make_year(u"year"_s)), m_from_year(make_year(u"from_year"_s)),
-      m_to_year(make_year(u"to_year"_s)), m_years{kept_year(u"from_year"_s, m_today.year - years_proposed + 1),
-                                                  kept_year(u"to_year"_s, m_today.year)},
-      m_two_years{kept_year(u"compared_year"_s, m_today.year - 1), kept_year(u"with_year"_s, m_today.year)},
-      m_first(new QLabel), m_second(new QLabel(u"&To"_s))
+    : QWidget(parent), m_desk(desk), m_kind(new QComboBox),
+      m_proposed(proposals(core::Date::from(desk.office.clock.today()))), m_from(make_date(u"from"_s, m_from_date)),
+      m_to(make_date(u"to"_s, m_to_date)), m_year(make_year(u"year"_s)), m_from_year(make_year(u"from_year"_s)),
+      m_to_year(make_year(u"to_year"_s)), m_years{remembered(u"from_year"_s), remembered(u"to_year"_s)},
+      m_two_years{remembered(u"compared_year"_s), remembered(u"with_year"_s)}, m_first(new QLabel),
+      m_second(new QLabel(u"&To"_s))
 {
     m_kind->setObjectName(u"period_kind"_s);
-    m_from = make_date(u"from"_s, {m_today.year, 1, 1}, m_from_date);
-    m_to = make_date(u"to"_s, m_today, m_to_date);
-    m_year->setCurrentText(kept_year(u"year"_s, m_today.year));
+    m_year->setCurrentText(remembered(u"year"_s));
     show_span();
     auto* caption = new QLabel(u"P&eriod"_s);
     caption->setBuddy(m_kind);
@@ -86,14 +117,12 @@ WeeklyPeriodFields::WeeklyPeriodFields(Desk& desk, QWidget* parent)
     fit(m_report);
 }
 
-DateField* WeeklyPeriodFields::make_date(const QString& name, const core::Date& proposed,
-                                         std::optional<core::Date>& date)
+DateField* WeeklyPeriodFields::make_date(const QString& name, std::optional<core::Date>& date)
 {
-    const auto kept = core::Date::from_stored(m_desk.remembered.value(period_key + name).toString());
-    date = kept.value_or(proposed);
+    date = core::Date::from_stored(remembered(name));
     auto* field = new DateField(m_desk.office);
     field->setObjectName(name);
-    field->require_year(registers::year_missing);
+    field->require_year(registers::day_refusal);
     field->show_date(date);
     connect(field, &DateField::entered, this, [&date](std::optional<core::Date> typed) { date = typed; });
     return field;
@@ -107,9 +136,10 @@ YearField* WeeklyPeriodFields::make_year(const QString& name)
     return field;
 }
 
-QString WeeklyPeriodFields::kept_year(const QString& name, int proposed) const
+QString WeeklyPeriodFields::remembered(const QString& name) const
 {
-    return m_desk.remembered.value(period_key + name, proposed).toString();
+    const auto kept = m_desk.remembered.value(period_key + name).toString();
+    return kept.isEmpty() ? m_proposed.value(name) : kept;
 }
 
 WeeklyPeriodFields::Span& WeeklyPeriodFields::span()
@@ -139,8 +169,7 @@ void WeeklyPeriodFields::fit(ReportPeriod report)
         for (const auto& each : all_kinds)
             if (fits(each.kind, report))
                 m_kind->addItem(QString::fromLatin1(each.name), int(each.kind));
-        m_kind->setCurrentIndex(
-            std::max(m_kind->findData(m_desk.remembered.value(period_key + u"kind_%1"_s.arg(int(report)))), 0));
+        m_kind->setCurrentIndex(std::max(m_kind->findData(m_desk.remembered.value(kind_key(report))), 0));
     }
     show_fields();
 }
@@ -176,22 +205,21 @@ std::optional<registers::PeriodChoice> WeeklyPeriodFields::choice()
                                    .to_year = m_to_year->currentText()};
 }
 
-void WeeklyPeriodFields::keep(const QString& name, const QVariant& value)
+void WeeklyPeriodFields::keep(const QString& name, const QString& value)
 {
-    m_desk.remembered.keep(period_key + name, value);
+    m_desk.remembered.keep(period_key + name, value == m_proposed.value(name) ? QString() : value);
 }
 
 void WeeklyPeriodFields::keep_kind()
 {
-    keep(u"kind_%1"_s.arg(int(m_report)), int(kind()));
+    m_desk.remembered.keep(kind_key(m_report), int(kind()));
 }
 
 void WeeklyPeriodFields::remember()
 {
     take_span();
     keep(u"from"_s, m_from_date ? m_from_date->stored() : QString());
-    // Up to today is up to whatever day it is the next time.
-    keep(u"to"_s, m_to_date && *m_to_date != m_today ? m_to_date->stored() : QString());
+    keep(u"to"_s, m_to_date ? m_to_date->stored() : QString());
     keep(u"year"_s, m_year->currentText());
     keep(u"from_year"_s, m_years.from);
     keep(u"to_year"_s, m_years.to);

@@ -3,15 +3,20 @@
 #include "desktop/shell/desk.h"
 #include "registers/weekly_reports.h"
 
+#include <QHash>
 #include <QWidget>
 
 class QComboBox;
 class QLabel;
+class QLayout;
 
 namespace kindrel::desktop {
 
 class DateField;
 class YearField;
+
+/// The control behind its caption, which ends where those of the period's fields do.
+[[nodiscard]] QLayout* with_caption(const QString& caption, QWidget* control);
 
 /// The period of a report: a date range, a calendar or financial year, or several years, as far as the report is made
 /// of them. What was chosen last is remembered.
@@ -20,8 +25,6 @@ class WeeklyPeriodFields : public QWidget
     Q_OBJECT
 
 public:
-    static constexpr int caption_width = 52;
-
     explicit WeeklyPeriodFields(Desk& desk, QWidget* parent = nullptr);
 
     /// Offers the kinds of period that the report can be of.
@@ -42,19 +45,20 @@ private:
     [[nodiscard]] Span& span();
     void show_span();
     void take_span();
-    void keep(const QString& name, const QVariant& value);
+    /// What was chosen last, else what is proposed.
+    [[nodiscard]] QString remembered(const QString& name) const;
+    /// A proposal that stands is not kept: it goes on with the calendar.
+    void keep(const QString& name, const QString& value);
     void keep_kind();
     [[nodiscard]] registers::PeriodKind kind() const;
     [[nodiscard]] YearField* make_year(const QString& name);
-    [[nodiscard]] QString kept_year(const QString& name, int proposed) const;
-    [[nodiscard]] DateField* make_date(const QString& name, const core::Date& proposed,
-                                       std::optional<core::Date>& date);
+    [[nodiscard]] DateField* make_date(const QString& name, std::optional<core::Date>& date);
     void show_fields();
 
     Desk& m_desk;
     registers::ReportPeriod m_report = registers::ReportPeriod::any_days;
     QComboBox* m_kind;
-    core::Date m_today; ///< When the fields were made.
+    QHash<QString, QString> m_proposed; ///< When the fields were made: years, and dates as they are stored.
     std::optional<core::Date> m_from_date, m_to_date;
     DateField *m_from, *m_to;
     YearField *m_year, *m_from_year, *m_to_year;

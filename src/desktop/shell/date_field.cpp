@@ -23,7 +23,7 @@ DateField::DateField(core::Office& office, QWidget* parent) : QLineEdit(parent),
     connect(this, &QLineEdit::editingFinished, this, &DateField::finish);
 }
 
-void DateField::require_year(const QString& refusal)
+void DateField::require_year(Refusal refusal)
 {
     m_year_refusal = refusal;
     setToolTip(shortcuts);
@@ -43,12 +43,10 @@ bool DateField::finish()
         return !m_telling;
     const QString typed = text().trimmed();
     const auto date = typed_date(m_office, typed);
-    if (!typed.isEmpty() && !date) {
-        refuse(core::bad_date_message(m_office.day_order()));
-        return false;
-    }
-    if (date && !date->year_known() && !m_year_refusal.isEmpty()) {
-        refuse({m_year_refusal});
+    const bool usable = date && (date->year_known() || !m_year_refusal);
+    if (!typed.isEmpty() && !usable) {
+        const auto order = m_office.day_order();
+        refuse(m_year_refusal ? m_year_refusal(typed, order) : core::bad_date_message(order));
         return false;
     }
     setModified(false);

@@ -14,8 +14,10 @@ class DateField : public QLineEdit
 public:
     explicit DateField(core::Office& office, QWidget* parent = nullptr);
 
-    /// From now on a date without its year is no date; `refusal` is said to it.
-    void require_year(const QString& refusal);
+    /// What is said to what was typed and is no date.
+    using Refusal = core::Message (*)(const QString& typed, core::DayOrder order);
+    /// From now on a date without its year is no date.
+    void require_year(Refusal refusal);
     /// What is being typed stays.
     void show_date(std::optional<core::Date> date);
     /// Reads what was typed; false, after saying why, when it is no date. It then stays, with the cursor in it.
@@ -35,7 +37,7 @@ private:
     void refuse(const core::Message& why);
 
     core::Office& m_office;
-    QString m_year_refusal; ///< Empty: the year need not be known.
+    Refusal m_year_refusal = nullptr; ///< Null: the year need not be known.
     std::optional<core::Date> m_date;
     bool m_telling = false;
 };

@@ -97,6 +97,12 @@ void OrderedListEditor::add_commands()
     connect(insert, &QShortcut::activated, this, &OrderedListEditor::focus_add_line);
 }
 
+void OrderedListEditor::drop_letters()
+{
+    for (auto* button : findChildren<QAbstractButton*>())
+        button->setText(button->text().remove(u'&'));
+}
+
 int OrderedListEditor::current() const
 {
     return m_table->currentIndex().row();

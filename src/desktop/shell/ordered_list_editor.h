@@ -40,6 +40,8 @@ public:
     [[nodiscard]] bool finish_typing();
     void drop_typing();
 
+    /// Of several lists in sight only one has letters on its buttons; all have the keys.
+    void drop_letters();
     /// For further controls under the buttons.
     [[nodiscard]] CommandSide& side() { return *m_side; }
     [[nodiscard]] QTableView& table() { return *m_table; }

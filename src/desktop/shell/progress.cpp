@@ -42,7 +42,10 @@ void QtProgress::begin(const QString& what, int steps, const QString& cancel_que
 bool QtProgress::step(const QString& what)
 {
     ++m_done;
-    if (!m_box || m_now() - m_begun < noticed_after || (m_box->isVisible() && m_now() - m_shown < refresh_time))
+    if (!m_box || m_now() - m_begun < noticed_after)
+        return true;
+    const bool news = !what.isEmpty() && what != m_box->labelText();
+    if (!news && m_box->isVisible() && m_now() - m_shown < refresh_time)
         return true;
     show_state(what);
     return !m_box->wasCanceled() || !cancel_confirmed();

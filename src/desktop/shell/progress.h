@@ -12,8 +12,8 @@ namespace kindrel::desktop {
 
 class SessionHold;
 
-/// A box with a bar in front of everything, once a run has lasted long enough to be noticed. The program stays open
-/// until the run has ended.
+/// A box with a bar in front of everything, once a run has lasted long enough to be noticed. A new text is shown at
+/// once, so it belongs to a few steps of a run. The program stays open until the run has ended.
 class QtProgress : public core::Progress
 {
 public:

@@ -2,8 +2,6 @@
 
 #include "pages/text_layout.h"
 
-#include <QTextBoundaryFinder>
-
 #include <algorithm>
 #include <cmath>
 
@@ -26,10 +24,10 @@ qreal rounded_down(qreal size)
 pages::TextStyle word_style(const LabelText& text, qreal room, pages::TextMetrics& metrics)
 {
     auto style = text.style;
-    auto widest = widest_word(text.text, style, metrics);
+    auto widest = pages::widest_word(text.text, style, metrics);
     while (widest > room && style.size > text.style.size * smallest) {
         style.size = rounded_down(style.size * std::min(room / widest, 0.99));
-        widest = widest_word(text.text, style, metrics);
+        widest = pages::widest_word(text.text, style, metrics);
     }
     return style;
 }
@@ -50,15 +48,6 @@ pages::Drawing laid_out(std::span<const LabelText> texts, qreal width, qreal fac
 }
 
 } // namespace
-
-qreal widest_word(const QString& text, const pages::TextStyle& style, pages::TextMetrics& metrics)
-{
-    QTextBoundaryFinder places(QTextBoundaryFinder::Line, text);
-    qreal widest = 0;
-    for (auto from = places.position(); places.toNextBoundary() > from; from = places.position())
-        widest = std::max(widest, metrics.width(text.sliced(from, places.position() - from).trimmed(), style));
-    return widest;
-}
 
 pages::Drawing fitted(std::span<const LabelText> texts, QSizeF room, pages::Align align, pages::TextMetrics& metrics)
 {

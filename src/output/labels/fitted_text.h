@@ -19,7 +19,4 @@ struct LabelText
 [[nodiscard]] pages::Drawing fitted(std::span<const LabelText> texts, QSizeF room, pages::Align align,
                                     pages::TextMetrics& metrics);
 
-/// The width of the longest stretch that no line breaks into. Lines break at blanks and behind hyphens.
-[[nodiscard]] qreal widest_word(const QString& text, const pages::TextStyle& style, pages::TextMetrics& metrics);
-
 } // namespace kindrel::output

@@ -94,6 +94,7 @@ Entry entry_of(EntryShape shape)
 }
 
 /// Whether no letter comes back once the list has gone on to another: bands would then tell the reader where to look.
+/// What begins with no letter may stand before them as well as behind them.
 bool runs_by_letter(const ReportInput& input)
 {
     auto& session = *input.office.session;
@@ -102,13 +103,16 @@ bool runs_by_letter(const ReportInput& input)
                                "INNER JOIN [tbl_surname] s ON s.[Surname_ID]=w.[surname_id] "
                                "GROUP BY w.[surname_id],s.[sort_key] ORDER BY MIN(w.[place]);"_s);
     const auto key = rows.column(u"sort_key");
+    const auto no_letter = pages::filing_letter({});
     QSet<QString> seen;
     QString letter;
     for (const core::Row& row : rows) {
         const auto next = pages::filing_letter(row.text(key));
         if (next != letter && seen.contains(next))
             return false;
-        seen.insert(letter = next);
+        letter = next;
+        if (letter != no_letter)
+            seen.insert(letter);
     }
     return true;
 }

@@ -3,6 +3,7 @@
 #include "output/report_layout.h"
 #include "output/reports/family_data_rows.h"
 #include "pages/table.h"
+#include "people/data_search.h"
 
 #include <algorithm>
 #include <array>
@@ -32,6 +33,8 @@ struct FamilyDataLayout
     people::Extent extent;
     std::array<DataColumn, 4> columns; ///< Of a row's `who` and its values.
     DataRows (*rows)(const ListedFamily&);
+    /// The part of the record without which a family is left out, unread; null where most families have it.
+    const char* part = nullptr;
 };
 static_assert(std::is_standard_layout_v<FamilyDataLayout>);
 
@@ -55,7 +58,8 @@ constexpr std::array layouts{
                      "There are no occupations among these people",
                      Part::occupations,
                      {name, {"Occupations", 52}},
-                     occupation_rows},
+                     occupation_rows,
+                     "Occupation"},
     FamilyDataLayout{{.title = "Status Report"},
                      "There are no statuses among these people",
                      Part::status,
@@ -65,12 +69,14 @@ constexpr std::array layouts{
                      "There are no groups among these people",
                      Part::groups,
                      {name, {"Groups", 52}},
-                     group_rows},
+                     group_rows,
+                     "Groups"},
     FamilyDataLayout{{.title = "Ministry Report"},
                      "There are no ministries among these people",
                      Part::ministries,
                      {name, {"Active Ministries", 26}, {"Potential Ministries", 26}},
-                     ministry_rows},
+                     ministry_rows,
+                     "Ministries"},
     FamilyDataLayout{{.title = "Individual Date Report"},
                      "There are no individual dates among these people",
                      Part::dates,
@@ -80,32 +86,38 @@ constexpr std::array layouts{
                      "There are no flexi fields among these people",
                      Part::flexi,
                      {name, {"Flexi Field", 18}, {"Value", 24}, tagged},
-                     flexi_rows},
+                     flexi_rows,
+                     "Flexi Fields"},
     FamilyDataLayout{{.title = "Other Contact Report"},
                      "There are no other contacts among these families",
                      Part::other_contacts,
                      {people_of_family, {"Contact", 22}, {"Phone", 20}},
-                     other_contact_rows},
+                     other_contact_rows,
+                     "Other Contacts"},
     FamilyDataLayout{{.title = "Family Group Report"},
                      "There are no family groups among these families",
                      Part::family_groups,
                      {people_of_family, {"Family Groups", 42}},
-                     family_group_rows},
+                     family_group_rows,
+                     "Family Groups"},
     FamilyDataLayout{{.title = "Family Events Report"},
                      "There are no events among these families",
                      Part::events,
                      {{{"People", 26}, {"Date", 14}, {"Event", 36}}},
-                     event_rows},
+                     event_rows,
+                     "Events"},
     FamilyDataLayout{{.title = "Family Date Report"},
                      "There are no family dates among these families",
                      Part::family_dates,
                      {{{"People", 26}, {"Description", 24}, {"Date", 16}, tagged}},
-                     family_date_rows},
+                     family_date_rows,
+                     "Family Dates"},
     FamilyDataLayout{{.title = "Visitation Report"},
                      "There are no visits among these families",
                      Part::visits,
                      {{{"People", 18}, {"Date", 13}, {"Visitor", 20}, {"Comments", 34}}},
-                     visit_rows},
+                     visit_rows,
+                     "Visitation"},
     FamilyDataLayout{{.title = "Email Report"},
                      "There are no e-mail addresses among these people",
                      Part::address | Part::details,
@@ -120,12 +132,14 @@ constexpr std::array layouts{
                      "There are no preferred names among these people",
                      {},
                      {name, {"Preferred Name", 52}},
-                     preferred_name_rows},
+                     preferred_name_rows,
+                     "Preferred Given Name"},
     FamilyDataLayout{{.title = "School Year Report"},
                      "There are no school years among these people",
                      Part::details,
                      {name, {"School Year", 52}},
-                     school_year_rows},
+                     school_year_rows,
+                     "School Year"},
 };
 
 /// The columns side by side and one inside the other: a family's cell holds a row for each `who`, whose cell holds
@@ -222,15 +236,26 @@ private:
     std::optional<pages::Table> m_table;
 };
 
+/// Those of the list that the report is about, in its order.
+std::vector<int> families_of(const ReportInput& input, const FamilyDataLayout& layout)
+{
+    auto families = input.list.families();
+    if (layout.part) {
+        const auto with = people::families_with(*input.office.session, layout.part);
+        std::erase_if(families, [&](int family) { return !with.contains(family); });
+    }
+    return families;
+}
+
 bool write_family_data(const ReportInput& input, const void* row, core::Progress& progress, pages::Flow& flow)
 {
     const auto& layout = *static_cast<const FamilyDataLayout*>(row);
     DataTable table(flow, layout);
-    const auto write = [&](const ListedFamily& listed) {
+    const auto write = [&](const ListedFamily& listed, std::size_t) {
         if (const auto rows = layout.rows(listed); !rows.empty())
             table.write(listed.family.family().surname, rows);
     };
-    if (!for_each_family(input, progress, write, layout.extent))
+    if (!for_each_family_of(input, families_of(input, layout), progress, write, layout.extent))
         return false;
     if (table.empty())
         flow.line(QString::fromUtf8(layout.none));

@@ -85,7 +85,7 @@ CaptionLines contacts_of(const ListedMember& listed, MemberDetails details)
             lines.push_back({pair});
     }
     if (details == MemberDetails::personal)
-        std::ranges::move(personal_contacts(listed.family, listed.person), std::back_inserter(lines));
+        std::ranges::move(personal_contacts(listed), std::back_inserter(lines));
     return lines;
 }
 

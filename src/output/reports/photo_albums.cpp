@@ -2,10 +2,9 @@
 
 #include "output/decoration.h"
 #include "output/family_lines.h"
-#include "output/labels/fitted_text.h"
 #include "output/report_layout.h"
 #include "pages/table.h"
-#include "pages/text_metrics.h"
+#include "pages/text_layout.h"
 #include "people/person_files.h"
 
 #include <QDir>
@@ -127,7 +126,7 @@ private:
 Entry entry_of(const Portraits& portraits, const ListedMember& listed, QSizeF frame)
 {
     auto contacts = family_contacts(listed.family);
-    std::ranges::move(personal_contacts(listed.family, listed.person), std::back_inserter(contacts));
+    std::ranges::move(personal_contacts(listed), std::back_inserter(contacts));
     return {portraits.of(listed.person, frame), joined(u" ", {listed.name(), listed.surname()}),
             address_lines(listed.family, people::SuburbType::residential),
             address_lines(listed.family, people::SuburbType::postal), std::move(contacts)};
@@ -192,7 +191,7 @@ void write_text(pages::Writer& place, const Entry& entry, AlbumText text)
 bool holds_words(pages::Writer& place, const Entry& entry, AlbumText text)
 {
     const auto holds = [&](const QString& words, const pages::TextStyle& style) {
-        return widest_word(words, style, place.metrics()) <= place.width();
+        return pages::widest_word(words, style, place.metrics()) <= place.width();
     };
     const auto& type = place.type();
     bool all = holds(entry.name, type.headings[1]);

@@ -114,12 +114,19 @@ TEST_F(DirectoryLayoutsTest, ALetterOfAnotherAlphabetIsFiledWhereTheListFilesIt)
 
 TEST_F(DirectoryLayoutsTest, AListInAnotherOrderThanThatOfSurnamesHasNoLetters)
 {
+    const std::vector<std::pair<QStringList, std::string>> cases{
+        {{u"Abel"_s, u"Zuse"_s, u"Adams"_s}, "Abel | Ann | Zuse | Ann | Adams | Ann"},
+        {{u"Abel"_s, u"4 Square"_s, u"Adams"_s}, "Abel | Ann | 4 Square | Ann | Adams | Ann"},
+        {{u"4 Square"_s, u"Abel"_s, u"[Unknown]"_s}, "# | 4 Square | Ann | A | Abel | Ann | # | [Unknown] | Ann"},
+        {{u"Abel"_s, u"Zuse"_s}, "A | Abel | Ann | Z | Zuse | Ann"},
+    };
     choose(u"k12");
-    add({unlisted(u"Abel"_s, u"Ann"_s), unlisted(u"Zuse"_s, u"Ann"_s), unlisted(u"Adams"_s, u"Ann"_s)});
-    EXPECT_EQ(entries(), "Abel | Ann | Zuse | Ann | Adams | Ann");
-
-    list.members.pop_back();
-    EXPECT_EQ(entries(), "A | Abel | Ann | Z | Zuse | Ann");
+    for (const auto& [surnames, printed] : cases) {
+        list.members.clear();
+        for (const auto& surname : surnames)
+            add({unlisted(surname, u"Ann"_s)});
+        EXPECT_EQ(entries(), printed);
+    }
 }
 
 TEST_F(DirectoryLayoutsTest, TheFootTellsWhichDirectoryItIsWhateverTheTitle)
