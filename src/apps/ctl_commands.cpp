@@ -108,7 +108,7 @@ constexpr std::array command_table{
             "Runs the report with this key or name (see \"reports\") over the active families.",
             Needs::church_and_fonts, core::Area::report_outputs, 1, report_options, run_report},
     Command{"weekly-report",
-            "NAME --pdf FILE [--project NAME] [--year YYYY|--financial-year YYYY|--from DATE --to DATE]",
+            "NAME --pdf FILE [--project NAME] [--year YYYY|--financial-year YYYY|--from DATE|YYYY --to DATE|YYYY]",
             "write a report of weekly statistics to a PDF file",
             "Runs the report with this name, \"Monthly Totals\" or \"weekly_table_report\" for example, over the\n"
             "figures of a period. A name that is none lists them all.",

@@ -115,7 +115,7 @@ std::optional<QString> TerminalDialogue::read_line()
     const auto end = m_read.indexOf('\n');
     if (m_read.isEmpty() || (m_attended && end < 0)) // A line that nobody ended with Enter is no answer.
         return std::nullopt;
-    const QByteArray line = m_read.left(end);
+    const QByteArray line = end < 0 ? m_read : m_read.left(end);
     m_read.remove(0, line.size() + 1);
     return QString::fromUtf8(line.endsWith('\r') ? line.chopped(1) : line);
 }

@@ -25,7 +25,7 @@ QString help_text()
            "  mend               put it right, after a copy of the database was laid into the church's folder 'mended'\n"
            "  unlock             remove every lock and marker that keeps people out; make sure that nobody is inside\n"
            "  recover FILE       write what can be read of a damaged church file into FILE, a new church file\n"
-           "  put-in-place FILE  set the damaged church file aside, put the recovered FILE in its place and mend\n"
+           "  put-in-place FILE  set the damaged or empty church file aside, put the recovered FILE in its place, mend\n"
            "  set-aside          move a damaged church file away, so that Kindrel starts and a backup can be restored\n\n"
            "Options:\n"
            "  --data-drive DIR  the folder that holds Kindrel_10_Data (default: the workstation's own)\n"

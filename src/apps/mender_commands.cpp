@@ -3,6 +3,7 @@
 #include "core/mender_words.h"
 #include "people/mender_people.h"
 
+#include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
@@ -149,13 +150,23 @@ bool unlock(const MenderContext& context)
     return true;
 }
 
+/// How to go on with the new church file, where that may come in the place of the church's own.
+void tell_way_into_place(const MenderContext& context, bool gives_way)
+{
+    const QFileInfo own(context.place.paths.database());
+    const bool stands_there = own.exists() && own == QFileInfo(context.order.target);
+    if (gives_way && !stands_there)
+        context.out << words::after_recovering() << '\n';
+}
+
 bool recover(const MenderContext& context)
 {
     const auto& order = context.order;
     const QString damaged = order.damaged.isEmpty() ? context.place.paths.database() : order.damaged;
-    context.place.session.reset();
     if (!agreed(context, words::recovering_question(damaged, order.target)))
         return refuse(context, u"Nothing was written."_s);
+    const bool gives_way = core::gives_way(context.place, core::file_damaged(core::examine_church(context.place, {})));
+    context.place.session.reset();
     const auto tables = core::recover_church(damaged, order.target);
     bool whole = true;
     for (const auto& table : tables) {
@@ -163,7 +174,8 @@ bool recover(const MenderContext& context)
         if (table.rows > 0 || !words::came_whole(table))
             context.out << table.table << ": " << words::came_of(table) << '\n';
     }
-    context.out << words::where_recovered(damaged, order.target) << '\n' << words::after_recovering() << '\n';
+    context.out << words::where_recovered(damaged, order.target) << '\n';
+    tell_way_into_place(context, gives_way);
     return whole;
 }
 

@@ -157,16 +157,15 @@ void demand_no_own_file(const MenderPlace& place, const QString& recovered)
 }
 
 /// Codes tell churches apart; one that was never backed up has none.
-void demand_of_this_church(const MenderPlace& place, Session& recovered)
+void demand_of_church(const QString& own, Session& recovered)
 {
-    const QString file = place.paths.database();
-    const QString own = QFileInfo::exists(file) ? code_of_damaged(file) : QString();
     const QString code = summary_of(recovered, {}).church_code;
     if (!own.isEmpty() && !code.isEmpty() && own != code)
         throw FileError(u"The recovered file is of another church."_s);
 }
 
-void demand_fit(const MenderPlace& place, const QString& recovered)
+/// `own_code` is the one of the church; empty where the file may be of any.
+void demand_fit(const MenderPlace& place, const QString& recovered, const QString& own_code)
 {
     if (!QFileInfo::exists(recovered))
         throw FileError(u"'%1' is missing."_s.arg(recovered));
@@ -182,7 +181,7 @@ void demand_fit(const MenderPlace& place, const QString& recovered)
                          [](const Finding& finding) { return finding.cure != Cure::mend; });
     if (!faults.empty())
         throw FileError(u"'%1' does not fit this edition: %2"_s.arg(recovered, faults.front().words));
-    demand_of_this_church(place, *fresh.session);
+    demand_of_church(own_code, *fresh.session);
 }
 
 /// The recovered file on the disk of the church, since names are exchanged on one disk only: a copy where it lies on
@@ -294,10 +293,12 @@ Placement put_in_place(MenderPlace& place, const QString& recovered, std::span<c
         const auto busy =
             alone_in(place, u"This church lies on a server: there a recovered file cannot take its place."_s);
         const bool there = QFileInfo::exists(place.paths.database());
-        if (there && !gives_way(place, is_damaged(place)))
+        const bool damaged = there && is_damaged(place);
+        if (there && !gives_way(place, damaged))
             throw FileError(mender_words::no_place_for_recovered());
         leave_file(place);
-        demand_fit(place, recovered);
+        // A sound church without any family got its code after the recovered file got another one.
+        demand_fit(place, recovered, damaged ? code_of_damaged(place.paths.database()) : QString());
         const OnDiskOfChurch on_disk(place, recovered);
         const QString fresh = on_disk.provide();
         placement.aside = there ? exchange(place, fresh) : fill_gap(place, fresh);

@@ -42,6 +42,8 @@ const QString present_unkept =
     "The present files are copied as they are."_s;
 const QString inside_unknown =
     u"It cannot be told whether somebody is working in this church. Do you wish to restore nevertheless?"_s;
+const QString cannot_be_told =
+    u"It cannot be told yet whether the backup is in place. Start Kindrel again: it settles it."_s;
 const QString unchecked = u"unchecked_"_s;
 const QString newer = u"This backup was made by a newer edition of Kindrel, you need to obtain the latest update."_s;
 const QString older = u"This backup was made by an edition of Kindrel that is too old to be restored."_s;
@@ -301,6 +303,16 @@ void remove_oldest_safety_backups(const Office& office, const QString& just_rest
         QDir(folder + name).removeRecursively();
 }
 
+/// True when the backup is in place though replacing the church failed: the answer may have been lost alone.
+bool in_place_nevertheless(const Office& office, RestoreWork& work)
+{
+    try {
+        return work.settle(*office.session);
+    } catch (const std::runtime_error& error) { // Of the database or a file; a damaged record was moved away.
+        throw RestoreUnsettled(restore_unsettled(office.paths) ? cannot_be_told : QString::fromUtf8(error.what()));
+    }
+}
+
 /// From here on nothing is asked and nothing can be stopped. What fails once the database has its new content is no
 /// failure of the restore.
 void exchange(Office& office, RestoreWork& work, const std::vector<Swap>& swaps)
@@ -311,7 +323,7 @@ void exchange(Office& office, RestoreWork& work, const std::vector<Swap>& swaps)
         office.session->replace_content(work.unpacked() + database_entry);
         work.demand_undisturbed();
     } catch (...) {
-        if (!work.settle(*office.session))
+        if (!in_place_nevertheless(office, work))
             throw;
         return;
     }

@@ -166,15 +166,20 @@ void Running::restore(RestorePage& page)
 {
     if (!m_window->make_way_for(u"restore"_s))
         return;
-    const auto report = core::restore_backup(*m_office, page.request(), m_surroundings.progress);
-    if (!report) {
-        page.say_unchanged();
-        return;
+    core::Message outcome;
+    try {
+        const auto report = core::restore_backup(*m_office, page.request(), m_surroundings.progress);
+        if (!report) {
+            page.say_unchanged();
+            return;
+        }
+        outcome = restored_message(*report, m_office->day_order());
+    } catch (const core::RestoreUnsettled& unsettled) {
+        outcome.text = unsettled.text();
     }
-    const core::Message restored = restored_message(*report, m_office->day_order());
     const int church = m_office->church;
     close();
-    m_surroundings.dialogue.show(restored);
+    m_surroundings.dialogue.show(outcome);
     if (!start(church) && m_surroundings.ended)
         m_surroundings.ended();
 }

@@ -300,4 +300,23 @@ QString heading_of(const DataPart& part)
         .arg(latin(part.name));
 }
 
+WorkingList living_with(core::Session& session, const DataPart& part, const std::vector<DataEntry>& entries)
+{
+    WorkingList living{{}, u"%1, without the deceased"_s.arg(heading_of(part))};
+    if (part.owner == DataOwner::person) {
+        for (const DataEntry& entry : entries)
+            if (!entry.states.deceased)
+                living.members.push_back(entry.member);
+        return living;
+    }
+    QHash<int, int> heads;
+    auto rows = session.select(u"SELECT [Surname_ID],[person_id] FROM [qry_Kindrel_address_book];"_s);
+    for (const core::Row& row : rows)
+        heads.insert(row.integer(Column{0}), row.integer(Column{1}));
+    for (const DataEntry& entry : entries)
+        if (const int head = heads.value(entry.member.surname_id))
+            living.members.push_back({head, entry.member.surname_id});
+    return living;
+}
+
 } // namespace kindrel::people

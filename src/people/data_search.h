@@ -32,4 +32,9 @@ struct DataEntry
 /// What the list of a part is called: "People with an entry in Birth Date".
 [[nodiscard]] QString heading_of(const DataPart& part);
 
+/// Those with the entries of the part as a list to go on with; the first who lives stands for a family. No letter is to
+/// go to those who have died.
+[[nodiscard]] WorkingList living_with(core::Session& session, const DataPart& part,
+                                      const std::vector<DataEntry>& entries);
+
 } // namespace kindrel::people

@@ -66,9 +66,22 @@ std::vector<Member> members_of(const std::vector<ListedPerson>& people)
     return members;
 }
 
+/// Those who live now, whenever they were found.
+WorkingList living(core::Session& session, const WorkingList& list)
+{
+    lend(session, list);
+    auto rows = session.select(u"SELECT w.[person_id],w.[surname_id] FROM [work_people] w INNER JOIN [tbl_people] p "
+                               "ON p.[person_id]=w.[person_id] WHERE p.[Decease]=0 ORDER BY w.[place];"_s);
+    WorkingList alive{{}, list.criteria};
+    for (const core::Row& row : rows)
+        alive.members.push_back({row.integer(core::Column{0}), row.integer(core::Column{1})});
+    return alive;
+}
+
 WorkingList in_order(core::Office& office, const ListPlan& plan)
 {
-    auto list = plan.found ? *plan.found : find_people(*office.session, plan.filter, day_of(office));
+    auto list =
+        plan.found ? living(*office.session, *plan.found) : find_people(*office.session, plan.filter, day_of(office));
     if (!plan.found && plan.added.empty() && plan.sort == SortOrder{})
         return list; // The filter finds them in this order.
     const auto more = lacking(list.members, plan.added);
@@ -136,11 +149,13 @@ void add_by_hand(ListPlan& plan, const std::vector<Member>& members)
     std::ranges::copy(lacking(plan.added, members).members, std::back_inserter(plan.added));
 }
 
-void strike_by_hand(ListPlan& plan, int person_id)
+void strike_by_hand(ListPlan& plan, const std::vector<int>& people)
 {
-    std::erase_if(plan.added, [&](const Member& member) { return member.person_id == person_id; });
-    if (std::ranges::find(plan.struck, person_id) == plan.struck.end())
-        plan.struck.push_back(person_id);
+    QSet<int> struck(people.begin(), people.end());
+    std::erase_if(plan.added, [&](const Member& member) { return struck.contains(member.person_id); });
+    for (const int person : plan.struck)
+        struck.remove(person);
+    plan.struck.insert(plan.struck.end(), struck.begin(), struck.end());
 }
 
 } // namespace kindrel::people

@@ -29,7 +29,7 @@ struct ListPlan
     SortOrder sort;
     ListRange range;
     Needs needs;
-    std::optional<WorkingList> found = {}; ///< Elsewhere: in place of those whom the filter finds, with its own words.
+    std::optional<WorkingList> found = {}; ///< Elsewhere, in place of the filter's people; who has died is left out.
     std::vector<Member> added = {};        ///< By hand.
     std::vector<int> struck = {};          ///< By hand: keys of people.
 };
@@ -48,6 +48,6 @@ struct MadeList
 
 /// People are put on the list or off it by hand, whatever was done with them before.
 void add_by_hand(ListPlan& plan, const std::vector<Member>& members);
-void strike_by_hand(ListPlan& plan, int person_id);
+void strike_by_hand(ListPlan& plan, const std::vector<int>& people);
 
 } // namespace kindrel::people

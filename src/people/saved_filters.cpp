@@ -133,34 +133,34 @@ bool replace_filter(core::Office& office, const SavedFilter& saved, const Filter
 {
     if (!core::network_guard(office))
         return false;
-    // By its name too: the key of one that was removed may be that of another by now.
     const int touched = office.session->execute(
         u"UPDATE [tbl_filter_memory] SET [content]=? WHERE [filter_id]=? AND [filter_name]=?;"_s,
         QString::fromUtf8(to_json(filter)), saved.filter_id, saved.name);
     return touched > 0 || refuse(office, u"Unable to save this filter as another user has removed or renamed it"_s);
 }
 
-bool rename_filter(core::Office& office, int filter_id, const QString& name)
+bool rename_filter(core::Office& office, const SavedFilter& saved, const QString& name)
 {
     const auto tidied = tidy(name);
     if (!fits(office, tidied))
         return false;
     const auto other = named(*office.session, tidied);
-    if (other && other->filter_id != filter_id)
+    if (other && other->filter_id != saved.filter_id)
         return refuse(office, u"A filter with this name already exists"_s);
     const int touched = office.session->execute(
-        u"UPDATE [tbl_filter_memory] SET [filter_name]=? WHERE [filter_id]=?;"_s, tidied, filter_id);
-    return touched > 0 || refuse(office, u"Unable to rename this filter as another user has removed it"_s);
+        u"UPDATE [tbl_filter_memory] SET [filter_name]=? WHERE [filter_id]=? AND [filter_name]=?;"_s, tidied,
+        saved.filter_id, saved.name);
+    return touched > 0 || refuse(office, u"Unable to rename this filter as another user has removed or renamed it"_s);
 }
 
-bool remove_filter(core::Office& office, const SavedFilter& filter)
+bool remove_filter(core::Office& office, const SavedFilter& saved)
 {
-    const core::Message question{u"Are you sure that you wish to delete the filter '%1'?"_s.arg(filter.name)};
+    const core::Message question{u"Are you sure that you wish to delete the filter '%1'?"_s.arg(saved.name)};
     if (!core::network_guard(office) || !office.dialogue.confirm(question, core::Answer::no))
         return false;
-    office.session->execute(u"DELETE FROM [tbl_filter_memory] WHERE [filter_id]=? AND [filter_name]=?;"_s,
-                            filter.filter_id, filter.name);
-    return true;
+    const int touched = office.session->execute(
+        u"DELETE FROM [tbl_filter_memory] WHERE [filter_id]=? AND [filter_name]=?;"_s, saved.filter_id, saved.name);
+    return touched > 0 || refuse(office, u"Unable to remove this filter as another user has removed or renamed it"_s);
 }
 
 } // namespace kindrel::people

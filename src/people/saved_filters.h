@@ -5,6 +5,7 @@
 
 namespace kindrel::people {
 
+/// Its key alone does not tell it from others: that of one that was removed may be given to another.
 struct SavedFilter
 {
     int filter_id = 0;
@@ -24,8 +25,8 @@ struct SavedFilter
 [[nodiscard]] std::optional<Filter> load_filter(core::Office& office, int filter_id);
 /// Puts the filter in the place of the saved one, which keeps its name. False after saying why not.
 [[nodiscard]] bool replace_filter(core::Office& office, const SavedFilter& saved, const Filter& filter);
-[[nodiscard]] bool rename_filter(core::Office& office, int filter_id, const QString& name);
-/// Asks first.
-[[nodiscard]] bool remove_filter(core::Office& office, const SavedFilter& filter);
+[[nodiscard]] bool rename_filter(core::Office& office, const SavedFilter& saved, const QString& name);
+/// Asks first. False when the answer is no, or after saying why it could not be removed.
+[[nodiscard]] bool remove_filter(core::Office& office, const SavedFilter& saved);
 
 } // namespace kindrel::people

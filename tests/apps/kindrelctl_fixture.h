@@ -61,7 +61,7 @@ class KindrelctlTest : public testing::Test
 {
 protected:
     /// `beforehand` is done in the program's process before it begins.
-    [[nodiscard]] Ended run(const QStringList& words, void (*beforehand)() = nullptr)
+    [[nodiscard]] Ended run(const QStringList& words, void (*beforehand)() = nullptr, const QByteArray& typed = {})
     {
         QProcess program;
         // The leak check at a program's end stumbles over the threads of Qt's painter, which may still be ending then.
@@ -72,6 +72,7 @@ protected:
             program.setChildProcessModifier(beforehand);
         program.start(qEnvironmentVariable("KINDREL_BIN") + u"/kindrelctl"_s,
                       QStringList{u"--data-drive"_s, drive.path()} + words);
+        program.write(typed);
         program.closeWriteChannel();
         if (!program.waitForFinished(120'000) || program.exitStatus() != QProcess::NormalExit)
             return {-1, {}, program.errorString().toUtf8()};

@@ -200,6 +200,10 @@ TEST_F(KindrelctlTest, APasswordOpensItsOwnAreasAlone)
 
     const auto totals = run({u"totals"_s, u"--password-file"_s, file});
     EXPECT_EQ(totals.status, 0) << totals;
+    for (const QByteArray typed : {"finder\n", "finder\r\n", "finder"}) {
+        const auto given = run({u"totals"_s}, nullptr, typed);
+        EXPECT_EQ(given.status, 0) << given;
+    }
     const auto report = run({u"report"_s, u"k10"_s, u"--pdf"_s, pdf(), u"--password-file"_s, file});
     EXPECT_EQ(report.status, 1) << report;
     EXPECT_TRUE(report.err.contains("\"Report Outputs\"")) << report;

@@ -124,6 +124,7 @@ TEST_F(MenderProgramTest, ADatabaseThatCannotBeOpenedIsRecoveredIntoANewFileAndT
     const auto recovered = mender({u"recover"_s, fresh, u"--yes"_s});
     ASSERT_TRUE(QFile::exists(fresh)) << recovered;
     EXPECT_TRUE(recovered.out.contains("tbl_surname: ")) << recovered;
+    EXPECT_TRUE(recovered.out.contains("kindrel-mender put-in-place")) << recovered;
     EXPECT_EQ(DataFolder::read(database()), content);
 
     ASSERT_TRUE(QFile::rename(database(), database() + u".damaged"_s) && QFile::rename(fresh, database()));
@@ -177,6 +178,14 @@ TEST_F(MenderProgramTest, ARecoveredFileIsPutInPlaceOnceNobodyWritesInTheDamaged
     EXPECT_TRUE(put.out.contains("KR10_records set aside")) << put;
     EXPECT_EQ(families(), 30);
     EXPECT_FALSE(QFile::exists(fresh));
+}
+
+TEST_F(MenderProgramTest, AFileRecoveredFromASoundChurchIsNotSaidToComeInItsPlace)
+{
+    const auto recovered = mender({u"recover"_s, drive.filePath(u"fresh.kdl"_s), u"--yes"_s});
+    EXPECT_EQ(recovered.status, 0) << recovered;
+    EXPECT_TRUE(recovered.out.contains("The new church file is")) << recovered;
+    EXPECT_FALSE(recovered.out.contains("put-in-place")) << recovered;
 }
 
 TEST_F(MenderProgramTest, WrongUsageIsToldAndNothingIsDone)

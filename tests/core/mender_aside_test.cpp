@@ -234,7 +234,8 @@ TEST_P(MenderAsideTest, ARecoveredFileTakesThePlaceOfAnEmptyChurchAndNotOfASound
 
     place->session.reset();
     QFile::remove(file());
-    DataFolder::make_church(in_church({})); // As a start does after the damaged file was set aside.
+    DataFolder::make_church(in_church({})); // As a start does after the damaged file was set aside, and a backup then:
+    open_sqlite(file())->execute(u"UPDATE [tbl_startup] SET [church_code]='fresh';"_s);
     const QByteArray empty = DataFolder::read(file());
     open_to_mend(*place);
     EXPECT_TRUE(gives_way(*place, false));

@@ -1,4 +1,5 @@
 #include "core/restore.h"
+#include "core/restore_swap.h"
 #include "desktop/backup_fixture.h"
 
 #include <QCheckBox>
@@ -16,6 +17,21 @@ namespace {
 const QString replace_question = u"Do you wish to replace the data of 'Church1' by the backup of 15/05/2024 10:30?"_s;
 const QString failed = u"Restoring files failed because:-"_s;
 const QString unchanged = u"Nothing was changed."_s;
+
+/// Once nothing can be stopped any more, and until the run ends, a folder stands where the record of the restore is.
+class Obstructing : public core::SilentProgress
+{
+public:
+    explicit Obstructing(const core::Paths& paths)
+        : m_record(paths.folder(core::Folder::church) + u"restore_work/journal.json"_s)
+    {
+    }
+    bool step(const QString& what) override { return what.isEmpty() || QDir().mkdir(m_record); }
+    void end() override { QDir().rmdir(m_record); }
+
+private:
+    QString m_record;
+};
 
 class RestorePageTest : public BackupScreenTest
 {
@@ -191,6 +207,23 @@ TEST_F(RestorePageTest, DeclinedOrGivenUpNothingChanges)
     place.dialogue.expect_confirm(replace_question, Answer::yes);
     push(u"restore"_s);
     EXPECT_EQ(page().note().text(), unchanged);
+    EXPECT_EQ(families(), 1);
+    running.reset();
+}
+
+TEST_F(RestorePageTest, WhereItCannotBeToldHowItEndedTheProgramStartsAnewAndSettlesIt)
+{
+    (void)back_up();
+    remove_a_family();
+    Obstructing obstructing(place.data.paths());
+    begin_with(obstructing);
+    open(u"restore"_s);
+    place.dialogue.expect_confirm(replace_question, Answer::yes);
+    place.dialogue.expect_box(
+        u"It cannot be told yet whether the backup is in place. Start Kindrel again: it settles it."_s);
+    push(u"restore"_s);
+    EXPECT_EQ(page().objectName(), u"main_menu"_s);
+    EXPECT_FALSE(core::restore_unsettled(place.data.paths()));
     EXPECT_EQ(families(), 1);
     running.reset();
 }

@@ -20,7 +20,15 @@ protected:
     {
         place.in_database(u"DELETE FROM [tbl_filter_memory] WHERE [filter_name]='%1';"_s.arg(name));
     }
+    /// As another user does, who then keeps "Easter" under its key, the highest.
+    void lose_to_easter(const QString& name)
+    {
+        lose(name);
+        ASSERT_TRUE(people::save_filter(desk().office, u"Easter"_s, easter));
+    }
     [[nodiscard]] bool naming() { return !child<QLineEdit>(panel(), u"filter_name"_s).isHidden(); }
+
+    const people::Filter easter{.families = people::FamilyList::archive};
 };
 
 TEST_F(SavedFilterBarTest, ARecalledFilterStandsInItsFields)
@@ -151,6 +159,25 @@ TEST_F(SavedFilterBarTest, ASavedFilterIsRenamedAndRemoved)
     EXPECT_EQ(saved().count(), 1);
 }
 
+TEST_F(SavedFilterBarTest, WhatWasMadeFromAFilterFollowsItsNewName)
+{
+    save_as(u"Choir"_s);
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    const auto rename_to = [&](const QString& name) {
+        press_button(u"rename_filter"_s);
+        type(window(), name);
+        press(window(), Qt::Key_Return);
+    };
+    rename_to(u" Band "_s);
+    EXPECT_EQ(saved().currentText(), u"Band, changed"_s);
+    saved().setFocus();
+    press(window(), Qt::Key_Down);
+    rename_to(u"Singers"_s);
+    EXPECT_EQ(saved().currentText(), u"Singers"_s);
+    EXPECT_EQ(saved().itemText(0), u"Singers, changed"_s);
+}
+
 TEST_F(SavedFilterBarTest, EitherSaveTakesTheNameThatIsBeingTyped)
 {
     struct Case
@@ -220,27 +247,54 @@ TEST_F(SavedFilterBarTest, AFilterThatCannotBeRecalledLeavesTheOneOfTheScreenInI
 
 TEST_F(SavedFilterBarTest, AFilterThatAnotherUserRemovedStandsThereUnderNoName)
 {
-    for (const bool saving : {false, true}) {
+    const auto why = u"Unable to %1 this filter as another user has removed or renamed it"_s;
+    const std::initializer_list<std::function<void()>> ways{
+        [&] { panel().reload(); },
+        [&] {
+            place.dialogue.expect_box(why.arg(u"save"_s));
+            press_button(u"save_filter"_s);
+        },
+        [&] {
+            place.dialogue.expect_confirm(u"Are you sure that you wish to delete the filter 'Zion'?"_s,
+                                          core::Answer::yes);
+            place.dialogue.expect_box(why.arg(u"remove"_s));
+            press_button(u"remove_filter"_s);
+        }};
+    for (const auto& notice : ways) {
         keep_two();
         saved().setFocus();
         press(window(), Qt::Key_Down);
         const auto shown = panel().filter();
-        lose(u"Zion"_s);
-        if (saving) {
-            place.dialogue.expect_box(u"Unable to save this filter as another user has removed or renamed it"_s);
-            press_button(u"save_filter"_s);
-        } else {
-            panel().reload();
-        }
+        lose_to_easter(u"Zion"_s);
+        notice();
         EXPECT_EQ(saved().currentText(), u"(not saved)"_s);
+        EXPECT_EQ(saved().itemText(2), u"Easter"_s);
+        EXPECT_EQ(kept(u"Easter"_s), easter);
         saved().setFocus();
         press(window(), Qt::Key_Down);
         EXPECT_EQ(saved().currentText(), u"Choir"_s);
         press(window(), Qt::Key_Up);
         EXPECT_EQ(panel().filter(), shown);
         lose(u"Choir"_s);
+        lose(u"Easter"_s);
         press_button(u"clear_filter"_s);
     }
+}
+
+TEST_F(SavedFilterBarTest, AChangeToAFilterThatAnotherUserRemovedIsSavedUnderANewName)
+{
+    save_as(u"Choir"_s);
+    choose_kind(u"Groups"_s);
+    press(window(), Qt::Key_Return);
+    lose_to_easter(u"Choir"_s);
+    place.dialogue.expect_box(u"Unable to save this filter as another user has removed or renamed it"_s);
+    press_button(u"save_filter"_s);
+    EXPECT_EQ(saved().currentText(), u"(not saved)"_s);
+    press_button(u"save_filter"_s);
+    type(window(), u"Singers"_s);
+    press(window(), Qt::Key_Return);
+    EXPECT_EQ(kept(u"Singers"_s), panel().filter());
+    EXPECT_EQ(kept(u"Easter"_s), easter);
 }
 
 } // namespace kindrel::test

@@ -277,7 +277,7 @@ TEST_F(SearchPageTest, ThoseWhoAreListedBecomeTheListOfTaggingOrJoinTheOneThatIs
 {
     open_data_search();
     EXPECT_EQ(send_to_tagging(u"Preferred Given Name"_s), QStringList{u"Zora"_s});
-    EXPECT_EQ(label(u"state"_s), u"1 person: People with an entry in Preferred Given Name"_s);
+    EXPECT_EQ(label(u"state"_s), u"1 person: People with an entry in Preferred Given Name, without the deceased"_s);
 
     EXPECT_EQ(send_to_tagging(u"Title"_s), (QStringList{u"Ann"_s, u"Zora"_s}));
     EXPECT_EQ(window().page()->note().text(), u"1 person added to the list; on it already: 1."_s);
@@ -299,7 +299,7 @@ TEST_F(SearchPageTest, TheDeceasedAreNotSentToTagging)
     EXPECT_EQ(send_to_tagging(u"Title"_s), QStringList{u"Zora"_s});
     EXPECT_EQ(label(u"state"_s), u"1 person: People with an entry in Title, without the deceased"_s);
     dies(u"Zora"_s);
-    place.dialogue.expect_box(u"Nobody who is listed is still alive"_s);
+    place.dialogue.expect_box(u"Nobody who is listed can be put on the list"_s);
     running->open_area(u"search"_s);
     settle();
     choose_part(u"Title"_s);
@@ -319,6 +319,23 @@ TEST_F(SearchPageTest, AListFromDataSearchStaysWhileTheFilterOfTaggingDoesAndGiv
         child<QPushButton>(page(), u"sort"_s).click();
         EXPECT_EQ(tagged().size(), changed ? 4 : 2);
     }
+}
+
+TEST_F(SearchPageTest, UndoDoesNotBringBackAListFromDataSearchThatAChangedFilterReplaced)
+{
+    open_data_search();
+    (void)send_to_tagging(u"Title"_s);
+    auto& list = child<QTableView>(page(), u"working_people"_s);
+    list.selectRow(0);
+    list.setFocus();
+    press(window(), Qt::Key_Delete);
+    EXPECT_EQ(tagged(), QStringList{u"Zora"_s});
+    child<QPushButton>(page(), u"filter"_s).click();
+    child<QAbstractButton>(page(), u"contact"_s).click();
+    child<QPushButton>(page(), u"sort"_s).click();
+    EXPECT_EQ(tagged(), (QStringList{u"Una"_s, u"Ben"_s, u"Zora"_s}));
+    press(window(), Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(tagged(), (QStringList{u"Una"_s, u"Ann"_s, u"Ben"_s, u"Zora"_s}));
 }
 
 TEST_F(SearchPageTest, NobodyJoinsTheListOfTaggingWhileItsFilterLacksSomething)

@@ -198,4 +198,22 @@ TEST_P(DataSearchTest, EntriesOrderByTheirDatesAndNumbersNotByTheirText)
     EXPECT_LT(u"02/01/1978"_s, found("Birth Date")[0].value) << "The texts order otherwise.";
 }
 
+TEST_P(DataSearchTest, AListToGoOnWithHasTheLivingAndTheFirstOfThemForAFamily)
+{
+    auto widowed = family(u"Adams"_s, {u"Ann"_s, u"Ben"_s}), gone = family(u"Lane"_s, {u"Cy"_s});
+    for (auto* file : {&widowed, &gone}) {
+        file->address.phone = u"555"_s;
+        file->people[0].Decease = true;
+        for (auto& person : file->people)
+            person.Title = u"Dr"_s;
+        *file = keep(*file);
+    }
+    for (const auto* name : {"Family Phone", "Title"}) {
+        const auto list = living_with(session(), part(name), found(name));
+        ASSERT_EQ(list.members.size(), 1U) << name;
+        EXPECT_EQ(list.members[0].person_id, widowed.people[1].person_id) << name;
+        EXPECT_TRUE(list.criteria.endsWith(u", without the deceased")) << name;
+    }
+}
+
 } // namespace kindrel::test

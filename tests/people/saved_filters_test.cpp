@@ -104,8 +104,8 @@ TEST_P(SavedFiltersTest, NamesAreNeitherEmptyNorTwice)
     const auto choir = save_filter(office(), u"Choir"_s, {});
     ASSERT_TRUE(save_filter(office(), u"Band"_s, {}));
     dialogue().expect_box(u"A filter with this name already exists"_s);
-    EXPECT_FALSE(rename_filter(office(), *choir, u"BAND"_s));
-    EXPECT_TRUE(rename_filter(office(), *choir, u"choir"_s));
+    EXPECT_FALSE(rename_filter(office(), {*choir, u"Choir"_s}, u"BAND"_s));
+    EXPECT_TRUE(rename_filter(office(), {*choir, u"Choir"_s}, u"choir"_s));
     EXPECT_EQ(names(), (QStringList{u"Band"_s, u"choir"_s}));
 }
 
@@ -125,8 +125,6 @@ TEST_P(SavedFiltersTest, AFilterThatIsGoneOrTooNewIsRefused)
     EXPECT_TRUE(remove_filter(office(), {*key, u"Choir"_s}));
     dialogue().expect_box(u"Unable to use this filter as another user has removed it"_s);
     EXPECT_EQ(load_filter(office(), *key), std::nullopt);
-    dialogue().expect_box(u"Unable to rename this filter as another user has removed it"_s);
-    EXPECT_FALSE(rename_filter(office(), *key, u"Band"_s));
 }
 
 KINDREL_ON_BOTH_ENGINES(SavedFiltersTest);
@@ -163,12 +161,27 @@ TEST_P(SavedFiltersTest, ASavedFilterIsReplacedUnderItsNameWithoutAQuestion)
     EXPECT_TRUE(replace_filter(office(), {key, u"Choir"_s}, fresh));
     EXPECT_EQ(load_filter(office(), key), fresh);
     EXPECT_EQ(names(), QStringList{u"Choir"_s});
+}
 
+TEST_P(SavedFiltersTest, OneThatAnotherUserRemovedIsNotMistakenForTheOneThatHasItsKeyNow)
+{
+    const Filter old{.families = FamilyList::active}, fresh{.families = FamilyList::archive};
+    const SavedFilter gone{save_filter(office(), u"Choir"_s, old).value(), u"Choir"_s};
     session().execute(u"DELETE FROM [tbl_filter_memory];"_s);
-    ASSERT_EQ(save_filter(office(), u"Easter"_s, fresh), key); // Another filter under the same key.
-    dialogue().expect_box(u"Unable to save this filter as another user has removed or renamed it"_s);
-    EXPECT_FALSE(replace_filter(office(), {key, u"Choir"_s}, old));
-    EXPECT_EQ(load_filter(office(), key), fresh);
+    ASSERT_EQ(save_filter(office(), u"Easter"_s, fresh), gone.filter_id);
+
+    const auto why = u"Unable to %1 this filter as another user has removed or renamed it"_s;
+    dialogue().expect_box(why.arg(u"save"_s));
+    EXPECT_FALSE(replace_filter(office(), gone, old));
+    for (const auto& name : {u"Band"_s, u"EASTER"_s}) {
+        dialogue().expect_box(why.arg(u"rename"_s));
+        EXPECT_FALSE(rename_filter(office(), gone, name));
+    }
+    dialogue().expect_confirm(u"Are you sure that you wish to delete the filter 'Choir'?"_s, Answer::yes);
+    dialogue().expect_box(why.arg(u"remove"_s));
+    EXPECT_FALSE(remove_filter(office(), gone));
+    EXPECT_EQ(names(), QStringList{u"Easter"_s});
+    EXPECT_EQ(load_filter(office(), gone.filter_id), fresh);
 }
 
 } // namespace kindrel::test

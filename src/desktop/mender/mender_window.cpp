@@ -212,7 +212,7 @@ void MenderWindow::recover(const MenderJob& job)
 {
     if (const auto files = ask_for_recovery(m_surroundings.dialogue, m_account, job.request.data_drive))
         work(job, u"Recovering what can be read"_s, true,
-             [&](const MenderJob& given) { return recover_church(given, *files); });
+             [&, open = m_account.makes_way](const MenderJob& given) { return recover_church(given, *files, open); });
 }
 
 void MenderWindow::put_in_place(const MenderJob& job)

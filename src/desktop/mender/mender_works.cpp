@@ -114,17 +114,16 @@ Account unlock_church(const MenderJob& job)
     });
 }
 
-Account recover_church(const MenderJob& job, const RecoveryFiles& files)
+Account recover_church(const MenderJob& job, const RecoveryFiles& files, bool makes_way)
 {
     return at_the_church(job, [&](MenderPlace& place) {
         if (const auto refusal = refusal_while_running(job, place))
             return *refusal;
-        const bool gives_way = core::gives_way(place, core::file_damaged(examine(place)));
         place.session.reset();
         const auto tables = core::recover_church(files.damaged, files.fresh);
         const QFileInfo own(place.paths.database());
         const bool taken = own.exists() && own == QFileInfo(files.fresh);
-        const auto way = gives_way ? WayIntoPlace::open : WayIntoPlace::closed;
+        const auto way = makes_way ? WayIntoPlace::open : WayIntoPlace::closed;
         return account_of_recovery(files, taken ? WayIntoPlace::taken : way, tables);
     });
 }

@@ -22,7 +22,8 @@ struct MenderJob
 [[nodiscard]] Account check_church(const MenderJob& job);
 [[nodiscard]] Account mend_church(const MenderJob& job);
 [[nodiscard]] Account unlock_church(const MenderJob& job);
-[[nodiscard]] Account recover_church(const MenderJob& job, const RecoveryFiles& files);
+/// `makes_way`: a recovered file may take the place of the church's own, as the last account told.
+[[nodiscard]] Account recover_church(const MenderJob& job, const RecoveryFiles& files, bool makes_way);
 [[nodiscard]] Account set_church_aside(const MenderJob& job);
 [[nodiscard]] Account put_church_in_place(const MenderJob& job, const QString& recovered);
 

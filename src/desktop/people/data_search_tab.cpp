@@ -180,15 +180,9 @@ void DataSearchTab::look()
 
 void DataSearchTab::to_tagging()
 {
-    people::WorkingList listed{{}, people::heading_of(*m_part)};
-    auto entries = m_model->entries();
-    std::erase_if(entries, [](const auto& entry) { return entry.member.person_id == 0; }); // A family without people.
-    // No letter is to go to those who have died.
-    if (std::erase_if(entries, [](const auto& entry) { return entry.states.deceased; }) > 0)
-        listed.criteria += u", without the deceased"_s;
-    if (entries.empty())
-        return m_desk.office.dialogue.show({u"Nobody who is listed is still alive"_s});
-    std::ranges::transform(entries, std::back_inserter(listed.members), &people::DataEntry::member);
+    auto listed = people::living_with(*m_desk.office.session, *m_part, m_model->entries());
+    if (listed.members.empty())
+        return m_desk.office.dialogue.show({u"Nobody who is listed can be put on the list"_s});
     m_desk.navigation.to_tagging(std::move(listed));
 }
 

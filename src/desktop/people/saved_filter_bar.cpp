@@ -3,6 +3,7 @@
 #include "desktop/people/filter_name_line.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
+#include "people/setup_lists.h"
 
 #include <QComboBox>
 #include <QHBoxLayout>
@@ -75,16 +76,16 @@ void SavedFilterBar::reload()
         m_names->removeItem(m_names->count() - 1);
     for (const SavedFilter& saved : m_saved)
         m_names->addItem(saved.name);
-    if (m_on_screen != 0 && !stored(m_on_screen))
+    if (m_on_screen.filter_id != 0 && !stored(m_on_screen))
         detach();
     if (!stored(m_changed_from))
-        m_changed_from = 0;
+        m_changed_from = {};
     show_row();
 }
 
-const SavedFilter* SavedFilterBar::stored(int filter_id) const
+const SavedFilter* SavedFilterBar::stored(const SavedFilter& saved) const
 {
-    const auto found = std::ranges::find(m_saved, filter_id, &SavedFilter::filter_id);
+    const auto found = std::ranges::find(m_saved, saved);
     return found == m_saved.end() ? nullptr : &*found;
 }
 
@@ -96,31 +97,31 @@ void SavedFilterBar::show_row()
     m_names->setCurrentIndex(shown ? int(shown - m_saved.data()) + 1 : not_saved_row);
 }
 
-void SavedFilterBar::choose_kept(int filter_id)
+void SavedFilterBar::choose_kept(const SavedFilter& saved)
 {
-    m_changed_from = 0;
-    m_on_screen = filter_id;
+    m_changed_from = {};
+    m_on_screen = saved;
     reload();
 }
 
 void SavedFilterBar::detach()
 {
     m_not_saved = m_filter;
-    m_changed_from = 0;
-    m_on_screen = 0;
+    m_changed_from = {};
+    m_on_screen = {};
 }
 
 void SavedFilterBar::show_changed()
 {
-    if (m_on_screen != 0)
-        m_changed_from = std::exchange(m_on_screen, 0);
+    if (m_on_screen.filter_id != 0)
+        m_changed_from = std::exchange(m_on_screen, {});
     m_not_saved = m_filter;
     show_row();
 }
 
 const SavedFilter* SavedFilterBar::base() const
 {
-    return stored(m_on_screen != 0 ? m_on_screen : m_changed_from);
+    return stored(m_on_screen.filter_id != 0 ? m_on_screen : m_changed_from);
 }
 
 const SavedFilter* SavedFilterBar::chosen() const
@@ -133,9 +134,10 @@ const SavedFilter* SavedFilterBar::chosen() const
 
 void SavedFilterBar::recall(int row)
 {
-    const int wanted = row == not_saved_row ? 0 : m_saved[std::size_t(row - 1)].filter_id;
+    const SavedFilter wanted = row == not_saved_row ? SavedFilter() : m_saved[std::size_t(row - 1)];
     show_row(); // Until the wanted one is there.
-    const auto filter = wanted == 0 ? std::optional(m_not_saved) : people::load_filter(m_desk.office, wanted);
+    const auto filter =
+        row == not_saved_row ? std::optional(m_not_saved) : people::load_filter(m_desk.office, wanted.filter_id);
     if (!filter)
         return reload();
     m_on_screen = wanted;
@@ -145,8 +147,8 @@ void SavedFilterBar::recall(int row)
 
 void SavedFilterBar::clear()
 {
-    m_changed_from = 0;
-    m_on_screen = 0;
+    m_changed_from = {};
+    m_on_screen = {};
     show_row();
     Q_EMIT clear_wanted();
 }
@@ -159,7 +161,7 @@ void SavedFilterBar::save()
         return;
     const SavedFilter saved = *base();
     if (people::replace_filter(m_desk.office, saved, m_filter))
-        choose_kept(saved.filter_id);
+        choose_kept(saved);
     else
         reload();
 }
@@ -173,7 +175,7 @@ void SavedFilterBar::save_as()
         if (!m_finish_typing())
             return;
         if (const auto key = people::save_filter(m_desk.office, name, m_filter))
-            choose_kept(*key);
+            choose_kept({*key, people::tidy(name)});
         else
             m_name->ask_again();
     });
@@ -184,21 +186,23 @@ void SavedFilterBar::rename()
     const SavedFilter* saved = chosen();
     if (!saved)
         return;
-    m_name->ask(u"Please enter another name for this filter"_s, saved->name,
-                [this, key = saved->filter_id](const QString& name) {
-                    if (people::rename_filter(m_desk.office, key, name))
-                        reload();
-                    else
-                        m_name->ask_again();
-                });
+    m_name->ask(u"Please enter another name for this filter"_s, saved->name, [this, old = *saved](const QString& name) {
+        if (!people::rename_filter(m_desk.office, old, name))
+            return m_name->ask_again();
+        for (SavedFilter* renamed : {&m_changed_from, &m_on_screen})
+            if (*renamed == old)
+                renamed->name = people::tidy(name);
+        reload();
+    });
 }
 
 void SavedFilterBar::remove()
 {
     const SavedFilter* saved = chosen();
-    if (!saved || !people::remove_filter(m_desk.office, *saved))
+    if (!saved)
         return;
-    detach();
+    if (people::remove_filter(m_desk.office, *saved))
+        detach();
     reload();
 }
 

@@ -43,7 +43,7 @@ private:
 
     void add_button(const Button& looks, Typed typed, void (SavedFilterBar::*run)());
     /// As the list has it; null when it is not among them.
-    [[nodiscard]] const people::SavedFilter* stored(int filter_id) const;
+    [[nodiscard]] const people::SavedFilter* stored(const people::SavedFilter& saved) const;
     /// The saved filter in front, changed or not; null when there is none.
     [[nodiscard]] const people::SavedFilter* base() const;
     /// Says so when there is none.
@@ -51,7 +51,7 @@ private:
     /// The list stands on the filter of the screen.
     void show_row();
     /// The filter of the screen has just been stored under it.
-    void choose_kept(int filter_id);
+    void choose_kept(const people::SavedFilter& saved);
     /// The filter of the screen stands as it is, under no name.
     void detach();
     void recall(int row);
@@ -65,8 +65,8 @@ private:
     const people::Filter& m_filter;
     std::function<bool()> m_finish_typing;
     people::Filter m_not_saved;
-    int m_changed_from = 0; ///< The saved filter that `m_not_saved` was made from.
-    int m_on_screen = 0;    ///< The saved filter that stands on the screen as it was read or kept; 0: `m_not_saved`.
+    people::SavedFilter m_changed_from; ///< What `m_not_saved` was made from; of key 0 when there is none.
+    people::SavedFilter m_on_screen;    ///< What stands on the screen as it was read or kept; key 0: `m_not_saved`.
     std::vector<people::SavedFilter> m_saved;
     QComboBox* m_names;
     FilterNameLine* m_name;

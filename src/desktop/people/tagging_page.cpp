@@ -189,9 +189,8 @@ void TaggingPage::take_people(const people::WorkingList& found)
     const bool first = !m_list->is_made();
     if (first)
         m_sheet.plan.found = found;
-    if (m_bar->open_step() == Step::filter)
-        go_to(Step::process);
-    const bool refused = m_bar->open_step() == Step::filter; // It lacks something, which was said.
+    go_to(Step::process);
+    const bool refused = m_bar->open_step() != Step::process; // The step lacks something, which was said.
     if (refused && first)
         m_sheet.plan.found.reset();
     else if (!refused && !first)

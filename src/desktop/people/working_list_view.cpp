@@ -86,13 +86,17 @@ void WorkingListView::make()
 
 void WorkingListView::change_by_hand(const QString& words, const std::function<void()>& change)
 {
-    const auto before = m_sheet.plan;
+    auto before = m_sheet.plan;
     change();
     make();
-    Q_EMIT changed_by_hand(words, [this, before] {
-        m_sheet.plan.found = before.found;
-        m_sheet.plan.added = before.added;
-        m_sheet.plan.struck = before.struck;
+    if (m_sheet.plan.found)
+        before.found.reset(); // Not for this act to bring back.
+    Q_EMIT changed_by_hand(words, [this, before = std::move(before)] {
+        auto& plan = m_sheet.plan;
+        if (before.found && plan.filter == before.filter)
+            plan.found = before.found;
+        plan.added = before.added;
+        plan.struck = before.struck;
         make();
     });
 }
@@ -125,10 +129,8 @@ void WorkingListView::add_people(const std::vector<people::Member>& members)
 
 void WorkingListView::strike(const std::vector<int>& people)
 {
-    change_by_hand(u"%1 struck from the list."_s.arg(people_words(std::ssize(people))), [&] {
-        for (const int person : people)
-            people::strike_by_hand(m_sheet.plan, person);
-    });
+    change_by_hand(u"%1 struck from the list."_s.arg(people_words(std::ssize(people))),
+                   [&] { people::strike_by_hand(m_sheet.plan, people); });
 }
 
 void WorkingListView::drop_changes_by_hand()

@@ -47,22 +47,33 @@ bool QtProgress::step(const QString& what)
     const bool news = !what.isEmpty() && what != m_box->labelText();
     if (!news && m_box->isVisible() && m_now() - m_shown < refresh_time)
         return true;
-    show_state(what);
-    return !m_box->wasCanceled() || !cancel_confirmed();
+    show_state();
+    if (stopped())
+        return false;
+    if (news)
+        show_text(what);
+    return true;
 }
 
-void QtProgress::show_state(const QString& what)
+void QtProgress::show_state()
 {
-    if (!what.isEmpty())
-        m_box->setLabelText(what);
     m_box->show();
     m_box->setValue(m_done);
     QApplication::processEvents();
     m_shown = m_now();
 }
 
-bool QtProgress::cancel_confirmed()
+void QtProgress::show_text(const QString& what)
 {
+    m_box->setLabelText(what);
+    m_box->show();
+    QApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
+}
+
+bool QtProgress::stopped()
+{
+    if (!m_box->wasCanceled())
+        return false;
     m_box->reset();
     return !m_question.isEmpty() &&
            m_dialogue.confirm({.text = m_question, .icon = core::Icon::question}, core::Answer::no);

@@ -25,8 +25,11 @@ public:
     void end() override;
 
 private:
-    void show_state(const QString& what);
-    [[nodiscard]] bool cancel_confirmed();
+    void show_state();
+    /// Whoever wished to stop did so under the text before, and was asked already.
+    void show_text(const QString& what);
+    /// Asks where the box was cancelled.
+    [[nodiscard]] bool stopped();
 
     core::Dialogue& m_dialogue;
     std::unique_ptr<QProgressDialog> m_box;
