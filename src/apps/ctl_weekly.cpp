@@ -1,6 +1,6 @@
 #include "apps/ctl_pdf.h"
 
-#include "registers/day_refusal.h"
+#include "core/day_refusal.h"
 #include "registers/projects.h"
 #include "registers/weekly_reports.h"
 
@@ -92,7 +92,7 @@ std::optional<registers::PeriodChoice> read_days(Context& context)
         const auto typed = context.arguments.value(name);
         *day = core::parse_date(typed, order, context.office->clock.today());
         if (!*day) {
-            context.dialogue.show(registers::day_refusal(typed, order));
+            context.dialogue.show(core::day_refusal(typed, order));
             return {};
         }
     }

@@ -105,9 +105,10 @@ std::optional<int> save_filter(core::Office& office, const QString& name, const 
         return insert_new(session, tidied, content);
     if (!may_replace(office, *existing))
         return std::nullopt;
-    const int touched =
-        session.execute(u"UPDATE [tbl_filter_memory] SET [filter_name]=?,[content]=? WHERE [filter_id]=?;"_s, tidied,
-                        content, existing->filter_id);
+    // While the question stood, its key may have gone to another filter.
+    const int touched = session.execute(
+        u"UPDATE [tbl_filter_memory] SET [filter_name]=?,[content]=? WHERE [filter_id]=? AND [filter_name]=?;"_s,
+        tidied, content, existing->filter_id, existing->name);
     return touched > 0 ? existing->filter_id : insert_new(session, tidied, content);
 }
 

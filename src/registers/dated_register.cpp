@@ -1,9 +1,9 @@
 #include "registers/dated_register.h"
 
+#include "core/day_refusal.h"
 #include "core/open_church.h"
 #include "core/removal.h"
 #include "registers/belongings.h"
-#include "registers/day_refusal.h"
 
 #include <QCoreApplication>
 #include <QLocale>
@@ -273,7 +273,7 @@ bool DatedRegister::usable(const core::Date& date) const
     if (date.qdate().isValid())
         return true;
     const auto order = m_office.day_order();
-    m_office.dialogue.show(day_refusal(date.shown(order), order));
+    m_office.dialogue.show(core::day_refusal(date.shown(order), order));
     return false;
 }
 

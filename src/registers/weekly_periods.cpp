@@ -1,6 +1,6 @@
 #include "registers/weekly_periods.h"
 
-#include "registers/day_refusal.h"
+#include "core/day_refusal.h"
 
 #include <algorithm>
 
@@ -38,11 +38,11 @@ std::optional<Period> date_range(const PeriodChoice& choice, core::DayOrder orde
     if (!choice.from)
         return check.refuse(ReportField::from, u"Please select a date to begin the search from"_s);
     if (!choice.from->year_known())
-        return check.refuse(ReportField::from, year_missing);
+        return check.refuse(ReportField::from, core::year_missing);
     if (!choice.to)
         return check.refuse(ReportField::to, u"Please select a date to end the search from"_s);
     if (!choice.to->year_known())
-        return check.refuse(ReportField::to, year_missing);
+        return check.refuse(ReportField::to, core::year_missing);
     if (*choice.to < *choice.from)
         return check.refuse(ReportField::to,
                             u"The date to end the search from is before the date to begin the search from"_s);

@@ -56,40 +56,47 @@ public:
     }
 };
 
+class RestoreCommitTest : public testing::Test
+{
+protected:
+    void SetUp() override
+    {
+        if (!TestChurch::available(EngineKind::postgres))
+            GTEST_SKIP() << "No server: run through ./test, or tests/support/with-postgres.";
+        place.emplace(EngineKind::postgres);
+        old_state = place->state();
+        backup = place->back_up();
+        place->write_church(u"second"_s);
+    }
+    void expect_the_backup()
+    {
+        EXPECT_EQ(place->state(), old_state);
+        EXPECT_TRUE(place->leftovers().isEmpty()) << place->leftovers().join(u' ').toStdString();
+    }
+
+    std::optional<BackupPlace> place;
+    decltype(place->state()) old_state;
+    QString backup;
+    CuttingProgress progress;
+};
+
 } // namespace
 
-TEST(RestoreCommitTest, ARestoreThatWasStoredIsDoneThoughTheServersAnswerIsLost)
+TEST_F(RestoreCommitTest, ARestoreThatWasStoredIsDoneThoughTheServersAnswerIsLost)
 {
-    if (!TestChurch::available(EngineKind::postgres))
-        GTEST_SKIP() << "No server: run through ./test, or tests/support/with-postgres.";
-    BackupPlace place(EngineKind::postgres);
-    const auto old_state = place.state();
-    const QString backup = place.back_up();
-    place.write_church(u"second"_s);
-    CuttingProgress progress;
-
-    const auto report = restore_backup(place.office(), {.file = backup}, progress);
+    const auto report = restore_backup(place->office(), {.file = backup}, progress);
 
     EXPECT_FALSE(cut_commit) << "The connection was not cut.";
-    EXPECT_TRUE(report) << place.dialogue().told.join(u'\n').toStdString();
-    EXPECT_EQ(place.state(), old_state);
-    EXPECT_TRUE(place.leftovers().isEmpty()) << place.leftovers().join(u' ').toStdString();
+    EXPECT_TRUE(report) << place->dialogue().told.join(u'\n').toStdString();
+    expect_the_backup();
 }
 
-TEST(RestoreCommitTest, WhereTheServerIsGoneAtTheCommitTheNextStartSettlesTheRestore)
+TEST_F(RestoreCommitTest, WhereTheServerIsGoneAtTheCommitTheNextStartSettlesTheRestore)
 {
-    if (!TestChurch::available(EngineKind::postgres))
-        GTEST_SKIP() << "No server: run through ./test, or tests/support/with-postgres.";
-    BackupPlace place(EngineKind::postgres);
-    const auto old_state = place.state();
-    const QString backup = place.back_up();
-    place.write_church(u"second"_s);
-    CuttingProgress progress;
-
     cut_for_good = true;
     try {
-        (void)restore_backup(place.office(), {.file = backup}, progress);
-        ADD_FAILURE() << "It was told how the restore ended: " << place.dialogue().told.join(u'\n').toStdString();
+        (void)restore_backup(place->office(), {.file = backup}, progress);
+        ADD_FAILURE() << "It was told how the restore ended: " << place->dialogue().told.join(u'\n').toStdString();
     } catch (const RestoreUnsettled& unsettled) {
         EXPECT_EQ(unsettled.text(),
                   u"It cannot be told yet whether the backup is in place. Start Kindrel again: it settles it."_s);
@@ -97,9 +104,8 @@ TEST(RestoreCommitTest, WhereTheServerIsGoneAtTheCommitTheNextStartSettlesTheRes
     EXPECT_TRUE(out_of_reach) << "The connection was not cut.";
     cut_for_good = out_of_reach = false;
 
-    EXPECT_TRUE(settle_interrupted_restore(place.office().paths, *place.office().session));
-    EXPECT_EQ(place.state(), old_state);
-    EXPECT_TRUE(place.leftovers().isEmpty()) << place.leftovers().join(u' ').toStdString();
+    EXPECT_TRUE(settle_interrupted_restore(place->office().paths, *place->office().session));
+    expect_the_backup();
 }
 
 } // namespace kindrel::test

@@ -74,6 +74,14 @@ protected:
         return texts;
     }
     void remove_all_suburbs() { place.in_database(u"DELETE FROM [tbl_suburb_setup];"_s); }
+    void add_a_title_that_cannot_be_saved()
+    {
+        open(SetupKind::titles);
+        add(u"Deacon"_s);
+        place.in_database(u"DROP TABLE [tbl_title];"_s);
+        place.dialogue.expect_box(u"Unable to save the setup lists"_s);
+        press(window(), Qt::Key_S, Qt::ControlModifier);
+    }
 };
 
 } // namespace
@@ -162,11 +170,7 @@ TEST_F(SetupPageTest, CancelDropsEveryListAfterAsking)
 
 TEST_F(SetupPageTest, ChangesAreDroppedAlsoWhereTheListsCannotBeReadAgain)
 {
-    open(SetupKind::titles);
-    add(u"Deacon"_s);
-    place.in_database(u"DROP TABLE [tbl_title];"_s);
-    place.dialogue.expect_box(u"Unable to save the setup lists"_s);
-    press(window(), Qt::Key_S, Qt::ControlModifier);
+    add_a_title_that_cannot_be_saved();
     place.dialogue.expect_confirm(cancel_question, core::Answer::yes);
     place.dialogue.expect_box(u"Unable to read the setup lists"_s);
     cancel();
@@ -205,11 +209,7 @@ TEST_F(SetupPageTest, WhatIsTypedButNotEnteredIsSavedToo)
 
 TEST_F(SetupPageTest, AFailedSaveIsToldAndLosesNothing)
 {
-    open(SetupKind::titles);
-    add(u"Deacon"_s);
-    place.in_database(u"DROP TABLE [tbl_title];"_s);
-    place.dialogue.expect_box(u"Unable to save the setup lists"_s);
-    press(window(), Qt::Key_S, Qt::ControlModifier);
+    add_a_title_that_cannot_be_saved();
     EXPECT_TRUE(is_open());
     EXPECT_TRUE(window().page()->altered());
     EXPECT_EQ(table().model()->rowCount(), 4);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "desktop/desktop_fixture.h"
+#include "desktop/output/preview_window.h"
 #include "desktop/shell/chip.h"
 #include "desktop/shell/page.h"
 #include "desktop/shell/rail.h"
@@ -76,6 +77,11 @@ protected:
     [[nodiscard]] desktop::RailMarks marks()
     {
         return child<desktop::RailButton>(window(), QStringLiteral("weekly")).marks();
+    }
+    [[nodiscard]] std::vector<desktop::PreviewWindow*> previews()
+    {
+        settle();
+        return desk().windows.all<desktop::PreviewWindow>();
     }
     /// "1:120 3:45.5": what is stored for a date, by category.
     [[nodiscard]] QString stored(const QString& date)

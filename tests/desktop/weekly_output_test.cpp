@@ -1,4 +1,3 @@
-#include "desktop/output/preview_window.h"
 #include "desktop/shell/note_bar.h"
 #include "desktop/weekly_fixture.h"
 
@@ -35,11 +34,6 @@ protected:
         window().activateWindow(); // A preview may stand before it.
         settle();
         act(Qt::Key_P, Qt::ControlModifier);
-    }
-    [[nodiscard]] std::vector<desktop::PreviewWindow*> previews()
-    {
-        settle();
-        return desk().windows.all<desktop::PreviewWindow>();
     }
 };
 

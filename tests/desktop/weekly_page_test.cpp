@@ -1,4 +1,3 @@
-#include "desktop/output/preview_window.h"
 #include "desktop/shell/note_bar.h"
 #include "desktop/weekly_fixture.h"
 #include "pages/find.h"
@@ -33,11 +32,6 @@ protected:
         act(key, Qt::AltModifier);
         EXPECT_TRUE(QTest::qWaitFor([&] { return place.dialogue.seen().size() > shown; }));
         settle();
-    }
-    [[nodiscard]] std::vector<desktop::PreviewWindow*> previews()
-    {
-        settle();
-        return desk().windows.all<desktop::PreviewWindow>();
     }
 };
 

@@ -1,4 +1,4 @@
-#include "registers/day_refusal.h"
+#include "core/day_refusal.h"
 #include "registers/weekly_periods.h"
 
 #include "support/scripted_dialogue.h"
@@ -122,7 +122,7 @@ TEST(WeeklyPeriodsTest, ADayAndMonthAloneAreToldToLackTheirYear)
         {u"March"_s, day_first, false},     {u"31/2/24"_s, day_first, false}, {{}, day_first, false},
     };
     for (const auto& [typed, order, lacks_year] : cases) {
-        const auto message = registers::day_refusal(typed, order);
+        const auto message = core::day_refusal(typed, order);
         EXPECT_EQ(message.text, lacks_year ? u"Please enter the year too."_s : bad_date_message(order).text)
             << typed.toStdString();
         EXPECT_EQ(message.more, lacks_year ? QString() : bad_date_message(order).more) << typed.toStdString();

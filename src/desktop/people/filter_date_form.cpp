@@ -1,11 +1,11 @@
 #include "desktop/people/filter_date_form.h"
 
+#include "core/day_refusal.h"
 #include "desktop/people/filter_end_field.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
 #include "desktop/shell/value_form.h"
 #include "people/setup_lists.h"
-#include "registers/day_refusal.h"
 
 #include <QComboBox>
 #include <QFormLayout>
@@ -182,7 +182,7 @@ QWidget* FilterDateForm::lacking()
     const auto unfit = std::ranges::find_if(m_ends, [this](const End& end) { return !end.day || lacks_year(end); });
     if (unfit == m_ends.end())
         return nullptr;
-    m_office.dialogue.show({unfit->day ? registers::year_missing : u"Please enter both dates of the range"_s});
+    m_office.dialogue.show({unfit->day ? core::year_missing : u"Please enter both dates of the range"_s});
     return unfit->field;
 }
 

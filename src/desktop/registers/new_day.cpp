@@ -1,7 +1,7 @@
 #include "desktop/registers/new_day.h"
 
+#include "core/day_refusal.h"
 #include "desktop/shell/typed_date.h"
-#include "registers/day_refusal.h"
 
 #include <algorithm>
 
@@ -26,7 +26,7 @@ std::optional<core::Date> ask_new_day(core::Office& office, registers::DatedRegi
     while (const auto typed = office.dialogue.ask_text(question)) {
         const auto day = typed_date(office, *typed);
         if (!day || !day->year_known())
-            office.dialogue.show(registers::day_refusal(*typed, office.day_order()));
+            office.dialogue.show(core::day_refusal(*typed, office.day_order()));
         else if (!used_by_another(dated, *day) || dated.change_date(*day)) // The register tells what it refuses.
             return day;
         question.more = u"You typed \"%1\"."_s.arg(*typed);

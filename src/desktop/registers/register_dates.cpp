@@ -1,10 +1,10 @@
 #include "desktop/registers/register_dates.h"
 
+#include "core/day_refusal.h"
 #include "desktop/registers/new_day.h"
 #include "desktop/shell/date_field.h"
 #include "desktop/shell/icons.h"
 #include "desktop/shell/look.h"
-#include "registers/day_refusal.h"
 
 #include <QComboBox>
 #include <QLabel>
@@ -28,7 +28,7 @@ RegisterDates::RegisterDates(Desk& desk, registers::DatedRegister& dated, std::f
     m_project->setObjectName(u"project"_s);
     m_project->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     m_new->setObjectName(u"new_date"_s);
-    m_new->require_year(registers::day_refusal);
+    m_new->require_year(core::day_refusal);
     m_dates->setObjectName(u"dates"_s);
     lay_out();
     connect(m_project, &QComboBox::activated, this, settled(&RegisterDates::choose_project));

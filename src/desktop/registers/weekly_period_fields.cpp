@@ -1,9 +1,9 @@
 #include "desktop/registers/weekly_period_fields.h"
 
+#include "core/day_refusal.h"
 #include "desktop/registers/year_field.h"
 #include "desktop/shell/date_field.h"
 #include "desktop/shell/look.h"
-#include "registers/day_refusal.h"
 
 #include <QComboBox>
 #include <QGridLayout>
@@ -122,7 +122,7 @@ DateField* WeeklyPeriodFields::make_date(const QString& name, std::optional<core
     date = core::Date::from_stored(remembered(name));
     auto* field = new DateField(m_desk.office);
     field->setObjectName(name);
-    field->require_year(registers::day_refusal);
+    field->require_year(core::day_refusal);
     field->show_date(date);
     connect(field, &DateField::entered, this, [&date](std::optional<core::Date> typed) { date = typed; });
     return field;
